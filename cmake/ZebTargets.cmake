@@ -1,0 +1,91 @@
+# The targets of the library: one object library per layer, the shared library made of all of them, and tests that
+# link the layers they are about. Object libraries keep every static initializer, which registration depends on.
+
+find_package(Boost 1.74 REQUIRED)
+find_package(Threads REQUIRED)
+find_package(EXPAT REQUIRED)
+
+set_property(GLOBAL PROPERTY ZEB_LAYERS "")
+
+function(zeb_add_folder folder)
+    if(EXISTS ${CMAKE_CURRENT_SOURCE_DIR}/${folder}/CMakeLists.txt)
+        add_subdirectory(${folder})
+    endif()
+endfunction()
+
+# Warnings, sanitizers and definitions that all of our own targets share.
+add_library(zeb_options INTERFACE)
+target_compile_options(zeb_options INTERFACE
+    -Wall -Wextra -Wpedantic -Wshadow -Wconversion -Wsign-conversion -Wnon-virtual-dtor -Wold-style-cast
+    -Woverloaded-virtual $<$<BOOL:${ZEB_WARNINGS_AS_ERRORS}>:-Werror>)
+if(ZEB_SANITIZE)
+    add_compile_options(-fsanitize=${ZEB_SANITIZE} -fno-omit-frame-pointer -fno-sanitize-recover=all)
+    add_link_options(-fsanitize=${ZEB_SANITIZE})
+endif()
+
+# Boost and the standard library, compiled once for all layers.
+file(WRITE ${PROJECT_BINARY_DIR}/precompiled.cpp "")
+add_library(zeb_precompiled OBJECT ${PROJECT_BINARY_DIR}/precompiled.cpp)
+target_compile_options(zeb_precompiled PRIVATE -Winvalid-pch)
+target_link_libraries(zeb_precompiled PRIVATE zeb_options Boost::boost Threads::Threads)
+target_precompile_headers(zeb_precompiled PRIVATE ${PROJECT_SOURCE_DIR}/cmake/Precompiled.h)
+
+# zeb_add_layer(NAME SOURCES ... PUBLIC_HEADERS ... DEPENDS ... LIBRARIES ...)
+#   PUBLIC_HEADERS  installed, and compiled alone by the header check
+#   DEPENDS         layers below
+#   LIBRARIES       outside libraries, private to the layer
+function(zeb_add_layer name)
+    cmake_parse_arguments(arg "" "" "SOURCES;PUBLIC_HEADERS;DEPENDS;LIBRARIES" ${ARGN})
+    add_library(${name} OBJECT ${arg_SOURCES})
+    target_link_libraries(${name} PUBLIC ${arg_DEPENDS} Boost::boost Threads::Threads PRIVATE zeb_options ${arg_LIBRARIES})
+    target_include_directories(${name} PUBLIC $<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}>)
+    target_precompile_headers(${name} REUSE_FROM zeb_precompiled)
+    target_sources(${name} PUBLIC FILE_SET HEADERS BASE_DIRS ${PROJECT_SOURCE_DIR} FILES ${arg_PUBLIC_HEADERS})
+    set_property(TARGET ${name} PROPERTY ZEB_LIBRARIES "${arg_LIBRARIES}")
+    set_property(GLOBAL APPEND PROPERTY ZEB_LAYERS ${name})
+endfunction()
+
+function(zeb_add_shared_library)
+    get_property(layers GLOBAL PROPERTY ZEB_LAYERS)
+    file(WRITE ${PROJECT_BINARY_DIR}/shared.cpp "")
+    add_library(zebaudiofilterhost SHARED ${PROJECT_BINARY_DIR}/shared.cpp)
+    add_library(zebaudiofilterhost::zebaudiofilterhost ALIAS zebaudiofilterhost)
+    set_target_properties(zebaudiofilterhost PROPERTIES
+        VERSION ${PROJECT_VERSION} SOVERSION ${PROJECT_VERSION_MAJOR}.${PROJECT_VERSION_MINOR})
+    foreach(layer IN LISTS layers)
+        get_target_property(libraries ${layer} ZEB_LIBRARIES)
+        get_target_property(headers ${layer} HEADER_SET)
+        target_link_libraries(zebaudiofilterhost PRIVATE $<BUILD_INTERFACE:${layer}> ${libraries})
+        target_sources(zebaudiofilterhost PUBLIC FILE_SET HEADERS BASE_DIRS ${PROJECT_SOURCE_DIR} FILES ${headers})
+    endforeach()
+    target_include_directories(zebaudiofilterhost PUBLIC
+        $<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}> $<INSTALL_INTERFACE:${CMAKE_INSTALL_INCLUDEDIR}/zebaudiofilterhost>)
+    target_link_libraries(zebaudiofilterhost PUBLIC Boost::boost Threads::Threads)
+    target_link_options(zebaudiofilterhost PRIVATE LINKER:--exclude-libs,ALL)
+endfunction()
+
+# zeb_add_test(NAME SOURCES ... UP_TO layer [LIBRARIES ...] [NEEDS targets...] [DEFINITIONS ...] [LABELS ...])
+#   Links every layer from the lowest up to UP_TO, so that a test reaches internal classes.
+function(zeb_add_test name)
+    cmake_parse_arguments(arg "" "UP_TO;TIMEOUT" "SOURCES;LIBRARIES;NEEDS;DEFINITIONS;LABELS" ${ARGN})
+    find_package(GTest REQUIRED)
+    add_executable(${name} ${arg_SOURCES})
+    get_property(layers GLOBAL PROPERTY ZEB_LAYERS)
+    foreach(layer IN LISTS layers)
+        get_target_property(libraries ${layer} ZEB_LIBRARIES)
+        target_link_libraries(${name} PRIVATE ${layer} ${libraries})
+        if(layer STREQUAL arg_UP_TO)
+            break()
+        endif()
+    endforeach()
+    target_link_libraries(${name} PRIVATE zeb_options GTest::gtest_main GTest::gmock ${arg_LIBRARIES})
+    target_compile_definitions(${name} PRIVATE ${arg_DEFINITIONS})
+    if(arg_NEEDS)
+        add_dependencies(${name} ${arg_NEEDS})
+    endif()
+    add_test(NAME ${name} COMMAND ${name})
+    set_tests_properties(${name} PROPERTIES LABELS "${arg_LABELS}")
+    if(arg_TIMEOUT)
+        set_tests_properties(${name} PROPERTIES TIMEOUT ${arg_TIMEOUT})
+    endif()
+endfunction()
