@@ -61,7 +61,12 @@ function(zeb_add_shared_library)
     target_include_directories(zebaudiofilterhost PUBLIC
         $<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}> $<INSTALL_INTERFACE:${CMAKE_INSTALL_INCLUDEDIR}/zebaudiofilterhost>)
     target_link_libraries(zebaudiofilterhost PUBLIC Boost::boost Threads::Threads)
-    target_link_options(zebaudiofilterhost PRIVATE LINKER:--exclude-libs,ALL)
+    if(NOT APPLE)
+        target_link_options(zebaudiofilterhost PRIVATE LINKER:--exclude-libs,ALL
+            LINKER:--version-script=${PROJECT_SOURCE_DIR}/cmake/zebaudiofilterhost.map)
+        set_property(TARGET zebaudiofilterhost APPEND PROPERTY LINK_DEPENDS
+            ${PROJECT_SOURCE_DIR}/cmake/zebaudiofilterhost.map)
+    endif()
 endfunction()
 
 # zeb_add_test(NAME SOURCES ... UP_TO layer [LIBRARIES ...] [NEEDS targets...] [DEFINITIONS ...] [LABELS ...])

@@ -1,0 +1,25 @@
+# What an installed copy offers: the library with its headers, a CMake package, a pkg-config file, and zebhost with its
+# man page and completions.
+
+include(CMakePackageConfigHelpers)
+
+set(ZEB_CMAKE_DIR ${CMAKE_INSTALL_LIBDIR}/cmake/zebaudiofilterhost)
+
+install(TARGETS zebaudiofilterhost EXPORT zebaudiofilterhostTargets
+    FILE_SET HEADERS DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}/zebaudiofilterhost)
+install(EXPORT zebaudiofilterhostTargets NAMESPACE zebaudiofilterhost:: DESTINATION ${ZEB_CMAKE_DIR})
+
+configure_package_config_file(${PROJECT_SOURCE_DIR}/cmake/zebaudiofilterhostConfig.cmake.in
+    ${PROJECT_BINARY_DIR}/zebaudiofilterhostConfig.cmake INSTALL_DESTINATION ${ZEB_CMAKE_DIR})
+write_basic_package_version_file(${PROJECT_BINARY_DIR}/zebaudiofilterhostConfigVersion.cmake
+    COMPATIBILITY SameMinorVersion)
+install(FILES ${PROJECT_BINARY_DIR}/zebaudiofilterhostConfig.cmake
+    ${PROJECT_BINARY_DIR}/zebaudiofilterhostConfigVersion.cmake DESTINATION ${ZEB_CMAKE_DIR})
+
+configure_file(${PROJECT_SOURCE_DIR}/cmake/zebaudiofilterhost.pc.in ${PROJECT_BINARY_DIR}/zebaudiofilterhost.pc @ONLY)
+install(FILES ${PROJECT_BINARY_DIR}/zebaudiofilterhost.pc DESTINATION ${CMAKE_INSTALL_LIBDIR}/pkgconfig)
+
+if(ZEB_BUILD_ZEBHOST)
+    set_target_properties(zebhost PROPERTIES INSTALL_RPATH $ORIGIN/../${CMAKE_INSTALL_LIBDIR})
+    install(TARGETS zebhost)
+endif()
