@@ -9,7 +9,7 @@
 namespace zebcore::console
 {
 
-// A command that an application offers at its console.
+/// A command that an application offers at its console.
 class ZEB_EXPORT Command
 {
 public:
@@ -18,7 +18,7 @@ public:
     Command& operator=(const Command&) = delete;
     virtual ~Command();
 
-    // `arguments` is all that follows the name. What it throws reaches the console. [main]
+    /// `arguments` is all that follows the name. What it throws reaches the console. [main]
     virtual void Execute(const UTF16String& arguments, utility::UTF16OutputStream& output) = 0;
 
     const UTF16String& GetName() const { return mName; }
@@ -29,7 +29,7 @@ private:
     const UTF16String mDescription;
 };
 
-// Supplies the creator function that CommandRegistry wants for the command class T.
+/// Supplies the creator function that CommandRegistry wants for the command class T.
 template <typename T>
 class CommandRegistrar
 {

@@ -14,7 +14,7 @@
 namespace zebcore::console
 {
 
-// The commands of the process, by name.
+/// The commands of the process, by name.
 class ZEB_EXPORT CommandRegistry
 {
 public:
@@ -23,17 +23,17 @@ public:
 
     CommandRegistry() = delete;
 
-    // Adds a command, in place of one of the same name. `creator` is called at the first execution. [main]
+    /// Adds a command, in place of one of the same name. `creator` is called at the first execution. [main]
     static void RegisterCommand(const UTF16String& name, const UTF16String& description, const Creator& creator);
 
-    // A command that is being executed lives until it returns. [main]
+    /// A command that is being executed lives until it returns. [main]
     static void UnregisterCommand(const UTF16String& name);
 
-    // False, with nothing done, if there is no such command. What the command throws passes on. [main]
+    /// False, with nothing done, if there is no such command. What the command throws passes on. [main]
     static bool ExecuteCommand(const UTF16String& name, const UTF16String& arguments,
                                utility::UTF16OutputStream& output);
 
-    // Names and descriptions, sorted by name. [main]
+    /// Names and descriptions, sorted by name. [main]
     static std::vector<std::pair<UTF16String, UTF16String>> GetCommands();
 };
 

@@ -6,8 +6,8 @@
 namespace zebcore::filesupport
 {
 
-// Compares two paths by the file system's rule for names: exactly on Linux, as the volume says on macOS. Negative,
-// zero or positive as `a` comes before, names the same file as, or comes after `b`. A strict ordering. [any]
+/// Compares two paths by the file system's rule for names: exactly on Linux, as the volume says on macOS. Negative,
+/// zero or positive as `a` comes before, names the same file as, or comes after `b`. A strict ordering. [any]
 ZEB_EXPORT int CompareFileNames(const UTF16String& a, const UTF16String& b);
 
 } // namespace zebcore::filesupport

@@ -13,8 +13,8 @@
 namespace zebcore::filesupport
 {
 
-// The path of a directory, as a value. Only Exists, Create and the iteration touch the disk. A default-made Dir has
-// an empty path and exists nowhere. [any]
+/// The path of a directory, as a value. Only Exists, Create and the iteration touch the disk. A default-made Dir has
+/// an empty path and exists nowhere. [any]
 class ZEB_EXPORT Dir
 {
 public:
@@ -29,26 +29,26 @@ public:
 
     bool Exists() const;
 
-    // The path as it was given, without a trailing slash. A relative path stays relative.
+    /// The path as it was given, without a trailing slash. A relative path stays relative.
     const UTF16String& FullPath() const { return mPath; }
 
-    // Makes the directory and what is missing above it, for the user alone. Throws file_exception.
+    /// Makes the directory and what is missing above it, for the user alone. Throws file_exception.
     void Create() const;
 
-    // The directory of the application: of its executable, on macOS of its bundle.
+    /// The directory of the application: of its executable, on macOS of its bundle.
     static Dir AppDir();
 
-    // The directory of the user's preference files. It may not exist yet: saving a property list makes it.
+    /// The directory of the user's preference files. It may not exist yet: saving a property list makes it.
     static Dir PrefDir();
 
-    // Sets another directory of preference files; an empty one restores the user's own. [main]
+    /// Sets another directory of preference files; an empty one restores the user's own. [main]
     static void SetPrefDir(const Dir& dir);
 
-    // Walks the sub-directories in a fixed order, that of their names by code unit or that of `order`, a "less than"
-    // on names. Links to directories count, except those that lead back to this directory or one above it, since such
-    // a walk would never end. What can't be read is left out. With `recursive` the sub-directories of each follow it.
-    // `goOn`, which may be null, is asked between directories and ends the walk when it returns false. What the
-    // iterator yields is what was there at the call.
+    /// Walks the sub-directories in a fixed order, that of their names by code unit or that of `order`, a "less than"
+    /// on names. Links to directories count, except those that lead back to this directory or one above it, since
+    /// such a walk would never end. What can't be read is left out. With `recursive` the sub-directories of each
+    /// follow it. `goOn`, which may be null, is asked between directories and ends the walk when it returns false.
+    /// What the iterator yields is what was there at the call.
     DirIterator
     BeginSubdirs(bool recursive, boost::function<bool()>* goOn,
                  boost::shared_ptr<boost::function<bool(const UTF16String&, const UTF16String&)>> order) const;
@@ -58,7 +58,7 @@ private:
     UTF16String mPath;
 };
 
-// An input iterator over the sub-directories of a Dir.
+/// An input iterator over the sub-directories of a Dir.
 class ZEB_EXPORT Dir::DirIterator
 {
 public:

@@ -7,13 +7,13 @@
 namespace zebcore::filesupport
 {
 
-// A read-only stream of the bytes of a file. It belongs to one thread at a time. [any]
+/// A read-only stream of the bytes of a file. It belongs to one thread at a time. [any]
 class ZEB_EXPORT IPlatformByteStream
 {
 public:
     static constexpr unsigned int kOpenForReading = 1;
 
-    // Throws file_exception if the file can't be opened, is a directory, or `flags` lacks kOpenForReading.
+    /// Throws file_exception if the file can't be opened, is a directory, or `flags` lacks kOpenForReading.
     IPlatformByteStream(const File& file, utility::Flags<unsigned int> flags);
 
     IPlatformByteStream(const IPlatformByteStream&) = delete;
@@ -21,11 +21,11 @@ public:
 
     ~IPlatformByteStream();
 
-    // Length of the file in bytes; 0 for what has no length, such as a pipe. Throws file_exception.
+    /// Length of the file in bytes; 0 for what has no length, such as a pipe. Throws file_exception.
     unsigned long long Length() const;
 
-    // Reads up to `count` bytes from the current position, and fewer only at the end of the file. Returns the number
-    // of bytes read. Throws file_exception.
+    /// Reads up to `count` bytes from the current position, and fewer only at the end of the file. Returns the number
+    /// of bytes read. Throws file_exception.
     unsigned int ReadBlock(unsigned char* buffer, unsigned int count);
 
 private:

@@ -10,8 +10,8 @@ namespace zebcore::proplist
 
 class PropList;
 
-// Is shown the entries of a PropList, in the order in which they were added. Override what you need; the default
-// bodies do nothing. The list must not be changed while it is visited.
+/// Is shown the entries of a PropList, in the order in which they were added. Override what you need; the default
+/// bodies do nothing. The list must not be changed while it is visited.
 class ZEB_EXPORT PropListVisitor
 {
 public:
@@ -25,7 +25,7 @@ public:
     virtual void VisitValue(const UTF8String& key, float value);
     virtual void VisitValue(const UTF8String& key, const std::list<float>& value);
 
-    // `subList` belongs to the visited list.
+    /// `subList` belongs to the visited list.
     virtual void VisitSubList(const UTF8String& key, const PropList& subList);
 };
 
