@@ -1,0 +1,99 @@
+#pragma once
+
+#include <atomic>
+#include <memory>
+#include <utility>
+
+namespace zebaudiofilterhost::vst3
+{
+
+// A value that any thread may replace as a whole while any other reads it, the process thread included.
+//
+// Reading takes no lock, waits for nobody and frees nothing. A replaced value is kept until FreeRetired finds a
+// moment without a reader.
+template <typename T>
+class Published
+{
+    struct Node
+    {
+        T value;
+        Node* next;
+    };
+
+public:
+    // Keeps the value that was current at its construction alive and unchanged while it exists. [any]
+    class Reader
+    {
+    public:
+        explicit Reader(const Published& published) : mReaders(published.mReaders)
+        {
+            // Both in the one total order: whoever finds no reader after unlinking a value knows that all later ones
+            // load a newer pointer.
+            mReaders.fetch_add(1, std::memory_order_seq_cst);
+            mValue = &published.mCurrent.load(std::memory_order_seq_cst)->value;
+        }
+        ~Reader() { mReaders.fetch_sub(1, std::memory_order_seq_cst); }
+        Reader(const Reader&) = delete;
+        Reader& operator=(const Reader&) = delete;
+
+        const T& operator*() const { return *mValue; }
+        const T* operator->() const { return mValue; }
+
+    private:
+        std::atomic<unsigned int>& mReaders;
+        const T* mValue;
+    };
+
+    Published() : mCurrent(new Node{T(), nullptr}) {}
+    ~Published()
+    {
+        Free(mRetired.load(std::memory_order_acquire));
+        Free(mCurrent.load(std::memory_order_acquire));
+    }
+    Published(const Published&) = delete;
+    Published& operator=(const Published&) = delete;
+
+    // Makes `value` the current one. Allocates. [any]
+    void Publish(T value)
+    {
+        auto* node = new Node{std::move(value), nullptr};
+        Retire(mCurrent.exchange(node, std::memory_order_seq_cst));
+    }
+
+    // Destroys what was replaced, unless somebody reads just now: then a later call does. [any but process]
+    void FreeRetired()
+    {
+        Node* retired = mRetired.exchange(nullptr, std::memory_order_seq_cst);
+        if (mReaders.load(std::memory_order_seq_cst) == 0)
+            Free(retired);
+        else
+            RetireAll(retired);
+    }
+
+private:
+    void Retire(Node* node)
+    {
+        node->next = mRetired.load(std::memory_order_relaxed);
+        while (!mRetired.compare_exchange_weak(node->next, node, std::memory_order_seq_cst))
+        {
+        }
+    }
+
+    void RetireAll(Node* node)
+    {
+        while (node != nullptr)
+            Retire(std::exchange(node, node->next));
+    }
+
+    static void Free(Node* node)
+    {
+        while (node != nullptr)
+            std::unique_ptr<Node>(std::exchange(node, node->next));
+    }
+
+    std::atomic<Node*> mCurrent;
+    std::atomic<Node*> mRetired = nullptr;
+    mutable std::atomic<unsigned int> mReaders = 0;
+};
+
+} // namespace zebaudiofilterhost::vst3
