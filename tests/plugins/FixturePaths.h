@@ -1,0 +1,25 @@
+#pragma once
+
+#include <filesystem>
+#include <string_view>
+
+namespace zebtest
+{
+
+// Folder of the bundles that misbehave without doing harm: a scan of the whole folder in this process survives.
+std::filesystem::path FixtureFolder();
+
+// Folder of the bundles that crash, abort, leave, hang or chatter when loaded: for a process of their own.
+std::filesystem::path HazardFolder();
+
+// Folder of the example effects.
+std::filesystem::path EffectFolder();
+
+std::filesystem::path FixtureBundle(std::string_view name); // "NullFactory" gives .../NullFactory.vst3
+std::filesystem::path HazardBundle(std::string_view name);
+std::filesystem::path EffectBundle(std::string_view name);
+
+// The binary inside a bundle.
+std::filesystem::path BinaryOf(const std::filesystem::path& bundle);
+
+} // namespace zebtest
