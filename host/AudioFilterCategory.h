@@ -5,8 +5,8 @@
 namespace zebaudiofilterhost
 {
 
-// What a filter does, for the menus of an application. The numbers stand in settings files, so they never change:
-// 1 to 10 follow the categories of VST 2, 11 to 26 the sub-categories of VST 3.
+/// What a filter does, for the menus of an application. The numbers stand in settings files, so they never change:
+/// 1 to 10 follow the categories of VST 2, 11 to 26 the sub-categories of VST 3.
 enum AudioFilterCategory : std::int32_t
 {
     kCategoryNone = 0,

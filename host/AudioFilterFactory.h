@@ -12,26 +12,26 @@
 namespace zebaudiofilterhost
 {
 
-// Makes a filter from its ID: the ID's descriptor names a GUID, and the GUID selects a function. No lock: nothing may
-// register while filters are being made. [main]
+/// Makes a filter from its ID: the ID's descriptor names a GUID, and the GUID selects a function. No lock: nothing
+/// may register while filters are being made. [main]
 class ZEB_EXPORT AudioFilterFactory
 {
 public:
-    // Takes a filter ID; returns a suspended filter, or null.
+    /// Takes a filter ID; returns a suspended filter, or null.
     using FactoryFunction = boost::function<boost::intrusive_ptr<AudioFilter>(const UTF16String&)>;
 
-    // Lives until process exit.
+    /// Lives until process exit.
     static AudioFilterFactory& GetInstance();
 
     AudioFilterFactory(const AudioFilterFactory&) = delete;
     AudioFilterFactory& operator=(const AudioFilterFactory&) = delete;
 
-    // The first registration of a GUID stays. [main], or a static initializer
+    /// The first registration of a GUID stays. [main], or a static initializer
     void RegisterFactoryFunction(const Guid& guid, FactoryFunction function);
 
-    // Null for an unknown ID or GUID, and whenever the function returns null. Makes disabled filters too;
-    // utility::CreateAudioFilter does not. An ID without its technology digit is tried as Audio Unit, then as VST 2.
-    // Exceptions of the function pass through; an empty one throws boost::bad_function_call.
+    /// Null for an unknown ID or GUID, and whenever the function returns null. Makes disabled filters too;
+    /// utility::CreateAudioFilter does not. An ID without its technology digit is tried as Audio Unit, then as VST 2.
+    /// Exceptions of the function pass through; an empty one throws boost::bad_function_call.
     boost::intrusive_ptr<AudioFilter> CreateAudioFilter(const UTF16String& id) const;
 
 private:

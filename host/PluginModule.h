@@ -8,37 +8,37 @@
 namespace zebaudiofilterhost
 {
 
-// One plug-in binary in memory: the bundle at a path, loaded or not. Each technology derives its own from it and
-// resolves its entry points there. Also keeps what every plug-in may ask the host for: language and theme. [main]
+/// One plug-in binary in memory: the bundle at a path, loaded or not. Each technology derives its own from it and
+/// resolves its entry points there. Also keeps what every plug-in may ask the host for: language and theme. [main]
 class ZEB_EXPORT PluginModule : public virtual zebcore::utility::RefCountedObject
 {
 public:
-    // Does not touch the disk. Without `ownsModule` the OS module is never released here.
+    /// Does not touch the disk. Without `ownsModule` the OS module is never released here.
     PluginModule(const UTF16String& path, bool ownsModule);
     ~PluginModule() override;
 
     PluginModule(const PluginModule&) = delete;
     PluginModule& operator=(const PluginModule&) = delete;
 
-    // True when the OS module is there, also from an earlier call. Never throws.
+    /// True when the OS module is there, also from an earlier call. Never throws.
     virtual bool Load();
     virtual void Unload();
 
     UTF16String GetPath() const;
-    // Null while not loaded.
-    zebcore::OSModuleRef GetOSModule() const;
+    /// Null while not loaded.
+    zebcore::utility::OSModuleRef GetOSModule() const;
 
-    // The language that plug-ins are told, "en_US" until set. To be set before plug-ins load.
+    /// The language that plug-ins are told, "en_US" until set. To be set before plug-ins load.
     static void SetLocaleIdentifier(const UTF16String& locale);
-    // Valid until the next SetLocaleIdentifier.
+    /// Valid until the next SetLocaleIdentifier.
     static const char* GetLocaleIdentifier();
-    // The user interface theme that plug-ins are told, empty until set.
+    /// The user interface theme that plug-ins are told, empty until set.
     static void SetThemeXML(const UTF8String& theme);
     static const UTF8String& GetThemeXML();
 
 private:
     UTF16String mPath;
-    zebcore::OSModuleRef mOSModule = nullptr;
+    zebcore::utility::OSModuleRef mOSModule = nullptr;
     bool mOwnsModule;
 };
 

@@ -8,21 +8,21 @@
 namespace zebaudiofilterhost
 {
 
-// Gives a technology at most one module object for each path. T is a boost::intrusive_ptr to the technology's module
-// class. The key is the path as it stands: unlike PluginLocator it never ignores case. Its references go at process
-// exit. [main]
+/// Gives a technology at most one module object for each path. T is a boost::intrusive_ptr to the technology's module
+/// class. The key is the path as it stands: unlike PluginLocator it never ignores case. Its references go at process
+/// exit. [main]
 template <class T>
 class PluginModuleManager
 {
 public:
-    // The first module of a path stays.
+    /// The first module of a path stays.
     void AddPluginModule(T module)
     {
         UTF16String path = module->GetPath();
         mModules.emplace(std::move(path), std::move(module));
     }
 
-    // The module of the path, loaded or not; null if there is none.
+    /// The module of the path, loaded or not; null if there is none.
     T Find(const UTF16String& path) const
     {
         const auto found = mModules.find(path);

@@ -14,14 +14,15 @@
 namespace zebaudiofilterhost
 {
 
-// A cursor over the work of a scan, which the caller moves on step by step: make the scanner, BeginScan, ContinueScan
-// while GetCurrentProgressInfo returns true, EndScan. What a step found is in the catalogue once its plug-in is done.
-// Good for one pass, and may be dropped at any step. A crash of a plug-in is not caught: an application that wants to
-// survive the next start bans the announced locator around each step (BannedPluginManager). [main]
+/// A cursor over the work of a scan, which the caller moves on step by step: make the scanner, BeginScan,
+/// ContinueScan while GetCurrentProgressInfo returns true, EndScan. What a step found is in the catalogue once its
+/// plug-in is done. Good for one pass, and may be dropped at any step. A crash of a plug-in is not caught: an
+/// application that wants to survive the next start bans the announced locator around each step
+/// (BannedPluginManager). [main]
 class ZEB_EXPORT PluginModuleScanner : public virtual zebcore::utility::RefCountedObject
 {
 public:
-    // One technology's share.
+    /// One technology's share.
     struct ScanItem
     {
         boost::intrusive_ptr<PluginTechnology> technology;
@@ -29,8 +30,8 @@ public:
         unsigned long count = 0; // how many locators the context has
     };
 
-    // Loads nothing yet. Work goes technology by technology, within one in the order of `locators`; those of an
-    // unknown technology are ignored. With `skipCategory` descriptors carry kCategoryNotQueried, which saves asking.
+    /// Loads nothing yet. Work goes technology by technology, within one in the order of `locators`; those of an
+    /// unknown technology are ignored. With `skipCategory` descriptors carry kCategoryNotQueried, which saves asking.
     PluginModuleScanner(const std::vector<PluginLocator>& locators, bool skipCategory);
     ~PluginModuleScanner() override;
 
@@ -38,14 +39,14 @@ public:
     PluginModuleScanner& operator=(const PluginModuleScanner&) = delete;
 
     void BeginScan();
-    // False, with nothing written, when the scan is finished. Otherwise the plug-in that the next ContinueScan
-    // touches, its number from 1 to `total`, and in `detail` which of its filters.
+    /// False, with nothing written, when the scan is finished. Otherwise the plug-in that the next ContinueScan
+    /// touches, its number from 1 to `total`, and in `detail` which of its filters.
     bool GetCurrentProgressInfo(PluginLocator& locator, UTF16String& detail, int& current, int& total) const;
-    // One step: at most one plug-in load or one filter. A call that finds its technology finished goes on with the
-    // first step of the next one, whose plug-in GetCurrentProgressInfo has not announced. Returns whether anything
-    // remains. Exceptions of a context pass through, and the scan stays where it was.
+    /// One step: at most one plug-in load or one filter. A call that finds its technology finished goes on with the
+    /// first step of the next one, whose plug-in GetCurrentProgressInfo has not announced. Returns whether anything
+    /// remains. Exceptions of a context pass through, and the scan stays where it was.
     bool ContinueScan();
-    // Enables again what was enabled when the scanner was made.
+    /// Enables again what was enabled when the scanner was made.
     void EndScan();
 
 private:

@@ -16,17 +16,17 @@
 namespace zebaudiofilterhost
 {
 
-// What the catalogue knows of one technology: a number, a list of directories and four functions, which the
-// technology supplies from a static initializer. Signal slots see the list's new value. [main]
+/// What the catalogue knows of one technology: a number, a list of directories and four functions, which the
+/// technology supplies from a static initializer. Signal slots see the list's new value. [main]
 class ZEB_EXPORT PluginTechnology : public virtual zebcore::utility::RefCountedObject
 {
 public:
-    // Finds the plug-ins below a directory, leaving out those that BannedPluginManager::IsPluginBanned names.
+    /// Finds the plug-ins below a directory, leaving out those that BannedPluginManager::IsPluginBanned names.
     using CollectFunction = boost::function<std::vector<PluginLocator>(const Dir&)>;
-    // Makes a new context, also when there is nothing to scan.
+    /// Makes a new context, also when there is nothing to scan.
     using ScanContextFunction = boost::function<boost::intrusive_ptr<PluginScanContext>(const std::vector<Dir>&)>;
     using DefaultDirectoriesFunction = boost::function<std::vector<UTF16String>()>;
-    // Turns a locator's path into text for the user.
+    /// Turns a locator's path into text for the user.
     using PathDisplayFunction = boost::function<UTF16String(const UTF16String&)>;
 
     using DirectoryIterator = std::vector<UTF16String>::const_iterator;
@@ -34,7 +34,7 @@ public:
         boost::signals2::signal<void(boost::intrusive_ptr<PluginTechnology>, const std::vector<UTF16String>& added,
                                      const std::vector<UTF16String>& removed)>;
 
-    // The directory list starts empty. Without `hasDirectories` the technology looks in places of its own.
+    /// The directory list starts empty. Without `hasDirectories` the technology looks in places of its own.
     PluginTechnology(TechnologyType type, CollectFunction collect, ScanContextFunction scanContext,
                      DefaultDirectoriesFunction defaultDirectories, PathDisplayFunction pathDisplay,
                      bool hasDirectories);
@@ -44,28 +44,29 @@ public:
     PluginTechnology& operator=(const PluginTechnology&) = delete;
 
     TechnologyType GetType() const;
-    // Whether the technology works from the directory list below.
+    /// Whether the technology works from the directory list below.
     bool HasDirectories() const;
 
     DirectoryIterator DirectoryBegin() const;
     DirectoryIterator DirectoryEnd() const;
     DirectoriesChangedSignal& GetDirectoriesChangedSignal();
 
-    // Appends those that are new, as plain text. The signal tells the whole of `directories`, known ones included,
-    // and is silent when none was new.
+    /// Appends those that are new, as plain text. The signal tells the whole of `directories`, known ones included,
+    /// and is silent when none was new.
     void AddPluginDirectories(const std::vector<UTF16String>& directories);
-    // The signal tells the whole of `directories`, and is silent when none was there.
+    /// The signal tells the whole of `directories`, and is silent when none was there.
     void RemovePluginDirectories(const std::vector<UTF16String>& directories);
     void RemoveAllPluginDirectories();
-    // Always tells the present list as removed, even an empty one. The list then becomes the technology's standard
-    // directories, if it works from a list and has a function for them; otherwise it stays.
+    /// Always tells the present list as removed, even an empty one. The list then becomes the technology's standard
+    /// directories, if it works from a list and has a function for them; otherwise it stays.
     void ResetDirectoriesToDefault();
 
-    // All plug-ins on disk; nested directories give a plug-in twice. Exceptions of the collect function pass through.
+    /// All plug-ins on disk; nested directories give a plug-in twice. Exceptions of the collect function pass
+    /// through.
     std::vector<PluginLocator> CollectPlugins() const;
-    // An empty function throws boost::bad_function_call.
+    /// An empty function throws boost::bad_function_call.
     boost::intrusive_ptr<PluginScanContext> CreateScanContext() const;
-    // The path itself when the technology has no function for it.
+    /// The path itself when the technology has no function for it.
     UTF16String GetPathDisplayString(const UTF16String& path) const;
 
 private:

@@ -5,7 +5,7 @@
 namespace zebaudiofilterhost
 {
 
-// One line of the permanent block list: which plug-in file is known not to work.
+/// One line of the permanent block list: which plug-in file is known not to work.
 struct StaticBanEntry
 {
     UTF16String fileName; // with extension; never empty

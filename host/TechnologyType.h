@@ -5,7 +5,7 @@
 namespace zebaudiofilterhost
 {
 
-// The kind of a plug-in. The numbers stand in settings files and in filter IDs, so they never change.
+/// The kind of a plug-in. The numbers stand in settings files and in filter IDs, so they never change.
 enum TechnologyType : std::int32_t
 {
     kTechnologyNone = 0,     // a locator that is default-made or failed to parse

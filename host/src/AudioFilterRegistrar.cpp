@@ -1,0 +1,46 @@
+#include "host/AudioFilterRegistrar.h"
+
+#include "host/AudioFilterDescriptorManager.h"
+#include "module/ModuleSteps.h"
+
+#include <utility>
+
+namespace zebaudiofilterhost
+{
+
+namespace
+{
+
+[[maybe_unused]] const bool sStepAdded = ModuleSteps::GetInstance().Add(
+    ModuleStepOrder::kDeferredDescriptors, &AudioFilterRegistrar::RegisterDeferredDescriptors);
+
+} // namespace
+
+AudioFilterRegistrar::AudioFilterRegistrar(DescriptorFunction descriptorFunction, FactoryFunction factoryFunction)
+{
+    GetFactoryVector().emplace_back(std::move(descriptorFunction), std::move(factoryFunction));
+}
+
+AudioFilterRegistrar::FactoryVector& AudioFilterRegistrar::GetFactoryVector()
+{
+    static FactoryVector sFactories;
+    return sFactories;
+}
+
+void AudioFilterRegistrar::RegisterDeferredDescriptors()
+{
+    const FactoryVector& factories = GetFactoryVector();
+    for (std::size_t index = 0; index < factories.size(); ++index)
+    {
+        // A copy: a descriptor function may itself make a registrar.
+        const auto [descriptorFunction, factoryFunction] = factories[index];
+        const boost::intrusive_ptr<AudioFilterDescriptor> descriptor = descriptorFunction();
+        if (descriptor)
+        {
+            AudioFilterDescriptorManager::GetInstance().AddAudioFilterDescriptor(descriptor);
+            AudioFilterFactory::GetInstance().RegisterFactoryFunction(descriptor->GetFactoryGuid(), factoryFunction);
+        }
+    }
+}
+
+} // namespace zebaudiofilterhost

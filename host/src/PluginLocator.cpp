@@ -1,0 +1,104 @@
+#include "host/PluginLocator.h"
+
+#include "foundation/zebcore/CompareFileNames.h"
+#include "foundation/zebcore/StringStreams.h"
+
+#include <limits>
+#include <utility>
+
+namespace zebaudiofilterhost
+{
+
+namespace
+{
+
+constexpr char16_t kSeparator = u':';
+
+TechnologyType ParseTechnologyType(const UTF16String& text)
+{
+    zebcore::utility::iUTF16StringStream stream(text);
+    long value = 0;
+    if (!(stream >> value))
+    {
+        return kTechnologyNone;
+    }
+    using Limits = std::numeric_limits<std::int32_t>;
+    const bool fits = value >= Limits::min() && value <= Limits::max();
+    return fits ? static_cast<TechnologyType>(value) : kTechnologyNone;
+}
+
+} // namespace
+
+PluginLocator::PluginLocator() = default;
+
+PluginLocator::PluginLocator(TechnologyType type, const UTF16String& path) : mType(type), mPath(path)
+{
+}
+
+PluginLocator::PluginLocator(const PluginLocator& other) = default;
+
+PluginLocator& PluginLocator::operator=(const PluginLocator& other)
+{
+    PluginLocator copy(other);
+    Swap(copy);
+    return *this;
+}
+
+PluginLocator::~PluginLocator() = default;
+
+void PluginLocator::Swap(PluginLocator& other) noexcept
+{
+    std::swap(mType, other.mType);
+    mPath.swap(other.mPath);
+}
+
+bool PluginLocator::operator<(const PluginLocator& other) const
+{
+    if (mType != other.mType)
+    {
+        return mType < other.mType;
+    }
+    return zebcore::filesupport::CompareFileNames(mPath, other.mPath) < 0;
+}
+
+bool PluginLocator::operator==(const PluginLocator& other) const
+{
+    return mType == other.mType && zebcore::filesupport::CompareFileNames(mPath, other.mPath) == 0;
+}
+
+bool PluginLocator::operator!=(const PluginLocator& other) const
+{
+    return !(*this == other);
+}
+
+TechnologyType PluginLocator::GetTechnologyType() const
+{
+    return mType;
+}
+
+UTF16String PluginLocator::GetPath() const
+{
+    return mPath;
+}
+
+UTF16String PluginLocator::ToString() const
+{
+    zebcore::utility::oUTF16StringStream stream;
+    stream << static_cast<std::int32_t>(mType);
+    return stream.str() + kSeparator + mPath;
+}
+
+void PluginLocator::FromString(const UTF16String& text)
+{
+    PluginLocator parsed;
+    // Only the first colon separates: a path may hold more.
+    const std::size_t colon = text.find(kSeparator);
+    if (colon != UTF16String::npos)
+    {
+        parsed.mType = ParseTechnologyType(text.substr(0, colon));
+        parsed.mPath = text.substr(colon + 1);
+    }
+    Swap(parsed);
+}
+
+} // namespace zebaudiofilterhost

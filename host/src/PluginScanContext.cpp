@@ -1,0 +1,8 @@
+#include "host/PluginScanContext.h"
+
+namespace zebaudiofilterhost
+{
+
+PluginScanContext::~PluginScanContext() = default;
+
+} // namespace zebaudiofilterhost
