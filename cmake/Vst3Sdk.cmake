@@ -15,22 +15,34 @@ add_library(zeb_vst3_sdk STATIC EXCLUDE_FROM_ALL
     ${VST3_SDK_ROOT}/base/source/fobject.cpp
     ${VST3_SDK_ROOT}/base/source/fstring.cpp
     ${VST3_SDK_ROOT}/base/thread/source/flock.cpp
-    ${VST3_SDK_ROOT}/public.sdk/source/vst/vstinitiids.cpp)
+    ${VST3_SDK_ROOT}/public.sdk/source/vst/vstinitiids.cpp
+    ${PROJECT_SOURCE_DIR}/host/src/VST3/src/VST3InterfaceIDs.cpp)
 target_include_directories(zeb_vst3_sdk SYSTEM PUBLIC ${VST3_SDK_ROOT})
 target_compile_definitions(zeb_vst3_sdk PUBLIC RELEASE=1)
-target_compile_options(zeb_vst3_sdk PRIVATE -w)
+# The SDK's interfaces have no virtual destructor, and nobody deletes through them.
+target_compile_options(zeb_vst3_sdk PRIVATE -w INTERFACE -Wno-non-virtual-dtor)
 
-# zeb_vst3_plugin(NAME SOURCES ... [FOLDER vst3|fixtures] [LIBRARIES ...] [DEFINITIONS ...])
-#   A real bundle: <build>/FOLDER/NAME.vst3/Contents/<arch>-linux/NAME.so
+# zeb_vst3_plugin(TARGET SOURCES ... [BUNDLE name] [FOLDER vst3|fixtures|hazards] [LIBRARIES ...] [DEFINITIONS ...])
+#   A real bundle: <build>/FOLDER/BUNDLE.vst3/Contents/<arch>-linux/BUNDLE.so; on macOS Contents/MacOS/BUNDLE. Without
+#   BUNDLE it is called like the target.
 function(zeb_vst3_plugin name)
-    cmake_parse_arguments(arg "" "FOLDER" "SOURCES;LIBRARIES;DEFINITIONS" ${ARGN})
+    cmake_parse_arguments(arg "" "BUNDLE;FOLDER" "SOURCES;LIBRARIES;DEFINITIONS" ${ARGN})
     if(NOT arg_FOLDER)
         set(arg_FOLDER vst3)
+    endif()
+    if(NOT arg_BUNDLE)
+        set(arg_BUNDLE ${name})
     endif()
     add_library(${name} MODULE ${arg_SOURCES})
     target_link_libraries(${name} PRIVATE zeb_options zeb_vst3_sdk Threads::Threads ${arg_LIBRARIES})
     target_compile_definitions(${name} PRIVATE ${arg_DEFINITIONS})
-    target_link_options(${name} PRIVATE LINKER:--exclude-libs,ALL)
-    set_target_properties(${name} PROPERTIES PREFIX "" LIBRARY_OUTPUT_DIRECTORY
-        ${PROJECT_BINARY_DIR}/${arg_FOLDER}/${name}.vst3/Contents/${CMAKE_SYSTEM_PROCESSOR}-linux)
+    set_target_properties(${name} PROPERTIES PREFIX "" OUTPUT_NAME ${arg_BUNDLE})
+    if(APPLE)
+        set_target_properties(${name} PROPERTIES BUNDLE TRUE BUNDLE_EXTENSION vst3
+            LIBRARY_OUTPUT_DIRECTORY ${PROJECT_BINARY_DIR}/${arg_FOLDER})
+    else()
+        target_link_options(${name} PRIVATE LINKER:--exclude-libs,ALL)
+        set_target_properties(${name} PROPERTIES LIBRARY_OUTPUT_DIRECTORY
+            ${PROJECT_BINARY_DIR}/${arg_FOLDER}/${arg_BUNDLE}.vst3/Contents/${CMAKE_SYSTEM_PROCESSOR}-linux)
+    endif()
 endfunction()

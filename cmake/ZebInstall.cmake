@@ -19,7 +19,7 @@ install(FILES ${PROJECT_BINARY_DIR}/zebaudiofilterhostConfig.cmake
 configure_file(${PROJECT_SOURCE_DIR}/cmake/zebaudiofilterhost.pc.in ${PROJECT_BINARY_DIR}/zebaudiofilterhost.pc @ONLY)
 install(FILES ${PROJECT_BINARY_DIR}/zebaudiofilterhost.pc DESTINATION ${CMAKE_INSTALL_LIBDIR}/pkgconfig)
 
-if(ZEB_BUILD_ZEBHOST)
+if(TARGET zebhost)
     set_target_properties(zebhost PROPERTIES INSTALL_RPATH $ORIGIN/../${CMAKE_INSTALL_LIBDIR})
     install(TARGETS zebhost)
 endif()

@@ -3,6 +3,7 @@
 #include "examples/effects/support/Vst3.h"
 
 #include <atomic>
+#include <tuple>
 #include <type_traits>
 
 namespace effects
@@ -34,6 +35,8 @@ public:
             delete this;
         return left;
     }
+
+    FUnknown* AsUnknown() { return static_cast<std::tuple_element_t<0, std::tuple<Interfaces...>>*>(this); }
 
 private:
     // An interface answers for itself and for what it derives from; the first one listed that can, does.

@@ -16,6 +16,13 @@ enum class FactoryLevel
     kUnicode        // IPluginFactory3: the same in UTF-16
 };
 
+// A new object of a class made with Implements<...>.
+template <class Class>
+FUnknown* Make()
+{
+    return (new Class)->AsUnknown();
+}
+
 struct ClassDescription
 {
     FUID id;
