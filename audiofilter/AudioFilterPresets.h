@@ -1,0 +1,5 @@
+// Presets and lists of presets.
+#pragma once
+
+#include "audiofilter/PresetData.h"
+#include "audiofilter/PresetList.h"

@@ -1,0 +1,95 @@
+// Life of a filter: construction, ticks, suspending and resuming, cloning.
+#include "audiofilter/AudioFilter.h"
+
+#include "module/ModuleUITimer.h"
+#include "utility/EffectUtils.h"
+#include "utility/ThreadUtils.h"
+
+#include <boost/bind/bind.hpp>
+
+namespace zebaudiofilterhost
+{
+
+namespace
+{
+
+std::vector<ChannelLayout> LayoutsOf(const std::vector<AudioFilterBusDescription>& buses)
+{
+    std::vector<ChannelLayout> layouts;
+    layouts.reserve(buses.size());
+    for (const AudioFilterBusDescription& bus : buses)
+        layouts.push_back(bus.GetLayout());
+    return layouts;
+}
+
+} // namespace
+
+AudioFilter::AudioFilter(const UTF16String& id, const UTF16String& displayName)
+    : mFilterID(id), mDisplayName(displayName)
+{
+    mMainTargetBus.SetType(AudioFilterBusDescription::kBusType_Main);
+    mSideChainTargetBus.SetType(AudioFilterBusDescription::kBusType_SideChain);
+    if (CurrentThreadIDIsMainThreadID())
+        mUITimerConnection = ModuleUITimer::GetInstance().ConnectTick(boost::bind(&AudioFilter::TickWhileHeld, this));
+}
+
+AudioFilter::~AudioFilter() = default;
+
+void AudioFilter::TickWhileHeld()
+{
+    // A queued message may hold the last reference, and the tick purges it. A filter that nobody holds yet, because
+    // it is still being made, must not get its first and last reference from here.
+    const boost::intrusive_ptr<AudioFilter> held(GetRefCount() > 0 ? this : nullptr);
+    OnUITimerTick();
+}
+
+void AudioFilter::OnUITimerTick()
+{
+    FlushMessageQueue();
+}
+
+void AudioFilter::Suspend()
+{
+    SetProcessing(false);
+    mSuspended.store(true, std::memory_order_relaxed);
+    mSuspendedStateChangedSignal(true);
+}
+
+void AudioFilter::Resume()
+{
+    FlushMessageQueue();
+    SetProcessing(true);
+    mSuspended.store(false, std::memory_order_relaxed);
+    BuildChannelMaps();
+    mSuspendedStateChangedSignal(false);
+}
+
+boost::intrusive_ptr<AudioFilter> AudioFilter::Clone() const
+{
+    const boost::intrusive_ptr<AudioFilter> clone = utility::CreateAudioFilter(mFilterID);
+    if (!clone)
+        return clone;
+    clone->RequestIOConfiguration(LayoutsOf(mInputBuses), LayoutsOf(mOutputBuses));
+    clone->SetSampleRate(mSampleRate);
+
+    PropList settings;
+    PresetData preset(settings);
+    SaveSettings(preset);
+    clone->LoadSettings(preset);
+
+    clone->mPresetNameAndDirtyState = mPresetNameAndDirtyState;
+    clone->mInputChannelMap = GetChannelMap(kDirection_Input);
+    clone->mOutputChannelMap = GetChannelMap(kDirection_Output);
+    clone->mMainTargetBus = mMainTargetBus;
+    clone->mSideChainTargetBus = mSideChainTargetBus;
+    clone->SetUseChannelMap(GetUseChannelMap());
+    return clone;
+}
+
+boost::intrusive_ptr<AudioFilter> AudioFilter::Clone(const boost::intrusive_ptr<AudioFilter>& filter)
+{
+    filter->FlushMessageQueue(); // So that queued parameter changes are in the state that gets saved
+    return filter->Clone();
+}
+
+} // namespace zebaudiofilterhost

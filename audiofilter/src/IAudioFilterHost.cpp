@@ -1,0 +1,10 @@
+#include "audiofilter/IAudioFilterHost.h"
+
+namespace zebaudiofilterhost
+{
+
+IAudioFilterHost::~IAudioFilterHost()
+{
+}
+
+} // namespace zebaudiofilterhost

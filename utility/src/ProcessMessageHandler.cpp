@@ -1,0 +1,111 @@
+#include "utility/ProcessMessageHandler.h"
+
+#include "utility/ThreadUtils.h"
+
+#include <algorithm>
+#include <iterator>
+#include <utility>
+
+namespace zebaudiofilterhost
+{
+
+ProcessMessageHandler::ProcessMessageHandler() : mWriteIndex(0), mReadIndex(0), mProcessing(false)
+{
+}
+
+ProcessMessageHandler::~ProcessMessageHandler() = default;
+
+void ProcessMessageHandler::FlushMessageQueue()
+{
+    if (CurrentThreadIDIsMainThreadID())
+        PumpFromMainThread();
+    else
+        PumpFromProcessThread();
+}
+
+void ProcessMessageHandler::Post(boost::intrusive_ptr<Message> message)
+{
+    mMessages.push_back(std::move(message));
+    TransferMessagesToQueue();
+}
+
+void ProcessMessageHandler::PumpFromMainThread()
+{
+    TransferMessagesToQueue();
+    if (!mProcessing.load(std::memory_order_relaxed))
+        PumpFromProcessThread();
+    RunMainStages();
+    PurgeProcessedMessages();
+    // Nothing may follow: the purge may have destroyed this object.
+}
+
+void ProcessMessageHandler::SetProcessing(bool processing)
+{
+    mProcessing.store(processing, std::memory_order_relaxed); // Read by the main thread only
+}
+
+void ProcessMessageHandler::TransferMessagesToQueue()
+{
+    for (const boost::intrusive_ptr<Message>& message : mMessages)
+    {
+        if (message->GetState() != Message::kState_Pending)
+            continue;
+        message->SetState(Message::kState_Queued); // First, since the consumer may finish it at once
+        if (!PushToRing(message))
+        {
+            message->SetState(Message::kState_Pending);
+            return; // Later messages wait too, so that the order of posting holds
+        }
+    }
+}
+
+bool ProcessMessageHandler::PushToRing(const boost::intrusive_ptr<Message>& message)
+{
+    const std::size_t write = mWriteIndex.load(std::memory_order_relaxed); // Our own
+    const std::size_t next = (write + 1) % kRingSize;
+    // Acquire: the consumer has emptied the place before it moved the read index on.
+    if (next == mReadIndex.load(std::memory_order_acquire))
+        return false;
+    mRing[write] = message;
+    mWriteIndex.store(next, std::memory_order_release); // Publishes the place
+    return true;
+}
+
+void ProcessMessageHandler::RunMainStages()
+{
+    // By index and with a reference: a stage may post, which moves the list, or flush, which shortens it.
+    for (std::size_t i = 0; i < mMessages.size(); ++i)
+    {
+        const boost::intrusive_ptr<Message> message = mMessages[i];
+        if (message->GetState() == Message::kState_ProcessDone)
+            message->SetState(message->ExecuteOnMainThread() ? Message::kState_Finished : Message::kState_Pending);
+    }
+}
+
+void ProcessMessageHandler::PurgeProcessedMessages()
+{
+    std::vector<Message*> finished;
+    for (const boost::intrusive_ptr<Message>& message : mMessages)
+    {
+        if (message->GetState() == Message::kState_Finished)
+            finished.push_back(message.get());
+    }
+    for (Message* message : finished)
+    {
+        if (message->GetRefCount() == 1) // The process thread may still hold one that it has just finished
+            message->SetState(Message::kState_Deletable);
+    }
+
+    const auto deletable = std::stable_partition(mMessages.begin(), mMessages.end(),
+                                                 [](const auto& message) { return !CanDeleteMessage(message); });
+    // Released last, when the list is in order again: a message may hold the last reference to this object's owner.
+    const MessageList doomed(std::make_move_iterator(deletable), std::make_move_iterator(mMessages.end()));
+    mMessages.erase(deletable, mMessages.end());
+}
+
+bool ProcessMessageHandler::CanDeleteMessage(boost::intrusive_ptr<Message> message)
+{
+    return message->GetState() == Message::kState_Deletable;
+}
+
+} // namespace zebaudiofilterhost
