@@ -77,10 +77,11 @@ bool AudioFilter::LoadChunkData(const PresetData&)
     return false;
 }
 
-void AudioFilter::SaveChunkData(PresetData& preset) const
+bool AudioFilter::SaveChunkData(PresetData& preset) const
 {
     preset.SetVersion(GetCurrentPresetVersion());
     preset.SetPresetType(PresetData::kPresetType_Chunk);
+    return true;
 }
 
 bool AudioFilter::LoadCustomData(const PresetData&)
