@@ -37,20 +37,26 @@ protected:
     IPtr<IHostApplication> mHost; // null if the host offers none
 };
 
-// Component and controller in one object, with one set of values and one state.
-class SingleComponent : public ControllerPart<ProcessorPart<Implements<IComponent, IAudioProcessor, IEditController>>>
+// Component and controller in one object, with one set of values and one state, and whatever other interfaces it has.
+template <class... More>
+class SingleComponentWith
+    : public ControllerPart<ProcessorPart<Implements<IComponent, IAudioProcessor, IEditController, More...>>>
 {
+    using Parts = ControllerPart<ProcessorPart<Implements<IComponent, IAudioProcessor, IEditController, More...>>>;
+
 public:
-    using ControllerPart::ControllerPart;
+    using Parts::Parts;
 
     tresult PLUGIN_API terminate() override
     {
-        mHandler = nullptr;
-        return ControllerPart::terminate();
+        this->mHandler = nullptr;
+        return Parts::terminate();
     }
 
-    tresult PLUGIN_API setState(IBStream* state) override { return mParameters.Load(state); }
-    tresult PLUGIN_API getState(IBStream* state) override { return mParameters.Save(state); }
+    tresult PLUGIN_API setState(IBStream* state) override { return this->mParameters.Load(state); }
+    tresult PLUGIN_API getState(IBStream* state) override { return this->mParameters.Save(state); }
 };
+
+using SingleComponent = SingleComponentWith<>;
 
 } // namespace effects
