@@ -2,6 +2,7 @@
 
 #include "foundation/zebcore/StringConversion.h"
 
+#include <map>
 #include <string>
 
 namespace zebaudiofilterhost
@@ -21,6 +22,12 @@ UTF8String& ThemeXML()
 {
     static UTF8String sThemeXML;
     return sThemeXML;
+}
+
+std::map<UTF16String, UTF16String>& LoadProblems()
+{
+    static std::map<UTF16String, UTF16String> sLoadProblems;
+    return sLoadProblems;
 }
 
 } // namespace
@@ -81,6 +88,20 @@ void PluginModule::SetThemeXML(const UTF8String& theme)
 const UTF8String& PluginModule::GetThemeXML()
 {
     return ThemeXML();
+}
+
+UTF16String PluginModule::GetLoadProblem(const UTF16String& path)
+{
+    const auto found = LoadProblems().find(path);
+    return found == LoadProblems().end() ? UTF16String() : found->second;
+}
+
+void PluginModule::SetLoadProblem(const UTF16String& path, const UTF16String& problem)
+{
+    if (problem.empty())
+        LoadProblems().erase(path);
+    else
+        LoadProblems().insert_or_assign(path, problem);
 }
 
 } // namespace zebaudiofilterhost

@@ -1,0 +1,44 @@
+#include "host/src/VST3/src/DirtySet.h"
+
+namespace zebaudiofilterhost::vst3
+{
+
+DirtySet::DirtySet(std::size_t size)
+{
+    // Never fewer than two levels, so that small sets cost what those of 4096 cost.
+    do
+    {
+        size = (size + kBits - 1) / kBits;
+        mLevels.emplace_back(size == 0 ? 1 : size);
+    } while (mLevels.size() < 2 || mLevels.back().size() > 1);
+}
+
+void DirtySet::Add(std::size_t number)
+{
+    AddAbove(0, number);
+}
+
+void DirtySet::AddAbove(std::size_t level, std::size_t number)
+{
+    // Release at every level: the bit above is not seen before the bit below, nor before what the caller wrote.
+    for (; level < mLevels.size(); ++level, number /= kBits)
+        mLevels[level][number / kBits].fetch_or(BitOf(number), std::memory_order_acq_rel);
+}
+
+void DirtySet::Remove(std::size_t number)
+{
+    for (std::size_t level = 0; level < mLevels.size(); ++level, number /= kBits)
+    {
+        const std::uint64_t bit = BitOf(number);
+        if ((mLevels[level][number / kBits].fetch_and(~bit, std::memory_order_acq_rel) & ~bit) != 0)
+            return;
+        const bool addedMeanwhile = level > 0 && mLevels[level - 1][number].load(std::memory_order_acquire) != 0;
+        if (addedMeanwhile)
+        {
+            AddAbove(level, number);
+            return;
+        }
+    }
+}
+
+} // namespace zebaudiofilterhost::vst3

@@ -1,0 +1,65 @@
+#pragma once
+
+#include "host/src/VST3/src/ParameterChangeTable.h"
+#include "host/src/VST3/src/ParameterChanges.h"
+#include "host/src/VST3/src/SharedTable.h"
+
+#include <pluginterfaces/vst/vsttypes.h>
+
+#include <vector>
+
+namespace zebaudiofilterhost::vst3
+{
+
+/// A mailbox of parameter changes between threads: for each known ID the newest kMaxPointsPerParameter changes. Any
+/// number of threads may write while one reads and another gives it new IDs. Nothing here locks or allocates but
+/// SetParameterIDs and CopyTo.
+//
+/// How it holds together:
+/// - The shape (which IDs there are) is a ParameterChangeTable that never changes after it is published. SharedTable
+///   publishes it and decides when a replaced one may go. A write into a replaced table is lost, as every pending
+///   change is when the shape changes.
+/// - Each ID has a ParameterRing. A writer takes a ticket and writes words that carry the ticket, so that a value and
+///   an offset of two writers never mix, and a writer that was held up cannot harm what came after it.
+/// - A DirtySet knows which rings were written, so that a block costs what changes in it, whatever the number of
+///   parameters.
+class ParameterChangeTransfer
+{
+public:
+    /// Knows no ID. [any]
+    ParameterChangeTransfer();
+
+    ParameterChangeTransfer(const ParameterChangeTransfer&) = delete;
+    ParameterChangeTransfer& operator=(const ParameterChangeTransfer&) = delete;
+
+    /// Repeated IDs count once. What was pending is dropped. Safe while other threads read and write. [any],
+    /// allocates
+    void SetParameterIDs(const std::vector<Steinberg::Vst::ParamID>& ids);
+
+    /// An unknown ID is ignored; a full ring loses its oldest change. [any]
+    void AddChange(Steinberg::Vst::ParamID id, double value, Steinberg::int32 sampleOffset);
+
+    /// False when nothing is pending, at the cost of one load. Can be true once without reason. [any]
+    bool HasChanges() const;
+
+    /// Takes the oldest change of the ID out. False, with nothing written, when there is none. [any], one at a time
+    bool GetNextChange(Steinberg::Vst::ParamID id, double& value, Steinberg::int32& sampleOffset);
+
+    /// Moves all that is pending, by ascending ID and oldest first. True if something was moved. [process], or
+    /// [main, suspended]
+    bool TransferChangesTo(ParameterChanges& changes);
+
+    /// Reads all points; those of unknown IDs are lost. True if a point could be read. [process], or [main,
+    /// suspended]
+    bool TransferChangesFrom(ParameterChanges& changes);
+
+    /// Gives `other` these IDs and a copy of what is pending here. [any], allocates
+    void CopyTo(ParameterChangeTransfer& other) const;
+
+private:
+    using Access = SharedTable<ParameterChangeTable>::Access;
+
+    SharedTable<ParameterChangeTable> mTable;
+};
+
+} // namespace zebaudiofilterhost::vst3
