@@ -42,8 +42,8 @@ ZEB_EXPORT void Trace(const unsigned char* line);
 /// Writes text to the debug output, as it stands. [any]
 ZEB_EXPORT void DebugTrace(const unsigned char* text);
 
-/// The two words that a trace point keeps. Racing threads lose at most one update of the flag, so no order is needed
-/// between them.
+/// The two words that a trace point keeps. They need no order between them: racing threads lose at most one update of
+/// the flag, and the next look at the counter makes up for it.
 struct TracePoint
 {
     std::atomic<bool> mEnabled{false};
@@ -54,9 +54,12 @@ struct TracePoint
 inline bool IsTracePointEnabled(TracePoint& point, const char* category, bool mayWait) noexcept
 {
     const std::uint32_t count = TraceChangeCount();
-    if (point.mTraceChangeCount.exchange(count, std::memory_order_relaxed) != count)
+    if (point.mTraceChangeCount.load(std::memory_order_relaxed) != count)
+    {
         point.mEnabled.store(TraceEnabled(reinterpret_cast<const unsigned char*>(category), kTraceLevel, mayWait),
                              std::memory_order_relaxed);
+        point.mTraceChangeCount.store(count, std::memory_order_relaxed);
+    }
     return point.mEnabled.load(std::memory_order_relaxed);
 }
 

@@ -1,0 +1,11 @@
+#include "foundation/zebcore/Locale.h"
+
+namespace zebcore
+{
+
+const std::locale& Locale::Default()
+{
+    return std::locale::classic();
+}
+
+} // namespace zebcore

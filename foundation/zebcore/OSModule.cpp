@@ -1,0 +1,101 @@
+#include "foundation/zebcore/OSModule.h"
+
+#include "foundation/zebcore/OSModulePlatform.h"
+#include "foundation/zebcore/StringConversion.h"
+
+#include <utility>
+
+namespace zebcore::utility
+{
+
+struct OSModule
+{
+    void* mHandle;
+    UTF16String mBinaryPath;
+};
+
+namespace
+{
+
+std::string& LastFailure()
+{
+    static std::string& failure = *new std::string;
+    return failure;
+}
+
+void SetLastFailure(const UTF16String& path, const char* reason)
+{
+    LastFailure() = "\"" + NarrowFromUTF16(path) + "\" could not be loaded: " + reason + ".";
+}
+
+/// Runs a step that works with the platform. Nothing it throws gets out, what a plug-in's initializers throw
+/// included.
+template <class Step>
+auto WithoutThrowing(const UTF16String& path, Step step) noexcept -> decltype(step())
+{
+    try
+    {
+        return step();
+    }
+    catch (const std::exception& exception)
+    {
+        SetLastFailure(path, exception.what());
+    }
+    catch (...)
+    {
+        SetLastFailure(path, "it threw an exception");
+    }
+    return {};
+}
+
+} // namespace
+
+OSModuleRef LoadOSModule(const UTF16String& path) noexcept
+{
+    return WithoutThrowing(path,
+                           [&]() -> OSModuleRef
+                           {
+                               const std::string narrowPath = NarrowFromUTF16(path);
+                               const std::string binary = platform::FindBinary(narrowPath, LastFailure());
+                               if (binary.empty())
+                                   return nullptr;
+                               void* handle = platform::OpenModule(narrowPath, binary, LastFailure());
+                               return handle == nullptr ? nullptr : new OSModule{handle, UTF16FromNarrow(binary)};
+                           });
+}
+
+void ReleaseOSModule(OSModuleRef module) noexcept
+{
+    if (module == nullptr)
+        return;
+    platform::CloseModule(module->mHandle);
+    delete module;
+}
+
+UTF16String FindOSModuleBinary(const UTF16String& path) noexcept
+{
+    return WithoutThrowing(path, [&]
+                           { return UTF16FromNarrow(platform::FindBinary(NarrowFromUTF16(path), LastFailure())); });
+}
+
+UTF16String GetLastOSModuleError()
+{
+    return UTF16FromNarrow(LastFailure());
+}
+
+void* GetOSModuleHandle(OSModuleRef module) noexcept
+{
+    return module == nullptr ? nullptr : module->mHandle;
+}
+
+UTF16String GetOSModuleBinaryPath(OSModuleRef module)
+{
+    return module == nullptr ? UTF16String() : module->mBinaryPath;
+}
+
+ModuleFunction GetFunctionPointerFromModuleImpl(OSModuleRef module, const std::string& name) noexcept
+{
+    return module == nullptr ? nullptr : platform::FindFunction(module->mHandle, name);
+}
+
+} // namespace zebcore::utility

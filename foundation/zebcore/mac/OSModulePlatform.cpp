@@ -1,0 +1,78 @@
+#include "foundation/zebcore/OSModulePlatform.h"
+
+#include "foundation/zebcore/StringConversion.h"
+#include "foundation/zebcore/mac/MACtoZEB.h"
+
+#include <CoreFoundation/CoreFoundation.h>
+
+namespace zebcore::utility::platform
+{
+
+namespace
+{
+
+CFBundleRef CreateBundle(const std::string& path)
+{
+    const auto* bytes = reinterpret_cast<const UInt8*>(path.data());
+    const CFURLRef url =
+        CFURLCreateFromFileSystemRepresentation(kCFAllocatorDefault, bytes, static_cast<CFIndex>(path.size()), false);
+    const CFBundleRef bundle = url == nullptr ? nullptr : CFBundleCreate(kCFAllocatorDefault, url);
+    if (url != nullptr)
+        CFRelease(url);
+    return bundle;
+}
+
+std::string ExecutablePath(CFBundleRef bundle)
+{
+    const CFURLRef url = CFBundleCopyExecutableURL(bundle);
+    if (url == nullptr)
+        return {};
+    const CFStringRef path = CFURLCopyFileSystemPath(url, kCFURLPOSIXPathStyle);
+    const std::string result = NarrowFromUTF16(MACtoZEB(path));
+    CFRelease(path);
+    CFRelease(url);
+    return result;
+}
+
+} // namespace
+
+std::string FindBinary(const std::string& path, std::string& failure)
+{
+    const CFBundleRef bundle = CreateBundle(path);
+    if (bundle == nullptr)
+    {
+        failure = "\"" + path + "\" does not exist, or is not a plug-in bundle.";
+        return {};
+    }
+    const std::string binary = ExecutablePath(bundle);
+    CFRelease(bundle);
+    if (binary.empty())
+        failure = "\"" + path + "\" holds no binary for this system.";
+    return binary;
+}
+
+void* OpenModule(const std::string& path, const std::string& /*binary*/, std::string& failure)
+{
+    // The code itself is loaded when the first function is looked up.
+    const CFBundleRef bundle = CreateBundle(path);
+    if (bundle == nullptr)
+        failure = "\"" + path + "\" is not a plug-in bundle.";
+    return bundle;
+}
+
+void CloseModule(void* handle)
+{
+    CFRelease(handle);
+}
+
+ModuleFunction FindFunction(void* handle, const std::string& name)
+{
+    const CFStringRef symbol = CFStringCreateWithCString(kCFAllocatorDefault, name.c_str(), kCFStringEncodingUTF8);
+    if (symbol == nullptr)
+        return nullptr;
+    void* function = CFBundleGetFunctionPointerForName(static_cast<CFBundleRef>(handle), symbol);
+    CFRelease(symbol);
+    return reinterpret_cast<ModuleFunction>(function);
+}
+
+} // namespace zebcore::utility::platform

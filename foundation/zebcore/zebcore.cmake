@@ -1,0 +1,66 @@
+set(ZEB_CORE_SOURCES
+    zebcore/Contract.cpp
+    zebcore/DebugDatabase.cpp
+    zebcore/DescriptorWatches.cpp
+    zebcore/Error.cpp
+    zebcore/Guid.cpp
+    zebcore/HighPrecisionTime.cpp
+    zebcore/Locale.cpp
+    zebcore/Localizer.cpp
+    zebcore/MainThreadLoop.cpp
+    zebcore/MainThreadQueue.cpp
+    zebcore/NumberToString.cpp
+    zebcore/OSModule.cpp
+    zebcore/RefCountedObject.cpp
+    zebcore/SmallBlockAllocator.cpp
+    zebcore/StringConversion.cpp
+    zebcore/StringStreams.cpp
+    zebcore/TextOutputStream.cpp
+    zebcore/ThrowError.cpp
+    zebcore/Trace.cpp)
+
+if(APPLE)
+    list(APPEND ZEB_CORE_SOURCES
+        zebcore/mac/Debugger.cpp
+        zebcore/mac/DescriptorPoller.cpp
+        zebcore/mac/MACtoZEB.cpp
+        zebcore/mac/OSModulePlatform.cpp
+        zebcore/mac/ThreadID.cpp)
+else()
+    list(APPEND ZEB_CORE_SOURCES
+        zebcore/linux/Debugger.cpp
+        zebcore/linux/DescriptorPoller.cpp
+        zebcore/linux/OSModulePlatform.cpp
+        zebcore/linux/ThreadID.cpp)
+endif()
+
+set(ZEB_CORE_HEADERS
+    zebcore/CaseInsensitive.h
+    zebcore/Contract.h
+    zebcore/DebugDatabase.h
+    zebcore/Error.h
+    zebcore/Export.h
+    zebcore/Flags.h
+    zebcore/Guid.h
+    zebcore/HighPrecisionTime.h
+    zebcore/Locale.h
+    zebcore/Localizer.h
+    zebcore/MainThreadLoop.h
+    zebcore/NumberToString.h
+    zebcore/OSModule.h
+    zebcore/Rect.h
+    zebcore/RefCountedInterface.h
+    zebcore/RefCountedObject.h
+    zebcore/SharedRefPtr.h
+    zebcore/SmallBlockAllocator.h
+    zebcore/StringConversion.h
+    zebcore/StringStreams.h
+    zebcore/StringTypes.h
+    zebcore/TextOutputStream.h
+    zebcore/Threads.h
+    zebcore/ThrowError.h
+    zebcore/Tokenizer.h
+    zebcore/Trace.h)
+if(APPLE)
+    list(APPEND ZEB_CORE_HEADERS zebcore/mac/MACtoZEB.h)
+endif()

@@ -1,0 +1,9 @@
+set(ZEB_MEDIATYPES_SOURCES
+    zebmediatypes/AudioChannelLayoutDescription.cpp
+    zebmediatypes/ChannelLayout.cpp
+    zebmediatypes/ChannelMap.cpp)
+set(ZEB_MEDIATYPES_HEADERS
+    zebmediatypes/AudioChannelDescription.h
+    zebmediatypes/AudioChannelLabel.h
+    zebmediatypes/ChannelLayout.h
+    zebmediatypes/ChannelMap.h)
