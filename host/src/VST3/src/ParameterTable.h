@@ -11,16 +11,16 @@
 namespace zebaudiofilterhost::vst3
 {
 
-// The controller's parameters as they were found at one moment.
+/// The controller's parameters as they were found at one moment.
 struct ParameterTable
 {
-    // What the application sees, by its index.
+    /// What the application sees, by its index.
     std::vector<boost::intrusive_ptr<VST3ParameterInfo>> mParameterInfos;
 
-    // Parameter ID to index in mParameterInfos.
+    /// Parameter ID to index in mParameterInfos.
     std::map<std::uint32_t, unsigned long> mParameterIndexByID;
 
-    // Every ID of the controller in its own order, also those hidden from the application.
+    /// Every ID of the controller in its own order, also those hidden from the application.
     std::vector<std::uint32_t> mParameterIDs;
 };
 

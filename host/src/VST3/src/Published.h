@@ -7,10 +7,10 @@
 namespace zebaudiofilterhost::vst3
 {
 
-// A value that any thread may replace as a whole while any other reads it, the process thread included.
-//
-// Reading takes no lock, waits for nobody and frees nothing. A replaced value is kept until FreeRetired finds a
-// moment without a reader.
+/// A value that any thread may replace as a whole while any other reads it, the process thread included.
+///
+/// Reading takes no lock, waits for nobody and frees nothing. A replaced value is kept until FreeRetired finds a
+/// moment without a reader.
 template <typename T>
 class Published
 {
@@ -21,7 +21,7 @@ class Published
     };
 
 public:
-    // Keeps the value that was current at its construction alive and unchanged while it exists. [any]
+    /// Keeps the value that was current at its construction alive and unchanged while it exists. [any]
     class Reader
     {
     public:
@@ -53,14 +53,14 @@ public:
     Published(const Published&) = delete;
     Published& operator=(const Published&) = delete;
 
-    // Makes `value` the current one. Allocates. [any]
+    /// Makes `value` the current one. Allocates. [any]
     void Publish(T value)
     {
         auto* node = new Node{std::move(value), nullptr};
         Retire(mCurrent.exchange(node, std::memory_order_seq_cst));
     }
 
-    // Destroys what was replaced, unless somebody reads just now: then a later call does. [any but process]
+    /// Destroys what was replaced, unless somebody reads just now: then a later call does. [any but process]
     void FreeRetired()
     {
         Node* retired = mRetired.exchange(nullptr, std::memory_order_seq_cst);

@@ -31,10 +31,10 @@ namespace zebaudiofilterhost::vst3
 
 inline constexpr std::uint32_t kNoParameterID = 4294967295U;
 
-// One class of a VST 3 bundle as a filter, and the host that this plug-in talks to.
-//
-// A plug-in that does not come up leaves an object that is safe to use in every way and does nothing: IsInitialized
-// tells. The plug-in's references on the host faces do not count; the filter lives by its own count alone.
+/// One class of a VST 3 bundle as a filter, and the host that this plug-in talks to.
+///
+/// A plug-in that does not come up leaves an object that is safe to use in every way and does nothing: IsInitialized
+/// tells. The plug-in's references on the host faces do not count; the filter lives by its own count alone.
 class VST3AudioFilter : public AudioFilter,
                         public Steinberg::Vst::IHostApplication,
                         public Steinberg::Vst::IComponentHandler,
@@ -42,14 +42,14 @@ class VST3AudioFilter : public AudioFilter,
                         public IVST3CorvaneVendorSpecificHost
 {
 public:
-    // Makes the plug-in and everything of it. `factory` gets a reference and must not be null. A failing plug-in
-    // throws nothing. [main]
+    /// Makes the plug-in and everything of it. `factory` gets a reference and must not be null. A failing plug-in
+    /// throws nothing. [main]
     VST3AudioFilter(Steinberg::IPluginFactory* factory, const Steinberg::PClassInfo& classInfo);
 
-    // Takes the plug-in down in a fixed order. The filter must be suspended. [main]
+    /// Takes the plug-in down in a fixed order. The filter must be suspended. [main]
     ~VST3AudioFilter() override;
 
-    // Whether the plug-in came up. [any]
+    /// Whether the plug-in came up. [any]
     bool IsInitialized() const { return mInitialized; }
 
     void SetSampleRate(float sampleRate) override;
@@ -86,27 +86,28 @@ public:
     void OnUITimerTick() override;
     void FlushMessageQueue() override;
 
-    // FUnknown of all faces: the counts are no counts, each returns 1. [any]
-    Steinberg::tresult PLUGIN_API queryInterface(const Steinberg::TUID iid, void** obj) override;
+    /// FUnknown of all faces: the counts are no counts, each returns 1. [any]
+    Steinberg::tresult PLUGIN_API queryInterface(const Steinberg::TUID interfaceID, void** obj) override;
     Steinberg::uint32 PLUGIN_API addRef() override;
     Steinberg::uint32 PLUGIN_API release() override;
 
-    // IHostApplication [any]
+    /// IHostApplication [any]
     Steinberg::tresult PLUGIN_API getName(Steinberg::Vst::String128 name) override;
-    Steinberg::tresult PLUGIN_API createInstance(Steinberg::TUID cid, Steinberg::TUID iid, void** obj) override;
+    Steinberg::tresult PLUGIN_API createInstance(Steinberg::TUID classID, Steinberg::TUID interfaceID,
+                                                 void** obj) override;
 
-    // IComponentHandler [any]
+    /// IComponentHandler [any]
     Steinberg::tresult PLUGIN_API beginEdit(Steinberg::Vst::ParamID id) override;
     Steinberg::tresult PLUGIN_API performEdit(Steinberg::Vst::ParamID id, Steinberg::Vst::ParamValue value) override;
     Steinberg::tresult PLUGIN_API endEdit(Steinberg::Vst::ParamID id) override;
     Steinberg::tresult PLUGIN_API restartComponent(Steinberg::int32 flags) override;
 
-    // IUnitHandler [any]
+    /// IUnitHandler [any]
     Steinberg::tresult PLUGIN_API notifyUnitSelection(Steinberg::Vst::UnitID unitID) override;
     Steinberg::tresult PLUGIN_API notifyProgramListChange(Steinberg::Vst::ProgramListID listID,
                                                           Steinberg::int32 programIndex) override;
 
-    // IVST3CorvaneVendorSpecificHost [main]
+    /// IVST3CorvaneVendorSpecificHost [main]
     Steinberg::int32 PLUGIN_API GetUILanguage() override;
     Steinberg::int32 PLUGIN_API GetThemeXMLLength() override;
     void PLUGIN_API GetThemeXML(unsigned char* buffer) override;
@@ -114,7 +115,7 @@ public:
     const char* PLUGIN_API GetUILanguageString() override;
 
 private:
-    // Construction, in this order.
+    /// Construction, in this order.
     UTF16String ReadClassInfo(const Steinberg::PClassInfo& classInfo);
     UTF16String ReadUnicodeClassInfo(Steinberg::IPluginFactory3& factory);
     UTF16String ReadClassInfo2(Steinberg::IPluginFactory2& factory);
@@ -124,7 +125,7 @@ private:
     void FindFactoryPresets();
     void CreateEditor();
 
-    // Destruction, in this order.
+    /// Destruction, in this order.
     void ReleaseParameters();
     void DisconnectController();
     void ReleaseController();
@@ -132,7 +133,7 @@ private:
 
     Steinberg::FUnknown* HostContext();
 
-    // Buses, while suspended.
+    /// Buses, while suspended.
     void BuildIOConfiguration();
     std::vector<AudioFilterBusDescription> ReadBuses(Steinberg::Vst::BusDirection direction);
     void ActivateBuses(Steinberg::Vst::BusDirection direction, Steinberg::Vst::BusType type);
@@ -142,12 +143,16 @@ private:
     void FillProcessData();
     void FlushParameterChanges();
 
-    // Parameters.
+    /// Parameters.
     void BuildParameterInfos();
+    void TakeProgramChange(std::uint32_t id, int index);
     void FitParameterQueues();
+    void PassOutputToController();
+    boost::intrusive_ptr<VST3ParameterInfo> FindParameterInfo(int index) const;
+    bool FindParameterID(int index, std::uint32_t& id) const;
     int FindParameterIndex(Steinberg::Vst::ParamID id) const;
 
-    // The process thread's.
+    /// The process thread's.
     void UpdateProcessContext();
     void UpdateMusicalTime(const utility::Tempo& tempo);
     void PassInputSilence(ChannelFlags inFlags);

@@ -11,24 +11,24 @@
 namespace zebaudiofilterhost::vst3
 {
 
-// The view of a plug-in, and the frame that the plug-in asks for a new size or, on Linux, for an event loop. Main
-// thread only.
+/// The view of a plug-in, and the frame that the plug-in asks for a new size or, on Linux, for an event loop. Main
+/// thread only.
 class VST3AudioFilterEditor : public AudioFilterEditor, public Steinberg::IPlugFrame
 {
 public:
-    // Takes a reference on `view` and gives it this object as its frame. `controller` is not owned. Neither may be
-    // null. [main]
+    /// Takes a reference on `view` and gives it this object as its frame. `controller` is not owned. Neither may be
+    /// null. [main]
     VST3AudioFilterEditor(Steinberg::Vst::IEditController* controller, Steinberg::IPlugView* view);
     ~VST3AudioFilterEditor() override;
 
-    // Whether the view knows any type of view of this platform. [main]
+    /// Whether the view knows any type of view of this platform. [main]
     bool HasSupportedView() const;
 
-    // (left, top, width, height) in the platform's units, as the view tells now. [main]
+    /// (left, top, width, height) in the platform's units, as the view tells now. [main]
     zebcore::geom::RectT<int> GetEditorRect() const override;
 
-    // `parent` is the platform's view or window, of the best type that the view knows; a view that knows none is not
-    // attached. [main]
+    /// `parent` is the platform's view or window, of the best type that the view knows; a view that knows none is not
+    /// attached. [main]
     void Open(void* parent) override;
     void Close() override;
     void Idle() override;
@@ -37,9 +37,9 @@ public:
     bool GainFocus(bool forward) override;
     bool SetCurrentFocus() override;
 
-    // IPlugFrame: the counts are no counts, each returns 1. [main]
+    /// IPlugFrame: the counts are no counts, each returns 1. [main]
     Steinberg::tresult PLUGIN_API resizeView(Steinberg::IPlugView* view, Steinberg::ViewRect* newSize) override;
-    Steinberg::tresult PLUGIN_API queryInterface(const Steinberg::TUID iid, void** obj) override;
+    Steinberg::tresult PLUGIN_API queryInterface(const Steinberg::TUID interfaceID, void** obj) override;
     Steinberg::uint32 PLUGIN_API addRef() override;
     Steinberg::uint32 PLUGIN_API release() override;
 

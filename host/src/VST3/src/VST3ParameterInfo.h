@@ -10,12 +10,12 @@
 namespace zebaudiofilterhost::vst3
 {
 
-// One parameter of a controller. Holds a reference on the controller.
+/// One parameter of a controller. Holds a reference on the controller.
 class VST3ParameterInfo : public AudioFilterParameterInfo
 {
 public:
-    // Reads the parameter at `index` of the controller's list. A controller that fails to tell gives empty texts and
-    // the ID 0. `controller` must not be null. [main]
+    /// Reads the parameter at `index` of the controller's list. A controller that fails to tell gives empty texts and
+    /// the ID 0. `controller` must not be null. [main]
     VST3ParameterInfo(Steinberg::Vst::IEditController* controller, int index);
     ~VST3ParameterInfo() override;
 
@@ -27,10 +27,10 @@ public:
     UTF16String GetParameterString(float normalized) const override;
     int GetStepCount() const override;
 
-    // The plug-in's own number of the parameter. [any]
+    /// The plug-in's own number of the parameter. [any]
     std::uint32_t GetParameterID() const { return mParameterID; }
 
-    // The parameter's place in the controller's list. [any]
+    /// The parameter's place in the controller's list. [any]
     std::int32_t GetControllerIndex() const { return mIndex; }
 
 private:
