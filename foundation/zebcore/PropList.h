@@ -1,11 +1,11 @@
 #pragma once
 
+#include "foundation/zebcore/Export.h"
+#include "foundation/zebcore/StringTypes.h"
+
 #include <list>
 #include <memory>
 #include <vector>
-
-#include "foundation/zebcore/Export.h"
-#include "foundation/zebcore/StringTypes.h"
 
 namespace zebcore::proplist
 {

@@ -1,9 +1,9 @@
 #pragma once
 
-#include <list>
-
 #include "foundation/zebcore/Export.h"
 #include "foundation/zebcore/StringTypes.h"
+
+#include <list>
 
 namespace zebcore::proplist
 {
