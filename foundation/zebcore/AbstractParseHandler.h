@@ -1,9 +1,9 @@
 #pragma once
 
-#include <map>
-
 #include "foundation/zebcore/Export.h"
 #include "foundation/zebcore/StringTypes.h"
+
+#include <map>
 
 namespace zebcore::xml
 {
