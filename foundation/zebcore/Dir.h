@@ -1,14 +1,14 @@
 #pragma once
 
-#include <cstddef>
-#include <memory>
-#include <vector>
+#include "foundation/zebcore/Export.h"
+#include "foundation/zebcore/StringTypes.h"
 
 #include <boost/function.hpp>
 #include <boost/smart_ptr/shared_ptr.hpp>
 
-#include "foundation/zebcore/Export.h"
-#include "foundation/zebcore/StringTypes.h"
+#include <cstddef>
+#include <memory>
+#include <vector>
 
 namespace zebcore::filesupport
 {

@@ -1,10 +1,10 @@
 #pragma once
 
-#include <stdexcept>
-#include <string_view>
-
 #include "foundation/zebcore/Export.h"
 #include "foundation/zebcore/StringTypes.h"
+
+#include <stdexcept>
+#include <string_view>
 
 namespace zebcore::filesupport
 {

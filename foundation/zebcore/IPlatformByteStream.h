@@ -4,8 +4,12 @@
 #include "foundation/zebcore/File.h"
 #include "foundation/zebcore/Flags.h"
 
+#include <memory>
+
 namespace zebcore::filesupport
 {
+
+class FileDescriptor;
 
 /// A read-only stream of the bytes of a file. It belongs to one thread at a time. [any]
 class ZEB_EXPORT IPlatformByteStream
@@ -29,8 +33,7 @@ public:
     unsigned int ReadBlock(unsigned char* buffer, unsigned int count);
 
 private:
-    File mFile;
-    int mDescriptor = -1;
+    std::unique_ptr<FileDescriptor> mDescriptor; // never null
 };
 
 } // namespace zebcore::filesupport

@@ -42,7 +42,8 @@ private:
     void FlushFolder() const;
     void Discard() noexcept;
 
-    File mTarget; // with links resolved
+    File mTarget;   // with links resolved
+    bool mReplaces; // whether there is an old file
     File mTemp;
     bool mDone = false;
 };
