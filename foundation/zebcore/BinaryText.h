@@ -1,9 +1,9 @@
 #pragma once
 
-#include <vector>
-
 #include "foundation/zebcore/Export.h"
 #include "foundation/zebcore/StringTypes.h"
+
+#include <vector>
 
 /// Bytes as text, so that a plug-in's chunk can stand in a property list. The encoding is base64 of RFC 4648 section
 /// 4, with padding and without line breaks. Presets are written in it: it never changes.

@@ -1,10 +1,10 @@
 #pragma once
 
-#include <memory>
-
 #include "foundation/zebcore/Export.h"
 #include "foundation/zebcore/StringStreams.h"
 #include "foundation/zebcore/StringTypes.h"
+
+#include <memory>
 
 namespace zebcore::console
 {

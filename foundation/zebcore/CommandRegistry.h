@@ -1,15 +1,15 @@
 #pragma once
 
-#include <memory>
-#include <utility>
-#include <vector>
-
-#include <boost/function.hpp>
-
 #include "foundation/zebcore/Command.h"
 #include "foundation/zebcore/Export.h"
 #include "foundation/zebcore/StringStreams.h"
 #include "foundation/zebcore/StringTypes.h"
+
+#include <boost/function.hpp>
+
+#include <memory>
+#include <utility>
+#include <vector>
 
 namespace zebcore::console
 {
