@@ -426,6 +426,8 @@ protected:
     void UpdateChannelMapArraysForRendering();
 
 private:
+    friend class AudioFilterProxy; // Takes over the sample rate and block size of the filter that it stands in for
+
     struct RenderIndices;
 
     void TickWhileHeld();

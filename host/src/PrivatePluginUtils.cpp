@@ -1,0 +1,172 @@
+#include "utility/PrivatePluginUtils.h"
+
+#include "foundation/zebcore/CaseInsensitive.h"
+#include "foundation/zebcore/Dir.h"
+#include "foundation/zebcore/File.h"
+#include "foundation/zebcore/FileUtils.h"
+#include "foundation/zebcore/IPlatformByteStream.h"
+#include "foundation/zebcore/SafeSave.h"
+#include "foundation/zebcore/StringConversion.h"
+#include "foundation/zebcore/XmlUtils.h"
+#include "host/PluginModuleInfoManager.h"
+#include "host/PluginModuleScanner.h"
+
+namespace zebaudiofilterhost::utility
+{
+
+const UTF16String kPrivatePluginConfigResourceName = u"PrivatePluginConfig";
+const UTF16String kVSTPrivateApplicationPluginPath = u"@PRIVATEAPPLICATIONPLUGINPATH";
+const UTF16String kVST3PrivateApplicationPluginPath = u"@VST3PRIVATEAPPLICATIONPLUGINPATH";
+const UTF16String kVSTPluginExtensionPlaceholder = u"@PLUGINEXTENSION";
+const UTF16String kVST3PluginExtensionPlaceholder = u"@VST3PLUGINEXTENSION";
+const UTF16String kVSTPluginExtension = u"vst";
+const UTF16String kVST3PluginExtension = u"vst3";
+
+namespace
+{
+
+constexpr unsigned long long kMaxTextLength = 4294967294ULL; // Bytes
+
+// The block lists are not asked: what an application ships is its own affair.
+void AppendBundles(const UTF16String& directory, std::u16string_view extension, TechnologyType type,
+                   std::vector<PluginLocator>& locators)
+{
+    const Dir dir(directory);
+    if (!dir.Exists())
+    {
+        return;
+    }
+    const Dir::DirIterator end = dir.EndSubdirs();
+    for (Dir::DirIterator it = dir.BeginSubdirs(false, nullptr, {}); it != end; ++it)
+    {
+        const UTF16String path = (*it).FullPath();
+        if (zebcore::utility::CaseInsensitive::EndsWith(path, extension))
+        {
+            locators.emplace_back(type, path);
+        }
+    }
+}
+
+void ReplaceAll(UTF16String& text, const UTF16String& what, const UTF16String& with)
+{
+    if (what.empty())
+    {
+        return;
+    }
+    for (std::size_t at = text.find(what); at != UTF16String::npos; at = text.find(what, at + with.size()))
+    {
+        text.replace(at, what.size(), with);
+    }
+}
+
+UTF16String Escaped(const UTF16String& text)
+{
+    UTF16String escaped;
+    zebcore::xml::utils::EncodeReservedCharacters(text, escaped);
+    return escaped;
+}
+
+void Scan(const std::vector<PluginLocator>& locators)
+{
+    const boost::intrusive_ptr<PluginModuleScanner> scanner(new PluginModuleScanner(locators, true));
+    scanner->BeginScan();
+    PluginLocator locator;
+    UTF16String detail;
+    int current = 0;
+    int total = 0;
+    while (scanner->GetCurrentProgressInfo(locator, detail, current, total))
+    {
+        scanner->ContinueScan();
+    }
+}
+
+// Works on the text alone: a name that happens to hold "vst" is replaced too, and comes back when the text is read.
+void PutPlaceholders(UTF16String& text, const UTF16String& vstDirectory, const UTF16String& vst3Directory)
+{
+    if (!vst3Directory.empty())
+    {
+        ReplaceAll(text, Escaped(vst3Directory), kVST3PrivateApplicationPluginPath);
+        ReplaceAll(text, kVST3PluginExtension, kVST3PluginExtensionPlaceholder);
+    }
+    if (!vstDirectory.empty())
+    {
+        ReplaceAll(text, Escaped(vstDirectory), kVSTPrivateApplicationPluginPath);
+        ReplaceAll(text, kVSTPluginExtension, kVSTPluginExtensionPlaceholder);
+    }
+}
+
+void WriteWhole(const UTF16String& path, const UTF16String& text)
+{
+    File file(path);
+    zebcore::filesupport::SafeSave save(file);
+    zebcore::utility::FileUtils::SimpleWriteStringToFile(save.GetTempFile().FullPath(),
+                                                         zebcore::utility::UTF16to8(text));
+    save.Commit();
+}
+
+} // namespace
+
+void BuildPrivatePluginConfig(const UTF16String& resultPath, const UTF16String& vstDirectory,
+                              const UTF16String& vst3Directory)
+{
+    PluginModuleInfoManager& manager = PluginModuleInfoManager::GetInstance();
+    manager.ClearAll(true);
+
+    std::vector<PluginLocator> locators;
+    AppendBundles(vstDirectory, u".vst", kTechnologyVST, locators);
+    if (!vst3Directory.empty())
+    {
+        AppendBundles(vst3Directory, u".vst3", kTechnologyVST3, locators);
+    }
+    if (!locators.empty())
+    {
+        Scan(locators);
+    }
+
+    const UTF8String configuration = manager.GetConfigurationAsXML();
+    UTF16String text = zebcore::utility::UTF8to16(configuration, nullptr, nullptr);
+    PutPlaceholders(text, vstDirectory, vst3Directory);
+    WriteWhole(resultPath, text);
+
+    manager.SetPrivatePluginConfiguration(configuration);
+    File settings(Dir::PrefDir(), manager.GetSettingsFileName());
+    manager.LoadConfiguration(settings);
+}
+
+void SetPrivatePluginConfig(const UTF16String& text, const UTF16String& vst3Directory,
+                            const UTF16String& vstDirectory)
+{
+    if (text.empty())
+    {
+        return;
+    }
+    UTF16String filled = text;
+    ReplaceAll(filled, kVST3PrivateApplicationPluginPath, Escaped(vst3Directory));
+    ReplaceAll(filled, kVST3PluginExtensionPlaceholder, kVST3PluginExtension);
+    ReplaceAll(filled, kVSTPrivateApplicationPluginPath, Escaped(vstDirectory));
+    ReplaceAll(filled, kVSTPluginExtensionPlaceholder, kVSTPluginExtension);
+    PluginModuleInfoManager::GetInstance().SetPrivatePluginConfiguration(zebcore::utility::UTF16to8(filled));
+}
+
+void SetPrivatePluginConfigFromFile(const UTF16String& path, const UTF16String& vst3Directory,
+                                    const UTF16String& vstDirectory)
+{
+    const File file(path);
+    if (!file.Exists())
+    {
+        return;
+    }
+    using zebcore::filesupport::IPlatformByteStream;
+    IPlatformByteStream stream(file, zebcore::utility::Flags<unsigned int>(IPlatformByteStream::kOpenForReading));
+    const unsigned long long length = stream.Length();
+    if (length == 0 || length > kMaxTextLength)
+    {
+        return;
+    }
+    std::vector<unsigned char> bytes(static_cast<std::size_t>(length));
+    bytes.resize(stream.ReadBlock(bytes.data(), static_cast<unsigned int>(length)));
+    const UTF8String text(bytes.begin(), bytes.end());
+    SetPrivatePluginConfig(zebcore::utility::UTF8to16(text, nullptr, nullptr), vst3Directory, vstDirectory);
+}
+
+} // namespace zebaudiofilterhost::utility
