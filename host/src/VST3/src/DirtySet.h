@@ -23,7 +23,7 @@ public:
     /// [any]
     void Add(std::size_t number);
 
-    /// Takes one number out. Who also adds it at the same time keeps it in. [any]
+    /// Takes one number out, unless it is added at the same time. Others can be out of sight meanwhile. [any]
     void Remove(std::size_t number);
 
     /// False means empty. [any]
