@@ -68,20 +68,20 @@ ZEB_EXPORT void WriteTraceLine(const char* category, const UTF8String& message);
 
 } // namespace zebcore::debug
 
-#define ZEB_TRACE_POINT_(category, mayWait, message)                                                                 \
+#define ZEB_TRACE_POINT_(category, mayWait, ...)                                                                     \
     do                                                                                                               \
     {                                                                                                                \
         static constinit ::zebcore::debug::TracePoint sTracePoint;                                                   \
         if (::zebcore::debug::IsTracePointEnabled(sTracePoint, category, mayWait)) [[unlikely]]                      \
         {                                                                                                            \
             ::zebcore::utility::oUTF8StringStream traceMessage_;                                                     \
-            traceMessage_ << message;                                                                                \
+            traceMessage_ << __VA_ARGS__;                                                                            \
             ::zebcore::debug::WriteTraceLine(category, traceMessage_.str());                                         \
         }                                                                                                            \
     } while (false)
 
 /// A trace point: ZEB_TRACE("VST3", "Path:" << path). The message is not evaluated unless its category traces. The
 /// category is a string literal.
-#define ZEB_TRACE(category, message) ZEB_TRACE_POINT_(category, true, message)
+#define ZEB_TRACE(category, ...) ZEB_TRACE_POINT_(category, true, __VA_ARGS__)
 /// The same for the two sites on the process path.
-#define ZEB_TRACE_REALTIME(category, message) ZEB_TRACE_POINT_(category, false, message)
+#define ZEB_TRACE_REALTIME(category, ...) ZEB_TRACE_POINT_(category, false, __VA_ARGS__)
