@@ -58,6 +58,8 @@ tresult PLUGIN_API PluginFactory::queryInterface(const TUID id, void** object)
         FUnknownPrivate::iidEqual(id, FUnknown::iid) || FUnknownPrivate::iidEqual(id, IPluginFactory::iid) ||
         (mDescription.level >= FactoryLevel::kSubCategories && FUnknownPrivate::iidEqual(id, IPluginFactory2::iid)) ||
         (mDescription.level >= FactoryLevel::kUnicode && FUnknownPrivate::iidEqual(id, IPluginFactory3::iid));
+    if (known)
+        addRef();
     *object = known ? static_cast<IPluginFactory3*>(this) : nullptr;
     return known ? kResultOk : kNoInterface;
 }

@@ -1,0 +1,9 @@
+// Promises 2147483647 buses, parameters, units, program lists and programs.
+#include "tests/plugins/support/Behaviour.h"
+
+void fixture::Vary(Behaviour& behaviour)
+{
+    for (const Knob knob : {Knob::kBusCount, Knob::kParameterCount, Knob::kUnitCount, Knob::kProgramListCount,
+                            Knob::kProgramCount, Knob::kParameterStepCount})
+        behaviour[knob] = 2147483647;
+}

@@ -1,0 +1,6 @@
+// Behaves, but exports neither entry nor exit.
+#include "tests/plugins/support/Behaviour.h"
+
+void fixture::Vary(Behaviour&)
+{
+}

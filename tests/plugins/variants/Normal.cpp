@@ -1,0 +1,6 @@
+// Behaves, with a bit of everything: what the others differ from.
+#include "tests/plugins/support/Behaviour.h"
+
+void fixture::Vary(Behaviour&)
+{
+}
