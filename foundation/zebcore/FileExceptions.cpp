@@ -2,6 +2,7 @@
 
 #include "foundation/zebcore/StringConversion.h"
 
+#include <algorithm>
 #include <string>
 #include <system_error>
 
@@ -11,10 +12,18 @@ namespace zebcore::filesupport
 namespace
 {
 
+// The sentence goes to logs and terminals, and ends at a zero unit.
+std::string WithoutControls(std::string text)
+{
+    std::replace_if(
+        text.begin(), text.end(), [](char unit) { return (unit >= 0 && unit < ' ') || unit == '\x7F'; }, '?');
+    return text;
+}
+
 std::string Sentence(std::string_view action, const UTF16String& path, std::string_view reason)
 {
     std::string sentence(action);
-    sentence.append(" '").append(utility::NarrowFromUTF16(path)).append("': ").append(reason);
+    sentence.append(" '").append(WithoutControls(utility::NarrowFromUTF16(path))).append("': ").append(reason);
     return sentence;
 }
 
