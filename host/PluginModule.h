@@ -36,8 +36,8 @@ public:
     static void SetThemeXML(const UTF8String& theme);
     static const UTF8String& GetThemeXML();
 
-    /// Why the last attempt to load the plug-in at this path failed: a sentence for the user that names the file. Empty
-    /// if it succeeded or there was none.
+    /// Why the last attempt to load the plug-in at this path failed: a sentence for the user that names the file.
+    /// Empty if it succeeded or there was none.
     static UTF16String GetLoadProblem(const UTF16String& path);
     /// What a technology's Load tells of its result; an empty text forgets the path.
     static void SetLoadProblem(const UTF16String& path, const UTF16String& problem);

@@ -49,7 +49,7 @@ public:
     /// Emitted after the records have changed; slots run in the thread of the change.
     PluginInfosChangedSignal& GetPluginInfosChangedSignal();
     /// Null if there is no record.
-    PluginInfoPtr FindPluginInfo(PluginLocator locator) const;
+    PluginInfoPtr FindPluginInfo(const PluginLocator& locator) const;
     /// Both in locator order.
     std::vector<PluginLocator> GetPluginLocators() const;
     std::vector<PluginLocator> GetEnabledPlugins() const;

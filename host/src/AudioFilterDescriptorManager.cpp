@@ -47,7 +47,7 @@ void AudioFilterDescriptorManager::AddAudioFilterDescriptor(DescriptorPtr descri
         }
     }
     mDescriptors.push_back(descriptor);
-    mDescriptorMap.emplace(descriptor->GetUniqueID(), descriptor);
+    mDescriptorMap.emplace(descriptor->GetUniqueID(), std::move(descriptor));
 }
 
 AudioFilterDescriptorManager::DescriptorPtr

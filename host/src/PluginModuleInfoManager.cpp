@@ -25,7 +25,8 @@ void PluginModuleInfoManager::AddPluginTechnology(TechnologyPtr technology)
 {
     if (technology)
     {
-        mTechnologies.emplace(technology->GetType(), technology);
+        const TechnologyType type = technology->GetType();
+        mTechnologies.emplace(type, std::move(technology));
     }
 }
 
@@ -51,17 +52,14 @@ void PluginModuleInfoManager::AddPluginModuleInfo(PluginInfoPtr info)
     {
         return;
     }
-    const PluginLocator locator = info->GetLocator();
-    if (mInfos.erase(locator) != 0)
+    const auto known = mInfos.find(info->GetLocator());
+    if (known != mInfos.end())
     {
-        const auto found = std::find_if(mInfosInOrder.begin(), mInfosInOrder.end(),
-                                        [&locator](const auto& known) { return known->GetLocator() == locator; });
-        if (found != mInfosInOrder.end())
-        {
-            mInfosInOrder.erase(found);
-        }
+        // The map and the vector hold the same objects, so the pointer finds the entry of the locator.
+        mInfosInOrder.erase(std::find(mInfosInOrder.begin(), mInfosInOrder.end(), known->second));
+        mInfos.erase(known);
     }
-    mInfos.emplace(locator, info);
+    mInfos.emplace(info->GetLocator(), info);
     mInfosInOrder.push_back(std::move(info));
     mPluginInfosChangedSignal();
 }
@@ -81,7 +79,7 @@ PluginModuleInfoManager::PluginInfosChangedSignal& PluginModuleInfoManager::GetP
     return mPluginInfosChangedSignal;
 }
 
-PluginModuleInfoManager::PluginInfoPtr PluginModuleInfoManager::FindPluginInfo(PluginLocator locator) const
+PluginModuleInfoManager::PluginInfoPtr PluginModuleInfoManager::FindPluginInfo(const PluginLocator& locator) const
 {
     const auto found = mInfos.find(locator);
     return found == mInfos.end() ? PluginInfoPtr() : found->second;

@@ -76,12 +76,13 @@ void PluginModuleInfoManager::ReadPluginInfos(const PropList& list, PluginInfoMa
             continue;
         }
         const PluginInfoPtr info(new PluginModuleInfo(*section));
-        PluginInfoPtr& known = infos[info->GetLocator()];
-        if (known)
+        const auto known = infos.find(info->GetLocator());
+        if (known != infos.end())
         {
-            replaced.insert(known);
+            replaced.insert(known->second);
+            infos.erase(known);
         }
-        known = info;
+        infos.emplace(info->GetLocator(), info);
         order.push_back(info);
     }
     std::erase_if(order, [&replaced](const PluginInfoPtr& info) { return replaced.count(info) != 0; });

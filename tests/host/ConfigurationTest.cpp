@@ -1,12 +1,15 @@
 #include "foundation/zebcore/FileExceptions.h"
 #include "foundation/zebcore/PropListUtils.h"
+#include "foundation/zebcore/internal/FileSystemCalls.h"
 #include "host/AudioFilterDescriptorManager.h"
+#include "host/BannedPluginManager.h"
 #include "host/PluginModuleInfoManager.h"
 #include "tests/host/FakeTechnology.h"
 
 #include <boost/signals2/connection.hpp>
 #include <gtest/gtest.h>
 
+#include <cerrno>
 #include <string>
 #include <vector>
 
@@ -56,6 +59,24 @@ void PutRecord(PropList& list, const UTF8String& key, const PluginLocator& locat
     PluginModuleInfo(locator, name, u"V", 1, locator.GetTechnologyType(), true, false)
         .Write(list.GetOrCreateSubList(key));
 }
+
+/// While it lives, no file can be moved over another.
+class FailingRename
+{
+public:
+    explicit FailingRename(int error)
+    {
+        zebcore::filesupport::FileSystem().mRename = [error](const char*, const char*)
+        {
+            errno = error;
+            return -1;
+        };
+    }
+    ~FailingRename() { zebcore::filesupport::FileSystem() = {}; }
+
+    FailingRename(const FailingRename&) = delete;
+    FailingRename& operator=(const FailingRename&) = delete;
+};
 
 UTF8String DescriptorsAsText(const std::vector<DescriptorPtr>& descriptors)
 {
@@ -343,10 +364,25 @@ TEST_F(ConfigurationTest, AddingMergesRecordsByTheLaterAndDescriptorsByTheEarlie
     EXPECT_EQ(RecordPaths(), (Strings{"/b", "/a"}));
 }
 
-TEST_F(ConfigurationTest, SavingIntoNowherePassesTheErrorOn)
+TEST_F(ConfigurationTest, FileThatTheSystemKeepsEndsTheSaveSilentlyAndStays)
 {
-    File file = FileInFolder("no/such/folder/settings.xml");
-    EXPECT_THROW(mManager.SaveConfiguration(file, true), zebcore::filesupport::file_exception);
+    File file = FileInFolder("settings.xml");
+    mManager.SaveConfiguration(file, true);
+    mManager.AddPluginModuleInfo(MakeInfo(VST3(u"/a")));
+    {
+        const FailingRename refused(EPERM);
+        EXPECT_NO_THROW(mManager.SaveConfiguration(file, true));
+        EXPECT_THROW(BannedPluginManager::GetInstance().SaveConfiguration(file),
+                     zebcore::filesupport::file_delete_exception);
+    }
+    {
+        const FailingRename full(ENOSPC);
+        EXPECT_THROW(mManager.SaveConfiguration(file, true), zebcore::filesupport::file_exception);
+    }
+    File nowhere = FileInFolder("no/such/folder/settings.xml");
+    EXPECT_THROW(mManager.SaveConfiguration(nowhere, true), zebcore::filesupport::file_exception);
+    mManager.LoadConfiguration(file);
+    EXPECT_TRUE(RecordPaths().empty());
 }
 
 TEST_F(ConfigurationTest, ResetReachesEveryTechnology)
