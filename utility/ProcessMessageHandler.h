@@ -70,6 +70,7 @@ private:
     std::array<boost::intrusive_ptr<Message>, kRingSize> mRing;
     MessageList mMessages; // All living messages, in order of posting; main thread only
     std::atomic<bool> mProcessing;
+    bool mRunningMainStages = false; // Main thread only
 };
 
 } // namespace zebaudiofilterhost

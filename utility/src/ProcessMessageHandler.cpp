@@ -9,6 +9,24 @@
 namespace zebaudiofilterhost
 {
 
+namespace
+{
+
+class FlagWhileAlive
+{
+public:
+    explicit FlagWhileAlive(bool& flag) : mFlag(flag) { mFlag = true; }
+    ~FlagWhileAlive() { mFlag = false; }
+
+    FlagWhileAlive(const FlagWhileAlive&) = delete;
+    FlagWhileAlive& operator=(const FlagWhileAlive&) = delete;
+
+private:
+    bool& mFlag;
+};
+
+} // namespace
+
 ProcessMessageHandler::ProcessMessageHandler() : mWriteIndex(0), mReadIndex(0), mProcessing(false)
 {
 }
@@ -73,6 +91,9 @@ bool ProcessMessageHandler::PushToRing(const boost::intrusive_ptr<Message>& mess
 
 void ProcessMessageHandler::RunMainStages()
 {
+    if (mRunningMainStages) // A stage that flushes must not be entered a second time; the outer loop does the rest
+        return;
+    const FlagWhileAlive running(mRunningMainStages);
     // By index and with a reference: a stage may post, which moves the list, or flush, which shortens it.
     for (std::size_t i = 0; i < mMessages.size(); ++i)
     {
