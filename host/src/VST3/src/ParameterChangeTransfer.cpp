@@ -39,8 +39,9 @@ bool ReadQueue(ParameterChangeTable& table, Steinberg::Vst::IParamValueQueue& qu
 } // namespace
 
 ParameterChangeTransfer::ParameterChangeTransfer()
-    : mTable(std::make_unique<ParameterChangeTable>(std::vector<ParamID>()))
 {
+    mTable.Publish(std::make_unique<ParameterChangeTable>(std::vector<ParamID>()));
+    mTable.FreeRetired();
 }
 
 void ParameterChangeTransfer::SetParameterIDs(const std::vector<ParamID>& ids)
@@ -50,33 +51,42 @@ void ParameterChangeTransfer::SetParameterIDs(const std::vector<ParamID>& ids)
     sorted.erase(std::unique(sorted.begin(), sorted.end()), sorted.end());
     {
         // Plug-ins that announce new values or titles rarely have new IDs: the rings can stay.
-        const Access table(mTable);
-        if (table->GetIDs() == sorted)
+        const Table::Reader reader(mTable);
+        ParameterChangeTable& table = **reader;
+        if (table.GetIDs() == sorted)
         {
-            table->DiscardAll();
+            table.DiscardAll();
             return;
         }
     }
     mTable.Publish(std::make_unique<ParameterChangeTable>(std::move(sorted)));
 }
 
+void ParameterChangeTransfer::FreeRetired()
+{
+    mTable.FreeRetired();
+}
+
 void ParameterChangeTransfer::AddChange(ParamID id, double value, int32 sampleOffset)
 {
-    const Access table(mTable);
-    table->Write(id, {value, sampleOffset});
+    const Table::Reader reader(mTable);
+    ParameterChangeTable& table = **reader;
+    table.Write(id, {value, sampleOffset});
 }
 
 bool ParameterChangeTransfer::HasChanges() const
 {
-    const Access table(mTable);
-    return table->MayHaveChanges();
+    const Table::Reader reader(mTable);
+    ParameterChangeTable& table = **reader;
+    return table.MayHaveChanges();
 }
 
 bool ParameterChangeTransfer::GetNextChange(ParamID id, double& value, int32& sampleOffset)
 {
-    const Access table(mTable);
+    const Table::Reader reader(mTable);
+    ParameterChangeTable& table = **reader;
     ParameterQueueValue change;
-    if (!table->Read(id, change))
+    if (!table.Read(id, change))
         return false;
     value = change.mValue;
     sampleOffset = change.mSampleOffset;
@@ -85,9 +95,10 @@ bool ParameterChangeTransfer::GetNextChange(ParamID id, double& value, int32& sa
 
 bool ParameterChangeTransfer::TransferChangesTo(ParameterChanges& changes)
 {
-    const Access table(mTable);
+    const Table::Reader reader(mTable);
+    ParameterChangeTable& table = **reader;
     bool any = false;
-    table->TakeAll(
+    table.TakeAll(
         [&](ParamID id, const ParameterQueueValue& value)
         {
             AppendTo(changes, id, value);
@@ -98,12 +109,13 @@ bool ParameterChangeTransfer::TransferChangesTo(ParameterChanges& changes)
 
 bool ParameterChangeTransfer::TransferChangesFrom(ParameterChanges& changes)
 {
-    const Access table(mTable);
+    const Table::Reader reader(mTable);
+    ParameterChangeTable& table = **reader;
     bool any = false;
     for (int32 index = 0; index < changes.getParameterCount(); ++index)
     {
         if (Steinberg::Vst::IParamValueQueue* queue = changes.getParameterData(index))
-            any = ReadQueue(*table, *queue) || any;
+            any = ReadQueue(table, *queue) || any;
     }
     return any;
 }
@@ -114,11 +126,13 @@ void ParameterChangeTransfer::CopyTo(ParameterChangeTransfer& other) const
         return;
     std::unique_ptr<ParameterChangeTable> copy;
     {
-        const Access table(mTable);
-        copy = std::make_unique<ParameterChangeTable>(table->GetIDs());
-        table->CopyTo(*copy);
+        const Table::Reader reader(mTable);
+        ParameterChangeTable& table = **reader;
+        copy = std::make_unique<ParameterChangeTable>(table.GetIDs());
+        table.CopyTo(*copy);
     }
     other.mTable.Publish(std::move(copy));
+    other.FreeRetired();
 }
 
 } // namespace zebaudiofilterhost::vst3

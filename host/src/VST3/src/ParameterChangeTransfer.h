@@ -2,23 +2,24 @@
 
 #include "host/src/VST3/src/ParameterChangeTable.h"
 #include "host/src/VST3/src/ParameterChanges.h"
-#include "host/src/VST3/src/SharedTable.h"
+#include "host/src/VST3/src/Published.h"
 
 #include <pluginterfaces/vst/vsttypes.h>
 
+#include <memory>
 #include <vector>
 
 namespace zebaudiofilterhost::vst3
 {
 
 /// A mailbox of parameter changes between threads: for each known ID the newest kMaxPointsPerParameter changes. Any
-/// number of threads may write while one reads and another gives it new IDs. Nothing here locks or allocates but
-/// SetParameterIDs and CopyTo.
-//
+/// number of threads may write while one reads and another gives it new IDs. Nothing here locks, and nothing
+/// allocates but SetParameterIDs and CopyTo.
+///
 /// How it holds together:
-/// - The shape (which IDs there are) is a ParameterChangeTable that never changes after it is published. SharedTable
-///   publishes it and decides when a replaced one may go. A write into a replaced table is lost, as every pending
-///   change is when the shape changes.
+/// - The shape (which IDs there are) is a ParameterChangeTable that never changes after it was published as a whole.
+/// A
+///   write into a replaced table is lost, as every pending change is when the shape changes.
 /// - Each ID has a ParameterRing. A writer takes a ticket and writes words that carry the ticket, so that a value and
 ///   an offset of two writers never mix, and a writer that was held up cannot harm what came after it.
 /// - A DirtySet knows which rings were written, so that a block costs what changes in it, whatever the number of
@@ -53,13 +54,13 @@ public:
     /// suspended]
     bool TransferChangesFrom(ParameterChanges& changes);
 
-    /// Gives `other` these IDs and a copy of what is pending here. [any], allocates
+    /// Gives `other` these IDs and a copy of what is pending here. Allocates. [any but process]
     void CopyTo(ParameterChangeTransfer& other) const;
 
 private:
-    using Access = SharedTable<ParameterChangeTable>::Access;
+    using Table = Published<std::unique_ptr<ParameterChangeTable>>;
 
-    SharedTable<ParameterChangeTable> mTable;
+    Table mTable; // never holds null after construction
 };
 
 } // namespace zebaudiofilterhost::vst3
