@@ -48,7 +48,7 @@ std::string Read(VST3MemoryStream& stream, int32 count)
 
 void SeekTo(VST3MemoryStream& stream, int64 position)
 {
-    int64 result = position + 1;
+    int64 result = ~position;
     EXPECT_EQ(stream.seek(position, Steinberg::IBStream::kIBSeekSet, &result), Steinberg::kResultOk);
     EXPECT_EQ(result, position);
 }

@@ -17,8 +17,7 @@ namespace zebaudiofilterhost::vst3
 /// allocates but SetParameterIDs and CopyTo.
 ///
 /// How it holds together:
-/// - The shape (which IDs there are) is a ParameterChangeTable that never changes after it was published as a whole.
-/// A
+/// - The shape (which IDs there are) is a ParameterChangeTable, published as a whole and never changed after that. A
 ///   write into a replaced table is lost, as every pending change is when the shape changes.
 /// - Each ID has a ParameterRing. A writer takes a ticket and writes words that carry the ticket, so that a value and
 ///   an offset of two writers never mix, and a writer that was held up cannot harm what came after it.
@@ -33,14 +32,17 @@ public:
     ParameterChangeTransfer(const ParameterChangeTransfer&) = delete;
     ParameterChangeTransfer& operator=(const ParameterChangeTransfer&) = delete;
 
-    /// Repeated IDs count once. What was pending is dropped. Safe while other threads read and write. [any],
-    /// allocates
+    /// Repeated IDs count once. What was pending is dropped. Allocates. [any]
     void SetParameterIDs(const std::vector<Steinberg::Vst::ParamID>& ids);
+
+    /// Frees what SetParameterIDs and CopyTo replaced, unless another thread is in here just now: then a later call
+    /// does. [any but process]
+    void FreeRetired();
 
     /// An unknown ID is ignored; a full ring loses its oldest change. [any]
     void AddChange(Steinberg::Vst::ParamID id, double value, Steinberg::int32 sampleOffset);
 
-    /// False when nothing is pending, at the cost of one load. Can be true once without reason. [any]
+    /// False when nothing is pending; cheap however many IDs there are. Can be true once without reason. [any]
     bool HasChanges() const;
 
     /// Takes the oldest change of the ID out. False, with nothing written, when there is none. [any], one at a time
@@ -50,8 +52,8 @@ public:
     /// [main, suspended]
     bool TransferChangesTo(ParameterChanges& changes);
 
-    /// Reads all points; those of unknown IDs are lost. True if a point could be read. [process], or [main,
-    /// suspended]
+    /// Reads all points; those of unknown IDs are lost. True if a point could be read. [process], or
+    /// [main, suspended]
     bool TransferChangesFrom(ParameterChanges& changes);
 
     /// Gives `other` these IDs and a copy of what is pending here. Allocates. [any but process]

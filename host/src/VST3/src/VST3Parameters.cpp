@@ -149,6 +149,8 @@ void VST3AudioFilter::OnUITimerTick()
 {
     AudioFilter::OnUITimerTick();
     mParameters.FreeRetired();
+    mInputTransfer.FreeRetired();
+    mOutputTransfer.FreeRetired();
     if (mVendorEffect && mVendorEffect->IsDirty())
         BumpParameterDirtyCount();
     if (mController)
