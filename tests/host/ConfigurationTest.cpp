@@ -292,6 +292,7 @@ TEST_F(ConfigurationTest, DirectoriesOfUnknownTechnologiesAndEmptyOnesAreSkipped
     vst.SetValue(u8"tech_type", 2);
     vst.SetValue(u8"num_directories", 2147483647);
     vst.SetValue(u8"directories0", u"/one");
+    vst.SetValue(u8"directories00", u"/not the way we count");
     vst.SetValue(u8"directories1", u"");
     vst.SetValue(u8"directories7", u"/seven");
     mManager.ReadDirectories(list);

@@ -60,7 +60,7 @@ void FakeScanContext::SetPluginLocators(const std::vector<PluginLocator>& locato
 
 bool FakeScanContext::GetCurrentProgressInfo(PluginLocator& locator, UTF16String& detail, unsigned long& index) const
 {
-    if (mPosition >= mLocators.size())
+    if (mPosition >= mLocators.size() || !FakeMachine::GetInstance().tellsProgress)
     {
         return false;
     }

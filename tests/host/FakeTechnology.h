@@ -30,6 +30,7 @@ struct FakeMachine
 {
     std::vector<FakePlugin> plugins;
     std::vector<std::string> log;
+    bool tellsProgress = true;
 
     FakePlugin* Find(const PluginLocator& locator);
     static FakeMachine& GetInstance();

@@ -152,6 +152,17 @@ TEST_F(PluginModuleScannerTest, ExceptionInTheNextTechnologyKeepsTheFinishedShar
     EXPECT_EQ(Announced(*scanner), "2/2 3:/b");
 }
 
+TEST_F(PluginModuleScannerTest, ContextThatTellsNothingEndsTheScanOnlyIfItIsTheLast)
+{
+    mMachine.plugins = {{VST2(u"/a")}, {VST3(u"/b"), true, {{u"3:1"}, {u"3:2"}}}};
+    mMachine.tellsProgress = false;
+    const ScannerPtr scanner = Begin({VST2(u"/a"), VST3(u"/b")});
+    EXPECT_EQ(Announced(*scanner), "1/2 0:untoucheduntouched");
+    EXPECT_TRUE(scanner->ContinueScan());
+    EXPECT_EQ(Announced(*scanner), "");
+    EXPECT_FALSE(scanner->ContinueScan());
+}
+
 TEST_F(PluginModuleScannerTest, DroppedScanForgetsThePluginInProgress)
 {
     mMachine.plugins = {{VST3(u"/a"), true, {{u"3:1"}, {u"3:2"}}}};
