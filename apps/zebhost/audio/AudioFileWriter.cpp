@@ -1,0 +1,111 @@
+#include "audio/AudioFileWriter.h"
+
+#include "cli/Failure.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace zebhost
+{
+
+AudioFileWriter::AudioFileWriter(const std::string& path, bool overwrite, const SampleFormat& format,
+                                 const AudioFileReader& like)
+    : mOutput(path, overwrite), mFormat(format), mChannels(like.Channels())
+{
+    SF_INFO info{};
+    info.channels = mChannels;
+    info.samplerate = like.SampleRate();
+    info.format = format.Code();
+    mFile.reset(sf_open_fd(mOutput.Descriptor(), SFM_WRITE, &info, SF_FALSE));
+    if (mFile == nullptr)
+    {
+        throw Failure(ExitCode::FileTrouble, path + " cannot be written (" + sf_strerror(nullptr) +
+                                                 "): choose another kind of file, such as .wav");
+    }
+    CopyHead(like);
+}
+
+void AudioFileWriter::CopyHead(const AudioFileReader& like)
+{
+    sf_command(mFile.get(), SFC_SET_CLIPPING, nullptr, SF_TRUE);
+    std::vector<int> codes = like.ChannelCodes();
+    if (!codes.empty())
+    {
+        sf_command(mFile.get(), SFC_SET_CHANNEL_MAP_INFO, codes.data(), static_cast<int>(codes.size() * sizeof(int)));
+    }
+    for (const auto& [kind, text] : like.Texts())
+    {
+        sf_set_string(mFile.get(), kind, text.c_str());
+    }
+}
+
+void AudioFileWriter::Write(const float* const* channels, int firstFrame, int frames)
+{
+    const auto rows = static_cast<std::size_t>(mChannels);
+    const auto count = static_cast<std::size_t>(frames);
+    mInterleaved.resize(rows * count);
+    for (std::size_t row = 0; row < rows; ++row)
+    {
+        for (std::size_t frame = 0; frame < count; ++frame)
+        {
+            mInterleaved[frame * rows + row] = channels[row][static_cast<std::size_t>(firstFrame) + frame];
+        }
+    }
+    Measure();
+    if (mFormat.IntegerBits() == 0)
+    {
+        Count(sf_writef_float(mFile.get(), mInterleaved.data(), frames), frames);
+        return;
+    }
+    mIntegers.resize(mInterleaved.size());
+    std::transform(mInterleaved.begin(), mInterleaved.end(), mIntegers.begin(),
+                   [this](float value) { return ToInteger(value); });
+    Count(sf_writef_int(mFile.get(), mIntegers.data(), frames), frames);
+}
+
+void AudioFileWriter::Measure()
+{
+    for (float& sample : mInterleaved)
+    {
+        if (!std::isfinite(sample))
+        {
+            sample = 0;
+            ++mBroken;
+        }
+        mPeak = std::max(mPeak, std::abs(sample));
+    }
+}
+
+// libsndfile takes integers of any size at the top of 32 bits.
+int AudioFileWriter::ToInteger(float value)
+{
+    const int bits = mFormat.IntegerBits();
+    const double full = std::ldexp(1.0, bits - 1);
+    const double rounded = std::nearbyint(static_cast<double>(value) * full);
+    // A float of exactly 1 is one step too many, which nobody means by clipping.
+    mClipped += rounded > full || rounded < -full ? 1 : 0;
+    const double bounded = std::clamp(rounded, -full, full - 1);
+    return static_cast<int>(static_cast<std::int64_t>(bounded) * (std::int64_t{1} << (32 - bits)));
+}
+
+void AudioFileWriter::Count(std::int64_t written, int frames)
+{
+    if (written != frames)
+    {
+        throw Failure(ExitCode::FileTrouble, mOutput.Path() + " could not be written to the end (" +
+                                                 sf_strerror(mFile.get()) + "): make room on the disk");
+    }
+    mFrames += written;
+}
+
+void AudioFileWriter::Finish()
+{
+    SNDFILE* file = mFile.release();
+    if (sf_close(file) != 0)
+    {
+        throw Failure(ExitCode::FileTrouble, mOutput.Path() + " could not be completed: make room on the disk");
+    }
+    mOutput.Commit();
+}
+
+} // namespace zebhost

@@ -1,0 +1,226 @@
+#include "catalogue/Catalogue.h"
+
+#include "cli/Failure.h"
+#include "output/PrintableText.h"
+
+#include <foundation/zebcore/FileExceptions.h>
+#include <foundation/zebcore/NativePath.h>
+#include <foundation/zebcore/PropListUtils.h>
+#include <host/AudioFilterDescriptor.h>
+#include <host/BannedPluginManager.h>
+#include <host/PluginModuleInfoManager.h>
+
+#include <algorithm>
+#include <iterator>
+
+namespace zebhost
+{
+
+using zebaudiofilterhost::AudioFilterDescriptorManager;
+using zebaudiofilterhost::BannedPluginManager;
+using zebaudiofilterhost::PluginLocator;
+using zebaudiofilterhost::PluginModuleInfoManager;
+using zebcore::filesupport::File;
+using zebcore::filesupport::file_exception;
+
+namespace
+{
+
+constexpr unsigned int kSettingsVersion = 2;
+constexpr unsigned int kBlockListVersion = 1;
+
+// Runs a step on files of the settings folder; their trouble is the user's to mend.
+template <typename Step>
+void WithFiles(const Step& step)
+{
+    try
+    {
+        step();
+    }
+    catch (const file_exception& error)
+    {
+        throw Failure(ExitCode::FileTrouble, std::string(error.what()) +
+                                                 ": make it readable and writable, or name another folder with "
+                                                 "--settings");
+    }
+    catch (const std::filesystem::filesystem_error& error)
+    {
+        throw Failure(ExitCode::FileTrouble, std::string(error.what()) + ": name another folder with --settings");
+    }
+}
+
+bool IsCatalogueEmpty()
+{
+    const PluginModuleInfoManager& infos = PluginModuleInfoManager::GetInstance();
+    return infos.PluginInfoBegin() == infos.PluginInfoEnd() &&
+           AudioFilterDescriptorManager::GetInstance().GetExternalInfos().empty();
+}
+
+std::filesystem::path FreeName(const std::filesystem::path& path)
+{
+    for (int number = 1;; ++number)
+    {
+        std::filesystem::path candidate = path;
+        candidate += ".damaged-" + std::to_string(number);
+        if (!std::filesystem::exists(std::filesystem::symlink_status(candidate)))
+        {
+            return candidate;
+        }
+    }
+}
+
+bool IsOnPermanentList(const PluginLocator& locator)
+{
+    // The texts that a VST 3 scan looks its plug-ins up with.
+    return BannedPluginManager::GetInstance().IsPluginBannedStatically(File(locator.GetPath()).GetName(), u"none",
+                                                                       u"0");
+}
+
+} // namespace
+
+Catalogue::Catalogue(const SettingsFolder& folder, Console& console)
+    : mFolder(folder), mConsole(console), mReasons(folder.BlockReasons())
+{
+}
+
+void Catalogue::Load()
+{
+    LoadBlocks();
+    WithFiles(
+        [this]
+        {
+            File file = ToFile(mFolder.Catalogue());
+            PluginModuleInfoManager::GetInstance().LoadConfiguration(file);
+            // Only what came out empty can have been damaged, so a sound catalogue is read once.
+            if (file.Exists() && IsCatalogueEmpty() && !IsSound(mFolder.Catalogue(), kSettingsVersion))
+            {
+                NoteDamaged(mFolder.Catalogue());
+            }
+        });
+}
+
+void Catalogue::LoadBlocks()
+{
+    WithFiles(
+        [this]
+        {
+            BannedPluginManager& blocks = BannedPluginManager::GetInstance();
+            File dynamic = ToFile(mFolder.Blocks());
+            blocks.LoadConfiguration(dynamic);
+            if (dynamic.Exists() && !IsSound(mFolder.Blocks(), kBlockListVersion))
+            {
+                NoteDamaged(mFolder.Blocks());
+            }
+            File permanent = ToFile(mFolder.PermanentBlocks());
+            if (permanent.Exists() && !blocks.LoadStaticConfiguration(permanent))
+            {
+                mConsole.Warn("zebhost: " + mFolder.PermanentBlocks().string() +
+                              " is damaged and was ignored: mend or "
+                              "remove it");
+            }
+            mReasons.Load();
+        });
+}
+
+bool Catalogue::IsSound(const std::filesystem::path& path, unsigned int version) const
+{
+    zebcore::proplist::PropList list;
+    unsigned int found = 0;
+    return zebcore::proplist::utils::LoadPropList(ToFile(path).FullPath(), list, false) &&
+           list.GetValue(u8"version", found) && found == version;
+}
+
+void Catalogue::NoteDamaged(const std::filesystem::path& path)
+{
+    mDamaged.insert(path);
+    mConsole.Warn("zebhost: " + path.string() +
+                  " is damaged or of another version, and was ignored; it will be kept under another name when a new "
+                  "one is saved");
+}
+
+void Catalogue::SetAsideIfDamaged(const std::filesystem::path& path)
+{
+    if (mDamaged.erase(path) != 0)
+    {
+        const std::filesystem::path aside = FreeName(path);
+        std::filesystem::rename(path, aside);
+        mConsole.Warn("zebhost: the damaged file is kept as " + aside.string());
+    }
+}
+
+void Catalogue::Save()
+{
+    WithFiles(
+        [this]
+        {
+            std::filesystem::create_directories(mFolder.Path());
+            SetAsideIfDamaged(mFolder.Catalogue());
+            File file = ToFile(mFolder.Catalogue());
+            PluginModuleInfoManager::GetInstance().SaveConfiguration(file, true);
+        });
+}
+
+void Catalogue::SaveBlocks()
+{
+    WithFiles(
+        [this]
+        {
+            std::filesystem::create_directories(mFolder.Path());
+            SetAsideIfDamaged(mFolder.Blocks());
+            File file = ToFile(mFolder.Blocks());
+            BannedPluginManager::GetInstance().SaveConfiguration(file);
+            mReasons.Save();
+        });
+}
+
+std::vector<Catalogue::Descriptor> Catalogue::Effects() const
+{
+    const AudioFilterDescriptorManager& manager = AudioFilterDescriptorManager::GetInstance();
+    std::vector<Descriptor> effects;
+    std::copy_if(manager.InfoBegin(), manager.InfoEnd(), std::back_inserter(effects),
+                 [&manager](const Descriptor& each)
+                 { return each == manager.GetComponentDescriptorForID(each->GetUniqueID()); });
+    return effects;
+}
+
+std::vector<Catalogue::Descriptor> Catalogue::EffectsOf(const PluginLocator& locator) const
+{
+    std::vector<Descriptor> effects = Effects();
+    std::erase_if(effects, [&locator](const Descriptor& each) { return each->GetLocator() != locator; });
+    return effects;
+}
+
+bool Catalogue::IsBlocked(const PluginLocator& locator) const
+{
+    return BannedPluginManager::GetInstance().IsPluginBanned(locator) || IsOnPermanentList(locator);
+}
+
+std::string Catalogue::BlockedBecause(const PluginLocator& locator) const
+{
+    const std::string path = zebcore::filesupport::ToNativePath(locator.GetPath());
+    if (!BannedPluginManager::GetInstance().IsPluginBanned(locator))
+    {
+        return path + " is on the permanent block list, " + mFolder.PermanentBlocks().string() +
+               ": it is not used; take it off that list if you must";
+    }
+    const BlockReason why = mReasons.Get(locator);
+    return path + " is blocked" + (why.since.empty() ? "" : " since " + why.since) +
+           (why.reason.empty() ? "" : " (" + why.reason + ")") + ": 'zebhost unblock " + path +
+           "' lets it be used again";
+}
+
+void Catalogue::Block(const PluginLocator& locator, const std::string& reason)
+{
+    BannedPluginManager::GetInstance().AddBannedPlugin(locator);
+    mReasons.Set(locator, reason);
+    SaveBlocks();
+}
+
+void Catalogue::Unblock(const PluginLocator& locator)
+{
+    BannedPluginManager::GetInstance().RemoveBannedPlugin(locator);
+    mReasons.Remove(locator);
+    SaveBlocks();
+}
+
+} // namespace zebhost

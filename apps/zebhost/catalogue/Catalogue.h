@@ -1,0 +1,56 @@
+#pragma once
+
+#include "catalogue/BlockReasons.h"
+#include "catalogue/SettingsFolder.h"
+#include "output/Console.h"
+
+#include <host/AudioFilterDescriptorManager.h>
+#include <host/PluginLocator.h>
+
+#include <set>
+#include <vector>
+
+namespace zebhost
+{
+
+// The library's catalogue and block lists together with the files they live in. A file that is damaged, or of another
+// version, counts as missing; the user is told, and it is kept under another name before a new one takes its place.
+// File trouble ends the command with a Failure. [main]
+class Catalogue
+{
+public:
+    Catalogue(const SettingsFolder& folder, Console& console);
+
+    void Load();
+    void Save();
+
+    using Descriptor = zebaudiofilterhost::AudioFilterDescriptorManager::DescriptorPtr;
+    // The effects that can be offered: of several descriptors with one ID, the one that look-up returns.
+    std::vector<Descriptor> Effects() const;
+    std::vector<Descriptor> EffectsOf(const zebaudiofilterhost::PluginLocator& locator) const;
+
+    // On either list.
+    bool IsBlocked(const zebaudiofilterhost::PluginLocator& locator) const;
+    // "it was blocked on ... because ...".
+    std::string BlockedBecause(const zebaudiofilterhost::PluginLocator& locator) const;
+    // Both are saved at once.
+    void Block(const zebaudiofilterhost::PluginLocator& locator, const std::string& reason);
+    void Unblock(const zebaudiofilterhost::PluginLocator& locator);
+
+    const BlockReasons& Reasons() const { return mReasons; }
+    const SettingsFolder& Folder() const { return mFolder; }
+
+private:
+    void LoadBlocks();
+    void SaveBlocks();
+    bool IsSound(const std::filesystem::path& path, unsigned int version) const;
+    void NoteDamaged(const std::filesystem::path& path);
+    void SetAsideIfDamaged(const std::filesystem::path& path);
+
+    const SettingsFolder& mFolder;
+    Console& mConsole;
+    BlockReasons mReasons;
+    std::set<std::filesystem::path> mDamaged;
+};
+
+} // namespace zebhost

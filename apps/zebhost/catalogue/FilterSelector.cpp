@@ -1,0 +1,244 @@
+#include "catalogue/FilterSelector.h"
+
+#include "catalogue/LoadProblem.h"
+#include "catalogue/PluginFinder.h"
+#include "catalogue/ScanSession.h"
+#include "cli/Failure.h"
+#include "output/PrintableText.h"
+#include "output/Strings.h"
+
+#include <host/AudioFilterDescriptor.h>
+#include <host/PluginModuleInfoManager.h>
+
+#include <algorithm>
+#include <cctype>
+#include <functional>
+#include <optional>
+
+namespace zebhost
+{
+
+using zebaudiofilterhost::AudioFilterDescriptorManager;
+using zebaudiofilterhost::PluginLocator;
+using zebaudiofilterhost::PluginModuleInfoManager;
+
+namespace
+{
+
+using Descriptors = std::vector<Catalogue::Descriptor>;
+
+struct PathAndClass
+{
+    std::string path;
+    std::string className;
+};
+
+bool LooksLikeID(const std::string& text)
+{
+    return text.size() > 2 && std::isdigit(static_cast<unsigned char>(text[0])) != 0 && text[1] == ':';
+}
+
+bool IsThere(const std::string& path)
+{
+    std::error_code error;
+    return std::filesystem::exists(path, error);
+}
+
+// A '#' may also stand in the path itself, so the longest path that is there counts.
+std::optional<PathAndClass> SplitPath(const std::string& text)
+{
+    if (IsBundlePath(text) || (text.find('/') != std::string::npos && IsThere(text)))
+    {
+        return PathAndClass{text, {}};
+    }
+    for (std::size_t at = text.rfind('#'); at != std::string::npos && at > 0; at = text.rfind('#', at - 1))
+    {
+        if (IsBundlePath(text.substr(0, at)))
+        {
+            return PathAndClass{text.substr(0, at), text.substr(at + 1)};
+        }
+    }
+    if (text.find('/') != std::string::npos)
+    {
+        return PathAndClass{text, {}};
+    }
+    return std::nullopt;
+}
+
+std::string NameOf(const Catalogue::Descriptor& descriptor)
+{
+    return Printable(descriptor->GetName());
+}
+
+std::string Candidates(const Descriptors& descriptors)
+{
+    constexpr std::size_t kMost = 12;
+    std::string lines;
+    for (std::size_t index = 0; index < std::min(descriptors.size(), kMost); ++index)
+    {
+        const Catalogue::Descriptor& each = descriptors[index];
+        lines +=
+            "  " + NameOf(each) + "  [" + ToUTF8(each->GetUniqueID()) + "]  " + PathOf(each->GetLocator()) + "\n";
+    }
+    if (descriptors.size() > kMost)
+    {
+        lines += "  and " + std::to_string(descriptors.size() - kMost) + " more\n";
+    }
+    return lines;
+}
+
+// From the strictest reading of a name to the most lenient; the first that fits anything decides.
+Descriptors Fitting(const Descriptors& all, const std::string& wanted)
+{
+    using Reading = bool (*)(const std::string& name, const std::string& wanted);
+    const std::array<Reading, 4> readings = {
+        [](const std::string& name, const std::string& text) { return name == text; },
+        [](const std::string& name, const std::string& text) { return EqualIgnoringCase(name, text); },
+        [](const std::string& name, const std::string& text) { return StartsWithIgnoringCase(name, text); },
+        [](const std::string& name, const std::string& text)
+        {
+            return ContainsIgnoringCase(name, text);
+        }};
+    for (const Reading reading : readings)
+    {
+        Descriptors fitting;
+        std::copy_if(all.begin(), all.end(), std::back_inserter(fitting),
+                     [&](const Catalogue::Descriptor& each) { return reading(NameOf(each), wanted); });
+        if (!fitting.empty())
+        {
+            return fitting;
+        }
+    }
+    return {};
+}
+
+class SilentObserver : public IScanObserver
+{
+public:
+    void Stepping(const PluginLocator&, const std::string&, std::size_t, std::size_t) override {}
+    void Finished(const PluginLocator&, const Outcome&) override {}
+    bool ShallStop() const override { return false; }
+};
+
+} // namespace
+
+FilterSelector::FilterSelector(const Catalogue& catalogue, Console& console)
+    : mCatalogue(catalogue), mConsole(console)
+{
+}
+
+Catalogue::Descriptor FilterSelector::Select(const std::string& text) const
+{
+    Catalogue::Descriptor found;
+    if (LooksLikeID(text))
+    {
+        found = AudioFilterDescriptorManager::GetInstance().GetComponentDescriptorForID(FromUTF8(text));
+        if (found == nullptr)
+        {
+            throw Failure(ExitCode::NotFound,
+                          "no filter has the ID " + text + ": 'zebhost list --long' shows all IDs");
+        }
+    }
+    else if (const std::optional<PathAndClass> split = SplitPath(text))
+    {
+        found = FindByPath(split->path, split->className);
+    }
+    else
+    {
+        found = FindByName(text);
+    }
+    if (mCatalogue.IsBlocked(found->GetLocator()))
+    {
+        throw Failure(ExitCode::Blocked, mCatalogue.BlockedBecause(found->GetLocator()));
+    }
+    return found;
+}
+
+PluginLocator FilterSelector::SelectPlugin(const std::string& text) const
+{
+    if (!LooksLikeID(text) && (IsBundlePath(text) || text.find('/') != std::string::npos))
+    {
+        const PluginLocator locator = BundleLocator(text);
+        if (locator.GetTechnologyType() == zebaudiofilterhost::kTechnologyNone)
+        {
+            throw Failure(ExitCode::NotFound, text + " is not named like a plug-in bundle: its name ends in .vst3");
+        }
+        return locator;
+    }
+    const auto byID = AudioFilterDescriptorManager::GetInstance().GetComponentDescriptorForID(FromUTF8(text));
+    return (byID != nullptr ? byID : FindByName(text))->GetLocator();
+}
+
+Catalogue::Descriptor FilterSelector::FindByPath(const std::string& path, const std::string& className) const
+{
+    if (!IsThere(path))
+    {
+        throw Failure(ExitCode::NotFound, path + ": there is nothing at this path; check its spelling");
+    }
+    const PluginLocator locator = BundleLocator(path);
+    if (locator.GetTechnologyType() == zebaudiofilterhost::kTechnologyNone)
+    {
+        throw Failure(ExitCode::NotFound, path + " is no plug-in bundle: its name has to end in .vst3");
+    }
+    if (mCatalogue.IsBlocked(locator))
+    {
+        throw Failure(ExitCode::Blocked, mCatalogue.BlockedBecause(locator));
+    }
+    Descriptors fitting = Fitting(mCatalogue.EffectsOf(locator), className);
+    if (fitting.empty())
+    {
+        ScanBundle(locator);
+        fitting = Fitting(mCatalogue.EffectsOf(locator), className);
+    }
+    if (fitting.size() == 1)
+    {
+        return fitting.front();
+    }
+    const std::string candidates = Candidates(fitting.empty() ? mCatalogue.EffectsOf(locator) : fitting);
+    mConsole.Warn(candidates.substr(0, candidates.find_last_not_of('\n') + 1));
+    throw Failure(ExitCode::NotFound, (fitting.empty() ? path + " has no effect named " + className
+                                                       : path + " has several effects that fit") +
+                                          ": give one of the above as '" + path + "#NAME'");
+}
+
+void FilterSelector::ScanBundle(const PluginLocator& locator) const
+{
+    SilentObserver observer;
+    ScanSession(nullptr, observer, {}).Run({locator});
+    if (PluginModuleInfoManager::GetInstance().FindPluginInfo(locator) == nullptr)
+    {
+        throw Failure(ExitCode::NotLoaded, LoadProblem(locator));
+    }
+    if (mCatalogue.EffectsOf(locator).empty())
+    {
+        throw Failure(ExitCode::NotFound, PathOf(locator) + " holds no effect: instruments are not in the catalogue, "
+                                                            "and classes that do not start up are left out");
+    }
+}
+
+Catalogue::Descriptor FilterSelector::FindByName(const std::string& name) const
+{
+    const Descriptors all = mCatalogue.Effects();
+    if (all.empty())
+    {
+        throw Failure(ExitCode::NotFound,
+                      "there is no filter named " + name +
+                          ", for the catalogue is empty: run 'zebhost scan', or give a bundle's path");
+    }
+    const Descriptors fitting = Fitting(all, name);
+    if (fitting.size() == 1)
+    {
+        return fitting.front();
+    }
+    if (fitting.empty())
+    {
+        throw Failure(ExitCode::NotFound, "no filter is named " + name +
+                                              ": 'zebhost list' shows all names, 'zebhost scan' looks for new ones");
+    }
+    const std::string candidates = Candidates(fitting);
+    mConsole.Warn(candidates.substr(0, candidates.find_last_not_of('\n') + 1));
+    throw Failure(ExitCode::NotFound,
+                  name + " fits " + std::to_string(fitting.size()) + " filters: give the ID of one of the above");
+}
+
+} // namespace zebhost

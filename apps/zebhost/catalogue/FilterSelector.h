@@ -1,0 +1,33 @@
+#pragma once
+
+#include "catalogue/Catalogue.h"
+
+#include <string>
+
+namespace zebhost
+{
+
+// Finds the one filter that a FILTER operand means: a filter ID, a name that fits one entry of the catalogue, a
+// bundle's path, or path#class name. A bundle that is not in the catalogue is scanned into memory, and not saved.
+class FilterSelector
+{
+public:
+    FilterSelector(const Catalogue& catalogue, Console& console);
+
+    // Never null: throws a Failure that tells the candidates when there are several, and what to do when there is
+    // none. Blocked plug-ins are refused.
+    Catalogue::Descriptor Select(const std::string& text) const;
+
+    // The bundle that a PLUGIN operand means: a path, or a filter as above. Blocked ones are not refused.
+    zebaudiofilterhost::PluginLocator SelectPlugin(const std::string& text) const;
+
+private:
+    Catalogue::Descriptor FindByPath(const std::string& path, const std::string& className) const;
+    Catalogue::Descriptor FindByName(const std::string& name) const;
+    void ScanBundle(const zebaudiofilterhost::PluginLocator& locator) const;
+
+    const Catalogue& mCatalogue;
+    Console& mConsole;
+};
+
+} // namespace zebhost

@@ -1,0 +1,25 @@
+#include "catalogue/LoadProblem.h"
+
+#include "catalogue/PluginFinder.h"
+#include "output/PrintableText.h"
+
+#include <host/PluginModule.h>
+
+namespace zebhost
+{
+
+std::string LoadProblem(const zebaudiofilterhost::PluginLocator& locator)
+{
+    std::string problem = Printable(zebaudiofilterhost::PluginModule::GetLoadProblem(locator.GetPath()));
+    if (problem.empty())
+    {
+        return PathOf(locator) + " could not be loaded: it does not start up as a plug-in; ask its maker";
+    }
+    while (problem.back() == '.')
+    {
+        problem.pop_back();
+    }
+    return problem;
+}
+
+} // namespace zebhost

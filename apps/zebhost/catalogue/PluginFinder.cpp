@@ -1,0 +1,140 @@
+#include "catalogue/PluginFinder.h"
+
+#include "cli/Failure.h"
+
+#include <foundation/zebcore/NativePath.h>
+#include <host/PluginModuleInfoManager.h>
+#include <host/TechnologyType.h>
+
+#include <algorithm>
+#include <array>
+#include <set>
+#include <utility>
+
+namespace zebhost
+{
+
+namespace fs = std::filesystem;
+
+using zebaudiofilterhost::PluginLocator;
+using zebaudiofilterhost::PluginModuleInfoManager;
+using zebaudiofilterhost::TechnologyType;
+using zebcore::filesupport::FromNativePath;
+using zebcore::filesupport::ToNativePath;
+
+namespace
+{
+
+constexpr std::array<std::pair<const char*, TechnologyType>, 1> kExtensions = {
+    {{".vst3", zebaudiofilterhost::kTechnologyVST3}}};
+
+TechnologyType TechnologyOf(const fs::path& path)
+{
+    const std::string extension = path.extension().string();
+    for (const auto& [known, type] : kExtensions)
+    {
+        if (extension == known && PluginModuleInfoManager::GetInstance().GetPluginTechnology(type) != nullptr)
+        {
+            return type;
+        }
+    }
+    return zebaudiofilterhost::kTechnologyNone;
+}
+
+fs::path Normal(const fs::path& path)
+{
+    const fs::path normal = fs::absolute(path).lexically_normal();
+    return normal.has_filename() ? normal : normal.parent_path();
+}
+
+// A link back to a folder above would never end, so each real folder is searched once.
+void SearchFolder(const fs::path& folder, std::set<fs::path>& seen, std::vector<PluginLocator>& found)
+{
+    std::error_code error;
+    if (!seen.insert(fs::canonical(folder, error)).second || error)
+    {
+        return;
+    }
+    std::vector<fs::path> children;
+    for (const fs::directory_entry& entry :
+         fs::directory_iterator(folder, fs::directory_options::skip_permission_denied, error))
+    {
+        std::error_code ignored;
+        if (entry.is_directory(ignored))
+        {
+            children.push_back(entry.path());
+        }
+    }
+    std::sort(children.begin(), children.end());
+    for (const fs::path& child : children)
+    {
+        if (IsBundlePath(child))
+        {
+            found.push_back(BundleLocator(child));
+        }
+        else
+        {
+            SearchFolder(child, seen, found);
+        }
+    }
+}
+
+} // namespace
+
+bool IsBundlePath(const fs::path& path)
+{
+    return TechnologyOf(Normal(path)) != zebaudiofilterhost::kTechnologyNone;
+}
+
+PluginLocator BundleLocator(const fs::path& path)
+{
+    const fs::path normal = Normal(path);
+    return {TechnologyOf(normal), FromNativePath(normal.string())};
+}
+
+std::string PathOf(const PluginLocator& locator)
+{
+    return ToNativePath(locator.GetPath());
+}
+
+std::vector<PluginLocator> FindPlugins(const fs::path& path)
+{
+    std::error_code error;
+    if (!fs::exists(path, error))
+    {
+        throw Failure(ExitCode::NotFound, path.string() + ": there is nothing at this path; check its spelling");
+    }
+    if (IsBundlePath(path))
+    {
+        return {BundleLocator(path)};
+    }
+    if (!fs::is_directory(path, error))
+    {
+        throw Failure(ExitCode::NotFound,
+                      path.string() +
+                          " is no plug-in bundle: give a folder whose name ends in .vst3, or one that holds "
+                          "such folders");
+    }
+    std::vector<PluginLocator> found;
+    std::set<fs::path> seen;
+    SearchFolder(Normal(path), seen, found);
+    return found;
+}
+
+std::vector<PluginLocator> WithoutDoubles(const std::vector<PluginLocator>& locators)
+{
+    std::vector<PluginLocator> result;
+    std::set<std::pair<TechnologyType, std::string>> seen;
+    for (const PluginLocator& locator : locators)
+    {
+        std::error_code error;
+        const fs::path real = fs::canonical(PathOf(locator), error);
+        if (seen.emplace(locator.GetTechnologyType(), error ? PathOf(locator) : real.string()).second)
+        {
+            result.push_back(locator);
+        }
+    }
+    return result;
+}
+
+} // namespace zebhost

@@ -1,0 +1,28 @@
+#pragma once
+
+#include <host/PluginLocator.h>
+
+#include <filesystem>
+#include <string>
+#include <vector>
+
+namespace zebhost
+{
+
+// Whether the path is named like a plug-in bundle of a technology that the library knows; nothing is opened.
+bool IsBundlePath(const std::filesystem::path& path);
+
+// The locator of a bundle: an absolute path without dots in it. Type 0 if IsBundlePath is false.
+zebaudiofilterhost::PluginLocator BundleLocator(const std::filesystem::path& path);
+
+std::string PathOf(const zebaudiofilterhost::PluginLocator& locator);
+
+// The bundle itself, or all bundles below a folder, in the order of their names; the inside of a bundle is not
+// searched. Throws a Failure if there is nothing at the path.
+std::vector<zebaudiofilterhost::PluginLocator> FindPlugins(const std::filesystem::path& path);
+
+// Without those that a symbolic link leads to a second time; the first of each stays.
+std::vector<zebaudiofilterhost::PluginLocator>
+WithoutDoubles(const std::vector<zebaudiofilterhost::PluginLocator>& locators);
+
+} // namespace zebhost

@@ -1,0 +1,206 @@
+#include "cli/ArgumentParser.h"
+
+#include "cli/CommandTable.h"
+#include "cli/Failure.h"
+#include "output/Strings.h"
+
+#include <CLI/CLI.hpp>
+
+#include <algorithm>
+
+namespace zebhost
+{
+
+namespace
+{
+
+using OptionNames = std::vector<std::pair<CLI::Option*, std::string>>;
+
+struct ParserCommand
+{
+    const CommandSpec* spec = nullptr;
+    CLI::App* app = nullptr;
+    OptionNames options;
+};
+
+CLI::Option* AddOption(CLI::App& app, const OptionSpec& spec)
+{
+    const std::string name = "--" + std::string(spec.name);
+    if (spec.values == Values::None)
+    {
+        return app.add_flag(name);
+    }
+    CLI::Option* option = app.add_option(name)->type_size(1)->expected(1)->allow_extra_args(false);
+    option->multi_option_policy(spec.repeatable ? CLI::MultiOptionPolicy::TakeAll : CLI::MultiOptionPolicy::Throw);
+    return option;
+}
+
+CLI::Option* AddOperand(CLI::App& app, const OperandSpec& spec)
+{
+    CLI::Option* option = app.add_option(std::string(spec.name))->type_size(1);
+    option->expected(spec.required ? 1 : 0, spec.repeatable ? CLI::detail::expected_max_vector_size : 1);
+    option->multi_option_policy(CLI::MultiOptionPolicy::TakeAll);
+    return option->required(spec.required)->allow_extra_args(false);
+}
+
+// A command of two words stands below its first word.
+CLI::App* AddCommand(CLI::App& root, const CommandSpec& spec)
+{
+    const std::vector<std::string> words = Split(spec.name, ' ');
+    CLI::App* parent = &root;
+    if (words.size() == 2)
+    {
+        const std::vector<CLI::App*> known =
+            root.get_subcommands([&words](CLI::App* app) { return app->get_name() == words.front(); });
+        parent =
+            !known.empty() ? known.front() : root.add_subcommand(words.front())->require_subcommand(1)->fallthrough();
+    }
+    return parent->add_subcommand(words.back())->fallthrough();
+}
+
+ParserCommand MakeCommand(CLI::App& root, const CommandSpec& spec)
+{
+    ParserCommand command{&spec, AddCommand(root, spec), {}};
+    for (const OperandSpec& operand : spec.operands)
+    {
+        command.options.emplace_back(AddOperand(*command.app, operand), std::string(operand.name));
+    }
+    for (const OptionSpec& option : spec.options)
+    {
+        command.options.emplace_back(AddOption(*command.app, option), std::string(option.name));
+    }
+    return command;
+}
+
+void TakeValues(const OptionNames& options, Arguments& arguments)
+{
+    for (const auto& [option, name] : options)
+    {
+        if (option->count() > 0)
+        {
+            arguments.Add(name, option->results());
+        }
+    }
+}
+
+// "preset" alone has no row in the table, but may be asked for help.
+std::string ParsedCommandName(const CLI::App& root)
+{
+    std::vector<std::string> words;
+    for (const CLI::App* app = &root; !app->get_subcommands().empty();)
+    {
+        app = app->get_subcommands().front();
+        words.push_back(app->get_name());
+    }
+    return Joined(words, " ");
+}
+
+void CheckChoice(std::string_view what, const std::vector<std::string>& given,
+                 const std::vector<std::string_view>& choices)
+{
+    for (const std::string& value : given)
+    {
+        if (std::find(choices.begin(), choices.end(), value) == choices.end())
+        {
+            throw Failure(ExitCode::Usage, std::string(what) + " " + value + ": give one of " +
+                                               Joined({choices.begin(), choices.end()}, ", "));
+        }
+    }
+}
+
+void CheckChoices(const CommandSpec& spec, const Arguments& arguments)
+{
+    for (const OptionSpec& option : spec.options)
+    {
+        if (option.values == Values::Choice)
+        {
+            CheckChoice("--" + std::string(option.name), arguments.All(option.name), option.choices);
+        }
+    }
+    for (const OperandSpec& operand : spec.operands)
+    {
+        if (operand.values == Values::Choice)
+        {
+            CheckChoice(operand.name, arguments.All(operand.name), operand.choices);
+        }
+    }
+}
+
+[[noreturn]] void RefuseUsage(const CLI::ParseError& error, const std::string& command)
+{
+    std::string what = error.what();
+    std::replace(what.begin(), what.end(), '\n', ' ');
+    const std::string help = command.empty() ? "zebhost --help" : "zebhost " + command + " --help";
+    throw Failure(ExitCode::Usage, std::string(Trimmed(what)) + "; see '" + help + "'");
+}
+
+// The parser's tree of commands, and where each value goes.
+class Parser
+{
+public:
+    Parser()
+    {
+        mRoot.require_subcommand(1);
+        mRoot.set_help_flag("-h,--help");
+        mRoot.set_version_flag("--version", std::string("zebhost"));
+        for (const OptionSpec& option : CommonOptions())
+        {
+            mCommon.emplace_back(AddOption(mRoot, option), std::string(option.name));
+        }
+        for (const CommandSpec& spec : CommandTable())
+        {
+            mCommands.push_back(MakeCommand(mRoot, spec));
+        }
+    }
+
+    Arguments Parse(int argc, const char* const* argv)
+    {
+        Arguments arguments;
+        try
+        {
+            mRoot.parse(argc, argv);
+        }
+        catch (const CLI::CallForHelp&)
+        {
+            arguments.Add("help", {});
+        }
+        catch (const CLI::CallForVersion&)
+        {
+            arguments.Add("version", {});
+        }
+        catch (const CLI::ParseError& error)
+        {
+            RefuseUsage(error, ParsedCommandName(mRoot));
+        }
+        arguments.command = ParsedCommandName(mRoot);
+        Collect(arguments);
+        return arguments;
+    }
+
+private:
+    void Collect(Arguments& arguments) const
+    {
+        TakeValues(mCommon, arguments);
+        for (const ParserCommand& command : mCommands)
+        {
+            if (command.spec->name == arguments.command)
+            {
+                TakeValues(command.options, arguments);
+                CheckChoices(*command.spec, arguments);
+            }
+        }
+    }
+
+    CLI::App mRoot{"", "zebhost"};
+    OptionNames mCommon;
+    std::vector<ParserCommand> mCommands;
+};
+
+} // namespace
+
+Arguments ParseArguments(int argc, const char* const* argv)
+{
+    return Parser().Parse(argc, argv);
+}
+
+} // namespace zebhost

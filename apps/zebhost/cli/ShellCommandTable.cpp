@@ -1,0 +1,65 @@
+#include "cli/CommandTableParts.h"
+
+namespace zebhost
+{
+
+namespace
+{
+
+OperandSpec PluginOperand()
+{
+    return {"PLUGIN", "a bundle's path, or a filter of the catalogue by name or ID", Values::Plugin};
+}
+
+} // namespace
+
+std::vector<CommandSpec> BlockCommands()
+{
+    CommandSpec block = {
+        "block",
+        "keep a plug-in from being scanned or used",
+        "A blocked plug-in is not searched, scanned or loaded. Its effects leave the catalogue with the next scan.",
+        {PluginOperand()},
+        {{"reason", "TEXT", "why, for those who read the list later", Values::Text}},
+        {{"zebhost block ~/.vst3/Shaky.vst3 --reason 'hangs on load'", "by path"},
+         {"zebhost block Shaky", "by the name of one of its effects"}},
+    };
+    CommandSpec unblock = {
+        "unblock",
+        "let a blocked plug-in be used again",
+        "The next scan tries it.",
+        {PluginOperand()},
+        {},
+        {{"zebhost unblock ~/.vst3/Shaky.vst3", "by path"}, {"zebhost unblock Shaky.vst3", "by file name"}},
+    };
+    CommandSpec blocks = {
+        "blocks", "list blocked plug-ins with the reason",
+        "",       {},
+        {},       {{"zebhost blocks", "for reading"}, {"zebhost blocks --json", "for a script"}},
+    };
+    return {block, unblock, blocks};
+}
+
+std::vector<CommandSpec> ShellCommands()
+{
+    CommandSpec completion = {
+        "completion",
+        "print a completion script for a shell",
+        "",
+        {{"SHELL", "bash, zsh or fish", Values::Choice, true, false, {"bash", "zsh", "fish"}}},
+        {},
+        {{"source <(zebhost completion bash)", "for this shell only"},
+         {"zebhost completion fish > ~/.config/fish/completions/zebhost.fish", "for good"}},
+    };
+    CommandSpec man = {
+        "man",
+        "print the manual page",
+        "",
+        {},
+        {},
+        {{"zebhost man | man -l -", "read it"}, {"zebhost man > /usr/local/share/man/man1/zebhost.1", "install it"}},
+    };
+    return {completion, man};
+}
+
+} // namespace zebhost

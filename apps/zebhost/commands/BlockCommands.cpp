@@ -1,0 +1,111 @@
+#include "catalogue/FilterSelector.h"
+#include "catalogue/PluginFinder.h"
+#include "cli/Failure.h"
+#include "commands/Commands.h"
+#include "output/TextTable.h"
+
+#include <host/BannedPluginManager.h>
+
+#include <vector>
+
+namespace zebhost
+{
+
+using zebaudiofilterhost::BannedPluginManager;
+using zebaudiofilterhost::PluginLocator;
+
+namespace
+{
+
+std::vector<PluginLocator> Blocked()
+{
+    const BannedPluginManager& manager = BannedPluginManager::GetInstance();
+    return {manager.BannedBegin(), manager.BannedEnd()};
+}
+
+// A blocked plug-in may be gone from disk and catalogue, so its file name alone will do.
+PluginLocator BlockedPlugin(const CommandContext& context, const std::string& text)
+{
+    std::vector<PluginLocator> fitting;
+    for (const PluginLocator& locator : Blocked())
+    {
+        const std::filesystem::path path = PathOf(locator);
+        if (path == text || path.filename() == text || path.stem() == text || locator == BundleLocator(text))
+        {
+            fitting.push_back(locator);
+        }
+    }
+    if (fitting.size() > 1)
+    {
+        throw Failure(ExitCode::NotFound,
+                      text + " fits several blocked plug-ins: give a path as 'zebhost blocks' shows it");
+    }
+    if (fitting.empty())
+    {
+        const PluginLocator locator = FilterSelector(context.catalogue, context.console).SelectPlugin(text);
+        if (!BannedPluginManager::GetInstance().IsPluginBanned(locator))
+        {
+            throw Failure(ExitCode::NotFound, PathOf(locator) + " is not blocked: 'zebhost blocks' shows what is");
+        }
+        return locator;
+    }
+    return fitting.front();
+}
+
+void Tell(const CommandContext& context, const PluginLocator& locator, const std::string& what)
+{
+    if (context.WantsJson())
+    {
+        Json document = context.NewDocument();
+        document["path"] = PathOf(locator);
+        context.Print(document);
+    }
+    context.console.Remark("zebhost: " + PathOf(locator) + what);
+}
+
+} // namespace
+
+ExitCode RunBlock(CommandContext& context)
+{
+    const PluginLocator locator =
+        FilterSelector(context.catalogue, context.console).SelectPlugin(context.arguments.Text("PLUGIN"));
+    context.catalogue.Block(locator, context.arguments.Text("reason", "blocked by hand"));
+    Tell(context, locator, " is blocked; 'zebhost unblock' lets it be used again");
+    return ExitCode::Done;
+}
+
+ExitCode RunUnblock(CommandContext& context)
+{
+    const PluginLocator locator = BlockedPlugin(context, context.arguments.Text("PLUGIN"));
+    context.catalogue.Unblock(locator);
+    Tell(context, locator, " is not blocked any more; the next 'zebhost scan' tries it");
+    return ExitCode::Done;
+}
+
+ExitCode RunBlocks(CommandContext& context)
+{
+    TextTable table({"PATH", "SINCE", "REASON"});
+    Json document = context.NewDocument();
+    document["blocked"] = Json::array();
+    for (const PluginLocator& locator : Blocked())
+    {
+        const BlockReason why = context.catalogue.Reasons().Get(locator);
+        table.AddRow({PathOf(locator), why.since, why.reason});
+        document["blocked"].push_back(Json{{"path", PathOf(locator)}, {"since", why.since}, {"reason", why.reason}});
+    }
+    if (context.WantsJson())
+    {
+        context.Print(document);
+    }
+    else if (table.IsEmpty())
+    {
+        context.console.Remark("zebhost: no plug-in is blocked");
+    }
+    else
+    {
+        context.console.Print(table.Text(context.console.HasOutputColour()));
+    }
+    return ExitCode::Done;
+}
+
+} // namespace zebhost

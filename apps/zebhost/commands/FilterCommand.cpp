@@ -1,0 +1,25 @@
+#include "commands/FilterCommand.h"
+
+#include "catalogue/FilterSelector.h"
+#include "catalogue/PluginFinder.h"
+#include "output/PrintableText.h"
+
+#include <host/AudioFilterDescriptor.h>
+
+namespace zebhost
+{
+
+FilterOfCommand::FilterOfCommand(const CommandContext& context, unsigned int settleMs)
+    : mDescriptor(FilterSelector(context.catalogue, context.console).Select(context.arguments.Text("FILTER")))
+    , mGuard(PathOf(mDescriptor->GetLocator()), "its maker should know; 'zebhost block " +
+                                                    PathOf(mDescriptor->GetLocator()) + "' keeps it from being used")
+    , mFilter(LoadFilter(mDescriptor, settleMs))
+{
+}
+
+std::string FilterOfCommand::Name() const
+{
+    return Printable(mDescriptor->GetName());
+}
+
+} // namespace zebhost

@@ -1,0 +1,15 @@
+#pragma once
+
+#include "commands/CommandContext.h"
+
+#include <audiofilter/AudioFilter.h>
+
+namespace zebhost
+{
+
+// Prints all parameters of a filter with the values that it has now, as a table or, with `document`, under its key
+// "parameters". `withChoices` adds the texts of parameters that have steps.
+void PrintParameters(const CommandContext& context, const zebaudiofilterhost::AudioFilter& filter, Json document,
+                     bool withChoices);
+
+} // namespace zebhost

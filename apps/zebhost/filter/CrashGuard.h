@@ -1,0 +1,32 @@
+#pragma once
+
+#include <string>
+
+namespace zebhost
+{
+
+// While one lives, a crash of the process, in a plug-in that runs inside it, ends with a sentence and
+// ExitCode::Crashed instead of a bare signal. Guards nest: the innermost speaks.
+class CrashGuard
+{
+public:
+    // `what` begins the sentence: "/x/Y.vst3, at hand in the scan,". `advice` ends it. A time of more than 0 seconds
+    // ends the process in the same way when the guard lives longer.
+    CrashGuard(const std::string& what, const std::string& advice, unsigned int seconds = 0);
+    ~CrashGuard();
+    CrashGuard(const CrashGuard&) = delete;
+    CrashGuard& operator=(const CrashGuard&) = delete;
+
+    // Where the failure document of --json goes; without it none is written.
+    static void WriteDocuments(const std::string& command, int descriptor);
+    // A file that must not stay behind; empty for none.
+    static void RemoveOnCrash(const std::string& path);
+    // To be called when all is done and the process is about to end with `code`: what plug-ins do while they are
+    // taken down, be it a crash or a hang, changes that no more.
+    static void ExpectEnd(int code);
+
+private:
+    int mPreviousDepth;
+};
+
+} // namespace zebhost

@@ -1,0 +1,40 @@
+#include "filter/Interrupt.h"
+
+#include <atomic>
+#include <csignal>
+
+namespace zebhost::interrupt
+{
+
+namespace
+{
+
+std::atomic<bool> sRequested{false};
+
+void OnSignal(int)
+{
+    sRequested.store(true);
+}
+
+} // namespace
+
+void Watch()
+{
+    struct sigaction action
+    {
+    };
+    action.sa_handler = OnSignal;
+    action.sa_flags = static_cast<int>(SA_RESETHAND);
+    sigemptyset(&action.sa_mask);
+    for (const int signal : {SIGINT, SIGTERM, SIGHUP})
+    {
+        sigaction(signal, &action, nullptr);
+    }
+}
+
+bool IsRequested()
+{
+    return sRequested.load();
+}
+
+} // namespace zebhost::interrupt

@@ -1,0 +1,66 @@
+#include "filter/LoadFilter.h"
+
+#include "catalogue/LoadProblem.h"
+#include "catalogue/PluginFinder.h"
+#include "cli/Failure.h"
+#include "output/PrintableText.h"
+
+#include <foundation/zebcore/MainThreadLoop.h>
+#include <host/AudioFilterDescriptor.h>
+#include <host/PluginModuleInfoManager.h>
+#include <utility/EffectUtils.h>
+
+namespace zebhost
+{
+
+using zebaudiofilterhost::PluginModuleInfoManager;
+
+namespace
+{
+
+std::string Title(const Catalogue::Descriptor& descriptor)
+{
+    return Printable(descriptor->GetName()) + " in " + PathOf(descriptor->GetLocator());
+}
+
+void CheckUsable(const Catalogue::Descriptor& descriptor)
+{
+    if (descriptor->IsInternal())
+    {
+        return;
+    }
+    if (!descriptor->IsEnabled() ||
+        !PluginModuleInfoManager::GetInstance().IsPluginEnabled(descriptor->GetLocator(), false))
+    {
+        throw Failure(ExitCode::Blocked, Title(descriptor) + " is disabled in the catalogue: 'zebhost scan " +
+                                             PathOf(descriptor->GetLocator()) + "' enables it");
+    }
+    std::error_code error;
+    if (!std::filesystem::exists(PathOf(descriptor->GetLocator()), error))
+    {
+        throw Failure(ExitCode::NotLoaded,
+                      Title(descriptor) + " is gone from the disk: put it back, or run 'zebhost scan' to drop it "
+                                          "from the catalogue");
+    }
+}
+
+} // namespace
+
+FilterPointer LoadFilter(const Catalogue::Descriptor& descriptor, unsigned int settleMs)
+{
+    CheckUsable(descriptor);
+    const FilterPointer filter = zebaudiofilterhost::utility::CreateAudioFilter(descriptor->GetUniqueID());
+    if (filter == nullptr)
+    {
+        throw Failure(ExitCode::NotLoaded, LoadProblem(descriptor->GetLocator()));
+    }
+    Settle(settleMs);
+    return filter;
+}
+
+void Settle(unsigned int milliseconds)
+{
+    zebcore::threads::RunMainThreadUntil({}, milliseconds);
+}
+
+} // namespace zebhost

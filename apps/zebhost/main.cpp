@@ -1,0 +1,127 @@
+#include "cli/ArgumentParser.h"
+#include "cli/Failure.h"
+#include "cli/HelpText.h"
+#include "commands/Commands.h"
+#include "filter/CrashGuard.h"
+#include "output/Tracing.h"
+
+#include <module/Module.h>
+
+#include <algorithm>
+#include <array>
+#include <exception>
+#include <functional>
+#include <string_view>
+
+namespace zebhost
+{
+
+namespace
+{
+
+using CommandFunction = ExitCode (*)(CommandContext&);
+
+constexpr std::array<std::pair<std::string_view, CommandFunction>, 12> kCommands = {{{"scan", RunScan},
+                                                                                     {"list", RunList},
+                                                                                     {"info", RunInfo},
+                                                                                     {"params", RunParams},
+                                                                                     {"render", RunRender},
+                                                                                     {"preset save", RunPresetSave},
+                                                                                     {"preset load", RunPresetLoad},
+                                                                                     {"preset list", RunPresetList},
+                                                                                     {"edit", RunEdit},
+                                                                                     {"block", RunBlock},
+                                                                                     {"unblock", RunUnblock},
+                                                                                     {"blocks", RunBlocks}}};
+
+ExitCode RunWithLibrary(const Arguments& arguments, Console& console)
+{
+    const auto command = std::find_if(kCommands.begin(), kCommands.end(),
+                                      [&arguments](const auto& each) { return each.first == arguments.command; });
+    if (command == kCommands.end())
+    {
+        throw Failure(ExitCode::Usage, "there is no command " + arguments.command + ": see 'zebhost --help'");
+    }
+    StartTracing(arguments.All("trace"));
+    zebaudiofilterhost::Initialize();
+    const SettingsFolder folder(arguments.Text("settings"));
+    Catalogue catalogue(folder, console);
+    catalogue.Load();
+    CommandContext context{arguments, console, catalogue};
+    const ExitCode code = command->second(context);
+    zebaudiofilterhost::Terminate();
+    return code;
+}
+
+ExitCode Run(const Arguments& arguments, Console& console)
+{
+    if (arguments.Has("help"))
+    {
+        console.Print(HelpFor(arguments.command, console.OutputWidth()));
+        return ExitCode::Done;
+    }
+    if (arguments.Has("version"))
+    {
+        console.Print("zebhost " ZEBHOST_VERSION "\n");
+        return ExitCode::Done;
+    }
+    if (arguments.command == "completion")
+    {
+        return RunCompletion(arguments, console);
+    }
+    return arguments.command == "man" ? RunMan(arguments, console) : RunWithLibrary(arguments, console);
+}
+
+ExitCode Report(const Failure& failure, const Arguments& arguments, bool json, Console& console)
+{
+    if (json && !console.HasPrinted())
+    {
+        console.Print(ToText(FailureDocument(arguments.command, failure)));
+    }
+    console.Warn(std::string("zebhost: ") + failure.what());
+    return failure.Code();
+}
+
+// What goes wrong in a library of ours is the job's failure, whatever it throws.
+ExitCode Guarded(int argc, const char* const* argv, Console& console)
+{
+    Arguments arguments;
+    bool json = std::find(argv, argv + argc, std::string_view("--json")) != argv + argc;
+    try
+    {
+        arguments = ParseArguments(argc, argv);
+        json = arguments.Has("json");
+        console.SetQuiet(arguments.Has("quiet"));
+        if (json)
+        {
+            CrashGuard::WriteDocuments(arguments.command, console.OutputDescriptor());
+        }
+        return Run(arguments, console);
+    }
+    catch (const Failure& failure)
+    {
+        return Report(failure, arguments, json, console);
+    }
+    catch (const std::exception& error)
+    {
+        return Report(Failure(ExitCode::JobFailed, std::string("something unforeseen went wrong: ") + error.what()),
+                      arguments, json, console);
+    }
+}
+
+} // namespace
+
+} // namespace zebhost
+
+int main(int argc, char** argv)
+{
+    zebhost::Console console;
+    zebhost::ExitCode code = zebhost::Guarded(argc, argv, console);
+    if (!console.Flush() && code == zebhost::ExitCode::Done)
+    {
+        console.Warn("zebhost: standard output could not be written to the end: make room, or read it to the end");
+        code = zebhost::ExitCode::FileTrouble;
+    }
+    zebhost::CrashGuard::ExpectEnd(static_cast<int>(code));
+    return static_cast<int>(code);
+}
