@@ -10,7 +10,7 @@ namespace zebaudiofilterhost
 {
 
 /// One filter that a plug-in binary, or the application itself, offers. Shared by reference count; the catalogue
-/// holds it, and whoever shows a menu of filters may hold it too. [main]
+/// holds it, and whoever shows a menu of filters may hold it too. All operations: [main]
 class ZEB_EXPORT AudioFilterDescriptor : public virtual zebcore::utility::RefCountedObject
 {
 public:

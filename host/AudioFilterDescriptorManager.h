@@ -14,7 +14,7 @@ namespace zebaudiofilterhost
 {
 
 /// The list of all filters that the application can offer, whether or not their plug-ins are loaded. IDs compare as
-/// plain code units. [main]
+/// plain code units. All operations: [main]
 class ZEB_EXPORT AudioFilterDescriptorManager
 {
 public:

@@ -13,7 +13,7 @@ namespace zebaudiofilterhost
 {
 
 /// Makes a filter from its ID: the ID's descriptor names a GUID, and the GUID selects a function. No lock: nothing
-/// may register while filters are being made. [main]
+/// may register while filters are being made. All operations: [main]
 class ZEB_EXPORT AudioFilterFactory
 {
 public:

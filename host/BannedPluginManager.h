@@ -13,7 +13,8 @@ namespace zebaudiofilterhost
 
 /// The two lists of plug-ins that must not be touched. The dynamic list is the application's, kept while it runs, and
 /// holds what took the process down; searches leave its plug-ins out. The permanent list is shipped, read-only, and
-/// consulted when a plug-in is scanned. When either is loaded or saved is up to the application. [main]
+/// consulted when a plug-in is scanned. When either is loaded or saved is up to the application. All operations:
+/// [main]
 class ZEB_EXPORT BannedPluginManager
 {
 public:

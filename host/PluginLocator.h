@@ -7,7 +7,8 @@
 namespace zebaudiofilterhost
 {
 
-/// Where one plug-in binary lives: which technology, which path. A value; settings files hold it as text. [any]
+/// Where one plug-in binary lives: which technology, which path. A value; settings files hold it as text. All
+/// operations: [any]
 class ZEB_EXPORT PluginLocator
 {
 public:

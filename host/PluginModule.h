@@ -9,7 +9,8 @@ namespace zebaudiofilterhost
 {
 
 /// One plug-in binary in memory: the bundle at a path, loaded or not. Each technology derives its own from it and
-/// resolves its entry points there. Also keeps what every plug-in may ask the host for: language and theme. [main]
+/// resolves its entry points there. Also keeps what every plug-in may ask the host for: language and theme. All
+/// operations: [main]
 class ZEB_EXPORT PluginModule : public virtual zebcore::utility::RefCountedObject
 {
 public:

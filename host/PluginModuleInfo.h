@@ -10,7 +10,7 @@ namespace zebaudiofilterhost
 {
 
 /// The catalogue's record of one plug-in binary: that it was scanned, how it is called, whether the user has it
-/// enabled. Shared by reference count. [main]
+/// enabled. Shared by reference count. All operations: [main]
 class ZEB_EXPORT PluginModuleInfo : public virtual zebcore::utility::RefCountedObject
 {
 public:

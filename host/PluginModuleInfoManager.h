@@ -17,7 +17,8 @@ namespace zebaudiofilterhost
 
 /// All technologies, and the records of all plug-in binaries; reads and writes the settings file. It opens no file by
 /// itself: the application stores the private configuration, calls LoadConfiguration, CollectPotentialPlugins,
-/// RemovePluginLocators, runs a PluginModuleScanner, and calls SaveConfiguration, in this order. [main]
+/// RemovePluginLocators, runs a PluginModuleScanner, and calls SaveConfiguration, in this order. All operations:
+/// [main]
 class ZEB_EXPORT PluginModuleInfoManager
 {
 public:

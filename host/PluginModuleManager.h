@@ -10,7 +10,7 @@ namespace zebaudiofilterhost
 
 /// Gives a technology at most one module object for each path. T is a boost::intrusive_ptr to the technology's module
 /// class. The key is the path as it stands: unlike PluginLocator it never ignores case. Its references go at process
-/// exit. [main]
+/// exit. All operations: [main]
 template <class T>
 class PluginModuleManager
 {

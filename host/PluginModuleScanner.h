@@ -18,7 +18,7 @@ namespace zebaudiofilterhost
 /// ContinueScan while GetCurrentProgressInfo returns true, EndScan. What a step found is in the catalogue once its
 /// plug-in is done. Good for one pass, and may be dropped at any step. A crash of a plug-in is not caught: an
 /// application that wants to survive the next start bans the announced locator around each step
-/// (BannedPluginManager). [main]
+/// (BannedPluginManager). All operations: [main]
 class ZEB_EXPORT PluginModuleScanner : public virtual zebcore::utility::RefCountedObject
 {
 public:

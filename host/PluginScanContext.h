@@ -11,7 +11,7 @@ namespace zebaudiofilterhost
 {
 
 /// A technology's cursor over the plug-ins of one scan. One step loads at most one plug-in or makes one filter.
-/// [main]
+/// All operations: [main]
 class ZEB_EXPORT PluginScanContext : public virtual zebcore::utility::RefCountedObject
 {
 public:

@@ -17,7 +17,7 @@ namespace zebaudiofilterhost
 {
 
 /// What the catalogue knows of one technology: a number, a list of directories and four functions, which the
-/// technology supplies from a static initializer. Signal slots see the list's new value. [main]
+/// technology supplies from a static initializer. Signal slots see the list's new value. All operations: [main]
 class ZEB_EXPORT PluginTechnology : public virtual zebcore::utility::RefCountedObject
 {
 public:
