@@ -19,8 +19,7 @@ using ModuleFunction = void (*)();
 /// then tells which. The caller gives the result to ReleaseOSModule. [main]
 ZEB_EXPORT OSModuleRef LoadOSModule(const UTF16String& path) noexcept;
 
-/// Drops the reference; null is fine. The code stays mapped to the end of the process, since many plug-ins crash when
-/// they are unmapped under their own threads and exit handlers. [main]
+/// Drops the reference; null is fine. Nothing of the module is to be used afterwards. [main]
 ZEB_EXPORT void ReleaseOSModule(OSModuleRef module) noexcept;
 
 /// The file that LoadOSModule would load for this path, without loading it. Empty when there is none;

@@ -159,9 +159,12 @@ void DebugTrace(const unsigned char* text)
 
 void WriteTraceLine(const char* category, const UTF8String& message)
 {
+    // Names of plug-ins come padded with zero units, which would end the line before its time.
+    UTF8String text = message;
+    std::erase(text, u8'\0');
+
     utility::oUTF8StringStream line;
-    line << '<' << threads::GetCurrentThreadID() << "> <" << category << "> <" << kTraceLevel << "> " << message
-         << '\n';
+    line << '<' << threads::GetCurrentThreadID() << "> <" << category << "> <" << kTraceLevel << "> " << text << '\n';
     Trace(reinterpret_cast<const unsigned char*>(line.str().c_str()));
 }
 

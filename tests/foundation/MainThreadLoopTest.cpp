@@ -260,13 +260,35 @@ TEST(MainThreadLoopThreads, CallsFromManyThreadsAllRunHere)
 
 TEST(MainThreadLoopThreads, ACallWakesAWaitingMainThread)
 {
-    // The thread starts only when the main thread is about to wait, and the time-out is the failure.
-    std::thread caller;
-    bool called = false;
-    AsyncCallFromMainThread(
-        [&] { caller = std::thread([&] { AsyncCallFromMainThread([&] { called = true; }, 0); }); }, 0);
-    EXPECT_TRUE(RunMainThreadUntil([&] { return called; }, 60'000));
-    caller.join();
+    // A ball that goes to another thread and back. A main thread that slept through its return would see it only when
+    // it looks up by itself, and would be far too slow.
+    constexpr int kTrips = 500;
+    constexpr unsigned int kTimeoutMs = 5000;
+    std::atomic<int> served{0};
+    int returned = 0;
+    std::thread other(
+        [&]
+        {
+            for (int trip = 0; trip < kTrips; ++trip)
+            {
+                served.wait(trip);
+                AsyncCallFromMainThread([&] { ++returned; }, 0);
+            }
+        });
+    const auto serve = [&]
+    {
+        if (served <= returned && served < kTrips)
+        {
+            ++served;
+            served.notify_one();
+        }
+        return returned == kTrips;
+    };
+    EXPECT_TRUE(RunMainThreadUntil(serve, kTimeoutMs));
+    served = kTrips;
+    served.notify_one();
+    other.join();
+    RunMainThreadUntil([&] { return returned == kTrips; }, kTimeoutMs);
 }
 
 } // namespace

@@ -53,6 +53,14 @@ TEST_F(TraceTest, TakesPathsAndPluginNames)
     EXPECT_TRUE(mLines[0].ends_with("> Path:/\u00e9\uFFFD\u00e9\n"));
 }
 
+TEST_F(TraceTest, LeavesOutZeroUnits)
+{
+    SetAllTraceEnabled(true);
+    ZEB_TRACE("TraceTest::Name", UTF16String{u'a', u'\0', u'\0'} << u'b');
+    ASSERT_EQ(1U, mLines.size());
+    EXPECT_TRUE(mLines[0].ends_with("> ab\n"));
+}
+
 TEST_F(TraceTest, FollowsEachChangeOfTheConfiguration)
 {
     struct Step

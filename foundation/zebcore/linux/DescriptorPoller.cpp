@@ -1,5 +1,9 @@
 #include "foundation/zebcore/DescriptorPoller.h"
 
+// Handlers run on the main thread only, and what they are posted with goes through Asio's own lock. The fences that
+// this leaves out are unknown to ThreadSanitizer.
+#define BOOST_ASIO_DISABLE_FENCED_BLOCK 1
+
 #include <boost/asio/executor_work_guard.hpp>
 #include <boost/asio/io_context.hpp>
 #include <boost/asio/posix/stream_descriptor.hpp>

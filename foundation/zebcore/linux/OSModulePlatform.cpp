@@ -136,7 +136,7 @@ void* OpenModule(const std::string& path, const std::string& binary, std::string
 
 void CloseModule(void* /*handle*/)
 {
-    // No dlclose: the code stays mapped.
+    // No dlclose: many plug-ins crash when they are unmapped under their own threads and exit handlers.
 }
 
 ModuleFunction FindFunction(void* handle, const std::string& name)
