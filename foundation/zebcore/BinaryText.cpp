@@ -52,8 +52,10 @@ bool AppendBytes(std::vector<unsigned char>& data, std::u8string_view digits)
     }
     bits <<= 6U * (kGroupDigits - digits.size());
     const std::size_t count = digits.size() - 1;
-    for (std::size_t i = 0; i < count; ++i)
-        data.push_back(static_cast<unsigned char>(bits >> (16U - 8U * i) & 255U));
+    const std::array<unsigned char, kGroupBytes> bytes = {static_cast<unsigned char>(bits >> 16U & 255U),
+                                                          static_cast<unsigned char>(bits >> 8U & 255U),
+                                                          static_cast<unsigned char>(bits & 255U)};
+    data.insert(data.end(), bytes.data(), bytes.data() + count);
     return (bits & (0xFFFFFFU >> (8U * count))) == 0;
 }
 

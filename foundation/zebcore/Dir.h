@@ -30,7 +30,7 @@ public:
     bool Exists() const;
 
     /// The path as it was given, without a trailing slash. A relative path stays relative.
-    const UTF16String& FullPath() const { return mPath; }
+    UTF16String FullPath() const { return mPath; }
 
     /// Makes the directory and what is missing above it, for the user alone. Throws file_exception.
     void Create() const;

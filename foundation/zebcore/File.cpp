@@ -31,7 +31,7 @@ UTF16String File::GetTitle() const
 {
     const std::u16string_view name = LastComponent(mPath);
     const std::size_t dot = name.rfind(u'.');
-    return UTF16String(dot == name.npos || dot == 0 ? name : name.substr(0, dot));
+    return UTF16String(dot == std::u16string_view::npos || dot == 0 ? name : name.substr(0, dot));
 }
 
 Dir File::GetDir() const

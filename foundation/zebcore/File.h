@@ -19,7 +19,7 @@ public:
     bool Exists() const;
 
     /// The path as it was given, without a trailing slash. A relative path stays relative.
-    const UTF16String& FullPath() const { return mPath; }
+    UTF16String FullPath() const { return mPath; }
 
     /// The last component of the path: the name with its extension.
     UTF16String GetName() const;

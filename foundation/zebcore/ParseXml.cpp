@@ -27,13 +27,13 @@ XmlName SplitName(const XML_Char* expatName)
 {
     const std::u8string_view whole = View(expatName);
     const std::size_t first = whole.find(char8_t{kNameSeparator});
-    if (first == whole.npos)
+    if (first == std::u8string_view::npos)
         return {UTF8String(whole), {}, whole};
     const std::u8string_view uri = whole.substr(0, first);
     const std::u8string_view rest = whole.substr(first + 1);
     const std::size_t second = rest.find(char8_t{kNameSeparator});
     const std::u8string_view local = rest.substr(0, second);
-    if (second == rest.npos)
+    if (second == std::u8string_view::npos)
         return {UTF8String(local), uri, local};
     return {UTF8String(rest.substr(second + 1)).append(u8":").append(local), uri, local};
 }

@@ -15,7 +15,7 @@ constexpr char16_t kSlash = u'/';
 UTF16String WithoutTrailingSlashes(std::u16string_view path)
 {
     const std::size_t last = path.find_last_not_of(kSlash);
-    return UTF16String(last == path.npos ? path.substr(0, 1) : path.substr(0, last + 1));
+    return UTF16String(last == std::u16string_view::npos ? path.substr(0, 1) : path.substr(0, last + 1));
 }
 
 UTF16String Join(const UTF16String& parent, std::u16string_view subPath)
@@ -43,7 +43,7 @@ UTF16String ParentOf(const UTF16String& path)
 std::u16string_view LastComponent(std::u16string_view path)
 {
     const std::size_t slash = path.rfind(kSlash);
-    return slash == path.npos || path.size() == 1 ? path : path.substr(slash + 1);
+    return slash == std::u16string_view::npos || path.size() == 1 ? path : path.substr(slash + 1);
 }
 
 } // namespace zebcore::filesupport

@@ -77,7 +77,7 @@ bool SetFloat(PropList& list, const UTF8String& key, std::u8string_view text)
 bool SetFloats(PropList& list, const UTF8String& key, std::u8string_view text)
 {
     std::list<float> values;
-    for (std::size_t begin = text.find_first_not_of(kBlanks); begin != text.npos;)
+    for (std::size_t begin = text.find_first_not_of(kBlanks); begin != std::u8string_view::npos;)
     {
         const std::size_t end = std::min(text.find_first_of(kBlanks, begin), text.size());
         if (!ParseFloat(text.substr(begin, end - begin), values.emplace_back()))
@@ -132,7 +132,7 @@ bool PropListReader::OnEndElement(const xml::XmlName& /*name*/)
 bool PropListReader::OnCharacters(std::u8string_view text)
 {
     if (mOpenValue == nullptr)
-        return text.find_first_not_of(kBlanks) == text.npos;
+        return text.find_first_not_of(kBlanks) == std::u8string_view::npos;
     mText += text;
     return true;
 }

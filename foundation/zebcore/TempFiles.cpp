@@ -38,7 +38,7 @@ std::string TempPrefix(const File& target)
 
 File InSameDir(const File& target, std::string_view nativeName)
 {
-    return File(target.GetDir(), FromNativePath(nativeName));
+    return {target.GetDir(), FromNativePath(nativeName)};
 }
 
 // The process that made the file, from its name; 0 if it is no temporary file of the prefix.

@@ -152,7 +152,8 @@ void Unescape(std::u8string_view parsed, String& out)
 {
     out.clear();
     std::size_t done = 0;
-    for (std::size_t at = parsed.find(u8'\\'); at != parsed.npos; at = parsed.find(u8'\\', std::max(at + 1, done)))
+    for (std::size_t at = parsed.find(u8'\\'); at != std::u8string_view::npos;
+         at = parsed.find(u8'\\', std::max(at + 1, done)))
     {
         const std::u8string_view rest = parsed.substr(at);
         const std::optional<std::uint32_t> unit = ParseEscape(rest, kUnitForm);

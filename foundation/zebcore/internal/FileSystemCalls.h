@@ -21,7 +21,7 @@ struct FileSystemCalls
     std::function<int(const char* from, const char* to)> mRename;
 };
 
-// Those in force. [main]
+// Those in force. To be changed while nothing is written only.
 FileSystemCalls& FileSystem();
 
 } // namespace zebcore::filesupport
