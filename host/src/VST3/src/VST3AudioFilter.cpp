@@ -214,6 +214,17 @@ void VST3AudioFilter::CreateEditor()
     mVendorEffect = PluginPtr<IVST3CorvaneVendorSpecificEffect>::Query(mController);
 }
 
+bool VST3AudioFilter::HasCustomEditor() const
+{
+    return mEditor && mEditor->HasSupportedView();
+}
+
+// The same one each time.
+boost::intrusive_ptr<AudioFilterEditor> VST3AudioFilter::CreateCustomEditor()
+{
+    return mEditor;
+}
+
 void VST3AudioFilter::ReleaseParameters()
 {
     mParameters.Publish({});
