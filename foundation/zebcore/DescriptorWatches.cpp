@@ -1,6 +1,6 @@
-#include "foundation/zebcore/DescriptorWatches.h"
+#include "foundation/zebcore/internal/DescriptorWatches.h"
 
-#include "foundation/zebcore/MainThreadQueue.h"
+#include "foundation/zebcore/internal/MainThreadQueue.h"
 
 #include <algorithm>
 #include <utility>

@@ -1,9 +1,9 @@
 #include "foundation/zebcore/MainThreadLoop.h"
 
-#include "foundation/zebcore/DescriptorPoller.h"
-#include "foundation/zebcore/DescriptorWatches.h"
-#include "foundation/zebcore/MainThreadQueue.h"
 #include "foundation/zebcore/Threads.h"
+#include "foundation/zebcore/internal/DescriptorPoller.h"
+#include "foundation/zebcore/internal/DescriptorWatches.h"
+#include "foundation/zebcore/internal/MainThreadQueue.h"
 
 #include <algorithm>
 #include <chrono>

@@ -1,4 +1,4 @@
-#include "foundation/zebcore/MainThreadQueue.h"
+#include "foundation/zebcore/internal/MainThreadQueue.h"
 
 #include "foundation/zebcore/HighPrecisionTime.h"
 

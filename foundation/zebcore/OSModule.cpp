@@ -1,7 +1,7 @@
 #include "foundation/zebcore/OSModule.h"
 
-#include "foundation/zebcore/OSModulePlatform.h"
 #include "foundation/zebcore/StringConversion.h"
+#include "foundation/zebcore/internal/OSModulePlatform.h"
 
 #include <utility>
 

@@ -1,4 +1,4 @@
-#include "foundation/zebcore/DescriptorPoller.h"
+#include "foundation/zebcore/internal/DescriptorPoller.h"
 
 // Handlers run on the main thread only, and what they are posted with goes through Asio's own lock. The fences that
 // this leaves out are unknown to ThreadSanitizer.

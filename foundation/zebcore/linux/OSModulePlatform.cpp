@@ -1,4 +1,4 @@
-#include "foundation/zebcore/OSModulePlatform.h"
+#include "foundation/zebcore/internal/OSModulePlatform.h"
 
 #include <dlfcn.h>
 

@@ -1,8 +1,8 @@
-#include "foundation/zebcore/DescriptorPoller.h"
+#include "foundation/zebcore/internal/DescriptorPoller.h"
 
 #include "foundation/zebcore/MainThreadLoop.h"
-#include "foundation/zebcore/MainThreadQueue.h"
 #include "foundation/zebcore/Trace.h"
+#include "foundation/zebcore/internal/MainThreadQueue.h"
 
 #include <CoreFoundation/CoreFoundation.h>
 

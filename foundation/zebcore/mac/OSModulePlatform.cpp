@@ -1,4 +1,4 @@
-#include "foundation/zebcore/OSModulePlatform.h"
+#include "foundation/zebcore/internal/OSModulePlatform.h"
 
 #include "foundation/zebcore/StringConversion.h"
 #include "foundation/zebcore/mac/MACtoZEB.h"

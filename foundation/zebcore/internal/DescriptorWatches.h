@@ -1,7 +1,7 @@
 #pragma once
 
-#include "foundation/zebcore/DescriptorPoller.h"
 #include "foundation/zebcore/MainThreadLoop.h"
+#include "foundation/zebcore/internal/DescriptorPoller.h"
 
 #include <boost/function.hpp>
 
