@@ -62,6 +62,11 @@ void LeaveModule(OSModuleRef module)
     }
 }
 
+UTF16String Quoted(const UTF16String& path)
+{
+    return u"\"" + path + u"\"";
+}
+
 UTF16String WithoutDoubledSlashes(UTF16String path)
 {
     for (std::size_t place = path.find(u"//"); place != UTF16String::npos; place = path.find(u"//"))
@@ -96,20 +101,20 @@ bool VST3PluginModule::Load()
     ZEB_TRACE("VST3PluginModule::Load", "Unloading due to error");
     // The exit function is not called on this road, although the entry function was.
     PluginModule::Unload();
-    SetLoadProblem(GetPath(), GetPath() + (accepted ? problem : u": its entry function refuses to start."));
+    SetLoadProblem(GetPath(), Quoted(GetPath()) + (accepted ? problem : u" refused to start."));
     return false;
 }
 
-// Null, or what is wrong.
+// Null, or what is wrong, as the end of a sentence that the path begins.
 const char16_t* VST3PluginModule::TakeFactory()
 {
     const auto getFactory =
         reinterpret_cast<FactoryFunction>(GetFunctionPointerFromModuleImpl(GetOSModule(), "GetPluginFactory"));
     if (!getFactory)
-        return u": it does not export GetPluginFactory, so it is no VST 3 plug-in.";
+        return u" is not a VST 3 plug-in: it does not export GetPluginFactory.";
     Steinberg::IPluginFactory* factory = getFactory();
     if (!factory)
-        return u": its GetPluginFactory gives no factory.";
+        return u" does not work: its GetPluginFactory gives no factory.";
     mFactory = factory;
     return nullptr;
 }
@@ -160,7 +165,9 @@ boost::intrusive_ptr<VST3PluginModule> GetVST3Plugin(const UTF16String& path)
     const UTF16String cleaned = WithoutDoubledSlashes(path);
     if (!Dir(cleaned).Exists())
     {
-        PluginModule::SetLoadProblem(path, path + u": there is no such folder. A VST 3 plug-in is a folder.");
+        const bool isFile = File(cleaned).Exists();
+        PluginModule::SetLoadProblem(
+            path, Quoted(path) + (isFile ? u" is a file; a VST 3 plug-in is a folder." : u" does not exist."));
         return nullptr;
     }
     boost::intrusive_ptr<VST3PluginModule> module(new VST3PluginModule(cleaned));
