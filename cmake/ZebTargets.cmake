@@ -61,6 +61,7 @@ function(zeb_add_shared_library)
     target_include_directories(zebaudiofilterhost PUBLIC
         $<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}> $<INSTALL_INTERFACE:${CMAKE_INSTALL_INCLUDEDIR}/zebaudiofilterhost>)
     target_link_libraries(zebaudiofilterhost PUBLIC Boost::boost Threads::Threads)
+    target_compile_features(zebaudiofilterhost PUBLIC cxx_std_20)
     if(NOT APPLE)
         target_link_options(zebaudiofilterhost PRIVATE LINKER:--exclude-libs,ALL
             LINKER:--version-script=${PROJECT_SOURCE_DIR}/cmake/zebaudiofilterhost.map)
