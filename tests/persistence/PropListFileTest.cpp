@@ -22,7 +22,7 @@ namespace
 class PropListFile : public testing::Test
 {
 protected:
-    ~PropListFile() override { filesupport::Dir::SetPrefDir(filesupport::Dir()); }
+    void TearDown() override { filesupport::Dir::SetPrefDir(filesupport::Dir()); }
 
     static PropList OneEntry(const UTF8String& key, int value)
     {

@@ -31,7 +31,7 @@ int Fail(int error)
 class SafeSaveTest : public testing::Test
 {
 protected:
-    ~SafeSaveTest() override { FileSystem() = FileSystemCalls(); }
+    void TearDown() override { FileSystem() = FileSystemCalls(); }
 
     static void Save(File target, const UTF8String& text)
     {
