@@ -37,9 +37,11 @@ AudioFilter::~AudioFilter() = default;
 
 void AudioFilter::TickWhileHeld()
 {
-    // A queued message may hold the last reference, and the tick purges it. A filter that nobody holds yet, because
-    // it is still being made, must not get its first and last reference from here.
-    const boost::intrusive_ptr<AudioFilter> held(GetRefCount() > 0 ? this : nullptr);
+    // Nobody holds a filter that is being made or destroyed. Plug-ins may run the main loop from inside both.
+    if (GetRefCount() == 0)
+        return;
+    // A queued message may hold the last reference, and the tick purges it.
+    const boost::intrusive_ptr<AudioFilter> held(this);
     OnUITimerTick();
 }
 

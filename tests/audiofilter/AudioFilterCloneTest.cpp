@@ -3,6 +3,7 @@
 #include "host/AudioFilterFactory.h"
 #include "tests/audiofilter/RecordingFilter.h"
 #include "utility/EffectUtils.h"
+#include "utility/ThreadUtils.h"
 
 #include <gtest/gtest.h>
 
@@ -21,6 +22,7 @@ class AudioFilterCloneTest : public ::testing::Test
 protected:
     static void SetUpTestSuite()
     {
+        InitializeMainThreadID();
         const Guid guid = Guid::CreateUnique();
         AudioFilterFactory::GetInstance().RegisterFactoryFunction(guid,
                                                                   [](const UTF16String&)

@@ -6,7 +6,7 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include <limits>
+#include <memory>
 #include <thread>
 
 namespace zebaudiofilterhost
@@ -146,13 +146,21 @@ TEST_F(AudioFilterTest, APostedParameterKeepsTheFilterAliveAndItsTickSurvivesThe
     EXPECT_EQ(neighbour->mParameterCalls.size(), 1U);
 }
 
-TEST_F(AudioFilterTest, ATickLeavesAFilterAloneThatNobodyHoldsYet)
+TEST_F(AudioFilterTest, ATickPassesByAFilterThatIsBeingMadeOrDestroyed)
 {
-    bool destroyed = false;
-    auto filter = std::make_unique<RecordingFilter>(std::vector<int>{}, std::vector<int>{});
-    filter->mDestroyed = &destroyed;
+    struct Ticking : public AudioFilter
+    {
+        explicit Ticking(int& ticks) : AudioFilter(u"id", u"name"), mTicks(ticks) {}
+        void OnUITimerTick() override { ++mTicks; }
+        int& mTicks;
+    };
+    int ticks = 0;
+    auto unheld = std::make_unique<Ticking>(ticks);
     Tick();
-    EXPECT_FALSE(destroyed);
+    EXPECT_EQ(ticks, 0);
+    const boost::intrusive_ptr<AudioFilter> held(unheld.release());
+    Tick();
+    EXPECT_EQ(ticks, 1);
 }
 
 TEST_F(AudioFilterTest, AutomatedParameterIsSetBeforeTheSignal)

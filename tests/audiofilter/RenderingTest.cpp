@@ -1,6 +1,7 @@
 // Blocks through the channel maps.
 #include "foundation/zebcore/Trace.h"
 #include "tests/audiofilter/RecordingFilter.h"
+#include "utility/ThreadUtils.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -28,6 +29,8 @@ constexpr auto kOutput = AudioFilter::kDirection_Output;
 class RenderingTest : public ::testing::Test
 {
 protected:
+    RenderingTest() { InitializeMainThreadID(); }
+
     // A running filter with maps in use; maps are given as application channel to plug-in channel.
     void Start(const std::vector<int>& inputs, const std::vector<int>& outputs, int mainChannels,
                const std::map<int, int>& inputMap, const std::map<int, int>& outputMap, int latency = 0)
@@ -275,6 +278,7 @@ TEST_F(RenderingTest, QueuedParametersComeBeforeTheBlock)
     filter->Resume();
     filter->PostSetParameter(0, 0.5F);
     filter->ProcessWithMapping(nullptr, nullptr, 0, ChannelFlags(), mFlags);
+    filter->FlushMessageQueue(); // Until then the message holds the filter
     EXPECT_EQ(filter->mSeen, 1U);
     EXPECT_EQ(mFlags.Value(), 0U);
 }
