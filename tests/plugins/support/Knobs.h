@@ -47,7 +47,7 @@ enum class Knob
     kThreadEdits,      // 1: while processing, a thread of the plug-in's own calls performEdit
     kThreadRestarts,   // flags of restartComponent calls by such a thread, 0 for none
     kRecordContext,    // 1: records the process context with every block
-                    // controller
+                       // controller
     kControllerInitializeResult,
     kParameterCount, // what getParameterCount says; kReal
     kParameterInfoResult,
