@@ -53,9 +53,9 @@ AudioFilterProxy::AudioFilterProxy(const boost::intrusive_ptr<AudioFilter>& filt
     const int count = filter->GetParameterCount();
     for (int index = 0; index < count; ++index)
     {
+        const float value = filter->GetParameter(index);
         const boost::intrusive_ptr<AudioFilterParameterInfo> info = filter->GetParameterInfo(index);
-        AppendParameter(filter->GetParameter(index), info ? info->GetUnit() : kNoUnit,
-                        info && info->CanBeAutomated());
+        AppendParameter(value, info ? info->GetUnit() : kNoUnit, info && info->CanBeAutomated());
     }
 
     SetUseChannelMap(filter->GetUseChannelMap());
