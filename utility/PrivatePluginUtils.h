@@ -22,10 +22,14 @@ ZEB_EXPORT extern const zebcore::UTF16String kVST3PluginExtensionPlaceholder;
 ZEB_EXPORT extern const zebcore::UTF16String kVSTPluginExtension;
 ZEB_EXPORT extern const zebcore::UTF16String kVST3PluginExtension;
 
-/// Scans the two folders, whatever the block lists say, and writes the text to `resultPath`, the old file or the new
-/// one, whole. An empty folder name, or a folder that is not there, has no plug-ins. Afterwards this process uses the
-/// new configuration, and the user's catalogue is loaded again from the preference folder: unsaved records are gone.
-/// Exceptions of the file layer pass through. A plug-in that crashes takes the process along and leaves the old file.
+/// Scans the two folders, banned plug-ins included, and writes the text to `resultPath`, the old file or the new one,
+/// whole. An empty folder name, or a folder that is not there, has no plug-ins. Afterwards this process uses the new
+/// configuration, and the user's catalogue is loaded again from the preference folder: unsaved records are gone.
+/// Exceptions of the file layer pass through, and the catalogue then holds the scanned plug-ins alone. A plug-in that
+/// crashes takes the process along and leaves the old file.
+///
+/// Folders are replaced as text, wherever it stands. So give full paths, with a slash at the end either here and to
+/// the setters or to none of them; and if there are both folders, that of VST 2 must not have "vst3" in its path.
 /// [main]
 ZEB_EXPORT void BuildPrivatePluginConfig(const zebcore::UTF16String& resultPath,
                                          const zebcore::UTF16String& vstDirectory,

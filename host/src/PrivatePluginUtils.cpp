@@ -27,7 +27,7 @@ namespace
 
 constexpr unsigned long long kMaxTextLength = 4294967294ULL; // Bytes
 
-// The block lists are not asked: what an application ships is its own affair.
+// The list of banned plug-ins is not asked: what an application ships is its own affair.
 void AppendBundles(const UTF16String& directory, std::u16string_view extension, TechnologyType type,
                    std::vector<PluginLocator>& locators)
 {
@@ -49,14 +49,16 @@ void AppendBundles(const UTF16String& directory, std::u16string_view extension, 
 
 void ReplaceAll(UTF16String& text, const UTF16String& what, const UTF16String& with)
 {
-    if (what.empty())
+    // Into a new text: moving the rest at each place would make long configurations slow to load.
+    UTF16String replaced;
+    std::size_t done = 0;
+    for (std::size_t at = text.find(what); at != UTF16String::npos; at = text.find(what, done))
     {
-        return;
+        replaced.append(text, done, at - done).append(with);
+        done = at + what.size();
     }
-    for (std::size_t at = text.find(what); at != UTF16String::npos; at = text.find(what, at + with.size()))
-    {
-        text.replace(at, what.size(), with);
-    }
+    replaced.append(text, done);
+    text.swap(replaced);
 }
 
 UTF16String Escaped(const UTF16String& text)
@@ -68,7 +70,8 @@ UTF16String Escaped(const UTF16String& text)
 
 void Scan(const std::vector<PluginLocator>& locators)
 {
-    const boost::intrusive_ptr<PluginModuleScanner> scanner(new PluginModuleScanner(locators, true));
+    constexpr bool kSkipCategory = true;
+    const boost::intrusive_ptr<PluginModuleScanner> scanner(new PluginModuleScanner(locators, kSkipCategory));
     scanner->BeginScan();
     PluginLocator locator;
     UTF16String detail;
@@ -78,9 +81,11 @@ void Scan(const std::vector<PluginLocator>& locators)
     {
         scanner->ContinueScan();
     }
+    // No EndScan: there was no record before, so there is no enabled state to bring back.
 }
 
 // Works on the text alone: a name that happens to hold "vst" is replaced too, and comes back when the text is read.
+// VST 3 comes first, as "vst" is a part of "vst3".
 void PutPlaceholders(UTF16String& text, const UTF16String& vstDirectory, const UTF16String& vst3Directory)
 {
     if (!vst3Directory.empty())
@@ -163,9 +168,8 @@ void SetPrivatePluginConfigFromFile(const UTF16String& path, const UTF16String& 
     {
         return;
     }
-    std::vector<unsigned char> bytes(static_cast<std::size_t>(length));
-    bytes.resize(stream.ReadBlock(bytes.data(), static_cast<unsigned int>(length)));
-    const UTF8String text(bytes.begin(), bytes.end());
+    UTF8String text(static_cast<std::size_t>(length), u8'\0');
+    text.resize(stream.ReadBlock(reinterpret_cast<unsigned char*>(text.data()), static_cast<unsigned int>(length)));
     SetPrivatePluginConfig(zebcore::utility::UTF8to16(text, nullptr, nullptr), vst3Directory, vstDirectory);
 }
 
