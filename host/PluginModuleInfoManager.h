@@ -64,7 +64,7 @@ public:
     void ReadPluginInfos(const PropList& list, PluginInfoMap& infos, PluginInfoVector& order, bool merge) const;
     void WritePluginInfos(PropList& list) const;
     /// A technology without a section keeps its directories.
-    void ReadDirectories(const PropList& list);
+    void ReadDirectories(const PropList& list) const;
     void WriteDirectories(PropList& list) const;
 
     /// A file that is missing or of another version counts as none: then the external descriptors are those of the
@@ -84,7 +84,7 @@ public:
     /// Drops all records and external descriptors; the private ones come back unless `withoutPrivate`. No signal.
     void ClearAll(bool withoutPrivate);
 
-    void ResetToDefaultFolders();
+    void ResetToDefaultFolders() const;
     /// What is on disk, as each technology finds it: all of it, or with `onlyNew` what has no record. `removed`
     /// receives the recorded plug-ins that are no longer found. A plug-in that changed in place is not noticed.
     std::vector<PluginLocator> CollectPotentialPlugins(bool onlyNew, std::vector<PluginLocator>& removed) const;
@@ -104,7 +104,7 @@ private:
 
     void LoadCurrentConfiguration(const PropList& list);
     void LoadWithoutFile();
-    void ReadTechnologyDirectories(const PropList& list);
+    void ReadTechnologyDirectories(const PropList& section) const;
 
     std::map<TechnologyType, TechnologyPtr> mTechnologies;
     PluginInfoMap mInfos;

@@ -104,7 +104,7 @@ void AudioFilterDescriptorManager::ClearInfosForLocators(const std::vector<Plugi
 {
     const std::set<PluginLocator> doomed(locators.begin(), locators.end());
     std::erase_if(mDescriptors,
-                  [&doomed](const DescriptorPtr& descriptor) { return doomed.count(descriptor->GetLocator()) != 0; });
+                  [&doomed](const DescriptorPtr& descriptor) { return doomed.contains(descriptor->GetLocator()); });
     mDescriptorMap = BuildComponentDescriptorMap(mDescriptors);
 }
 

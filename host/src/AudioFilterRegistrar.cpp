@@ -29,11 +29,10 @@ AudioFilterRegistrar::FactoryVector& AudioFilterRegistrar::GetFactoryVector()
 
 void AudioFilterRegistrar::RegisterDeferredDescriptors()
 {
-    const FactoryVector& factories = GetFactoryVector();
-    for (std::size_t index = 0; index < factories.size(); ++index)
+    // By index and with a copy of the pair: a descriptor function may itself make a registrar.
+    for (std::size_t index = 0; index < GetFactoryVector().size(); ++index)
     {
-        // A copy: a descriptor function may itself make a registrar.
-        const auto [descriptorFunction, factoryFunction] = factories[index];
+        const auto [descriptorFunction, factoryFunction] = GetFactoryVector()[index];
         const boost::intrusive_ptr<AudioFilterDescriptor> descriptor = descriptorFunction();
         if (descriptor)
         {

@@ -138,7 +138,7 @@ void BannedPluginManager::RemoveBannedPlugin(const PluginLocator& locator)
 
 bool BannedPluginManager::IsPluginBanned(const PluginLocator& locator) const
 {
-    return mBannedPlugins.count(locator) != 0;
+    return mBannedPlugins.contains(locator);
 }
 
 bool BannedPluginManager::IsPluginBannedStatically(const UTF16String& fileName, const UTF16String& uniqueID,

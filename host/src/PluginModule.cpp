@@ -99,9 +99,13 @@ UTF16String PluginModule::GetLoadProblem(const UTF16String& path)
 void PluginModule::SetLoadProblem(const UTF16String& path, const UTF16String& problem)
 {
     if (problem.empty())
+    {
         LoadProblems().erase(path);
+    }
     else
+    {
         LoadProblems().insert_or_assign(path, problem);
+    }
 }
 
 } // namespace zebaudiofilterhost

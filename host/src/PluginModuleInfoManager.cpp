@@ -123,7 +123,7 @@ void PluginModuleInfoManager::SetPluginEnabled(const PluginLocator& locator, boo
     }
 }
 
-void PluginModuleInfoManager::ResetToDefaultFolders()
+void PluginModuleInfoManager::ResetToDefaultFolders() const
 {
     for (const TechnologyPtr& technology : GetPluginTechnologies())
     {
@@ -145,7 +145,7 @@ std::vector<PluginLocator> PluginModuleInfoManager::CollectPotentialPlugins(bool
     std::vector<PluginLocator> gone;
     for (const auto& [locator, info] : mInfos)
     {
-        if (onDisk.count(locator) == 0)
+        if (!onDisk.contains(locator))
         {
             gone.push_back(locator);
         }
@@ -154,7 +154,7 @@ std::vector<PluginLocator> PluginModuleInfoManager::CollectPotentialPlugins(bool
 
     if (onlyNew)
     {
-        std::erase_if(found, [this](const PluginLocator& locator) { return mInfos.count(locator) != 0; });
+        std::erase_if(found, [this](const PluginLocator& locator) { return mInfos.contains(locator); });
     }
     return found;
 }
@@ -177,8 +177,7 @@ void PluginModuleInfoManager::RemovePluginLocators(const std::vector<PluginLocat
     {
         return;
     }
-    std::erase_if(mInfosInOrder,
-                  [&removedInfos](const PluginInfoPtr& info) { return removedInfos.count(info) != 0; });
+    std::erase_if(mInfosInOrder, [&removedInfos](const PluginInfoPtr& info) { return removedInfos.contains(info); });
     AudioFilterDescriptorManager::GetInstance().ClearInfosForLocators(removed);
     mPluginInfosChangedSignal();
 }

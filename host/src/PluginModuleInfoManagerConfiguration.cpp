@@ -85,7 +85,7 @@ void PluginModuleInfoManager::ReadPluginInfos(const PropList& list, PluginInfoMa
         infos.emplace(info->GetLocator(), info);
         order.push_back(info);
     }
-    std::erase_if(order, [&replaced](const PluginInfoPtr& info) { return replaced.count(info) != 0; });
+    std::erase_if(order, [&replaced](const PluginInfoPtr& info) { return replaced.contains(info); });
 }
 
 void PluginModuleInfoManager::WritePluginInfos(PropList& list) const
@@ -97,7 +97,7 @@ void PluginModuleInfoManager::WritePluginInfos(PropList& list) const
     }
 }
 
-void PluginModuleInfoManager::ReadDirectories(const PropList& list)
+void PluginModuleInfoManager::ReadDirectories(const PropList& list) const
 {
     int count = 0;
     list.GetValue(kKey_NumTechInfos, count);
@@ -110,7 +110,7 @@ void PluginModuleInfoManager::ReadDirectories(const PropList& list)
     }
 }
 
-void PluginModuleInfoManager::ReadTechnologyDirectories(const PropList& section)
+void PluginModuleInfoManager::ReadTechnologyDirectories(const PropList& section) const
 {
     int type = kTechnologyNone;
     section.GetValue(kKey_TechType, type);
