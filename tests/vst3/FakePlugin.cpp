@@ -1,6 +1,7 @@
 #include "tests/vst3/FakePlugin.h"
 
 #include "tests/vst3/FakeObject.h"
+#include "utility/ThreadUtils.h"
 
 #include <algorithm>
 
@@ -87,6 +88,7 @@ FakePlugin::FakePlugin()
     , classInfoW(kComponentClass, PClassInfo::kManyInstances, kVstAudioEffectClass, u"Class Three", 0, "Fx|Reverb",
                  u"Vendor Three", u"1", u"VST 3.7.2")
 {
+    zebaudiofilterhost::InitializeMainThreadID();
 }
 
 FakePlugin::~FakePlugin() = default;

@@ -65,7 +65,7 @@ struct FakeProgramList
     std::u16string prefix; // a program is called by it and its number, from 0
 };
 
-// The script and the log. Outlives every object made from it.
+// The script and the log. Outlives every object made from it. Makes the test's thread the main thread.
 class FakePlugin
 {
 public:

@@ -87,8 +87,11 @@ protected:
 
     void TearDown() override
     {
-        if (filter)
-            filter->Suspend();
+        if (!filter)
+            return;
+        filter->Suspend();
+        while (filter->GetRefCount() > 1) // queued messages keep it alive
+            filter->FlushMessageQueue();
     }
 
     FakePlugin plugin;

@@ -1,7 +1,6 @@
 // A VST 3 filter whose plug-in calls its host from threads of its own while audio runs.
 
 #include "tests/vst3/FakePlugin.h"
-#include "utility/ThreadUtils.h"
 
 #include <gtest/gtest.h>
 
@@ -30,7 +29,6 @@ void RunBlocks(zebaudiofilterhost::AudioFilter& filter, int count)
 
 TEST(FilterThreads, RestartsAndEditsWhileAudioRuns)
 {
-    zebaudiofilterhost::InitializeMainThreadID();
     constexpr int kBlocks = 3000;
     FakePlugin plugin;
     for (ParamID id = 0; id < 20; ++id)
@@ -77,12 +75,13 @@ TEST(FilterThreads, RestartsAndEditsWhileAudioRuns)
     restarter.join();
     editor.join();
     filter->Suspend();
+    while (filter->GetRefCount() > 1) // queued messages keep it alive
+        filter->FlushMessageQueue();
     EXPECT_EQ(filter->GetParameterCount(), 20);
 }
 
 TEST(FilterThreads, RestartFromInsideProcess)
 {
-    zebaudiofilterhost::InitializeMainThreadID();
     FakePlugin plugin;
     plugin.parameters = {{1}, {2}};
     const auto filter = plugin.MakeFilter();
