@@ -86,28 +86,28 @@ public:
     void OnUITimerTick() override;
     void FlushMessageQueue() override;
 
-    /// FUnknown of all faces: the counts are no counts, each returns 1. [any]
+    // FUnknown of all faces: the counts are no counts, each returns 1. [any]
     Steinberg::tresult PLUGIN_API queryInterface(const Steinberg::TUID interfaceID, void** obj) override;
     Steinberg::uint32 PLUGIN_API addRef() override;
     Steinberg::uint32 PLUGIN_API release() override;
 
-    /// IHostApplication [any]
+    // IHostApplication [any]
     Steinberg::tresult PLUGIN_API getName(Steinberg::Vst::String128 name) override;
     Steinberg::tresult PLUGIN_API createInstance(Steinberg::TUID classID, Steinberg::TUID interfaceID,
                                                  void** obj) override;
 
-    /// IComponentHandler [any]
+    // IComponentHandler [any]
     Steinberg::tresult PLUGIN_API beginEdit(Steinberg::Vst::ParamID id) override;
     Steinberg::tresult PLUGIN_API performEdit(Steinberg::Vst::ParamID id, Steinberg::Vst::ParamValue value) override;
     Steinberg::tresult PLUGIN_API endEdit(Steinberg::Vst::ParamID id) override;
     Steinberg::tresult PLUGIN_API restartComponent(Steinberg::int32 flags) override;
 
-    /// IUnitHandler [any]
+    // IUnitHandler [any]
     Steinberg::tresult PLUGIN_API notifyUnitSelection(Steinberg::Vst::UnitID unitID) override;
     Steinberg::tresult PLUGIN_API notifyProgramListChange(Steinberg::Vst::ProgramListID listID,
                                                           Steinberg::int32 programIndex) override;
 
-    /// IVST3CorvaneVendorSpecificHost [main]
+    // IVST3CorvaneVendorSpecificHost [main]
     Steinberg::int32 PLUGIN_API GetUILanguage() override;
     Steinberg::int32 PLUGIN_API GetThemeXMLLength() override;
     void PLUGIN_API GetThemeXML(unsigned char* buffer) override;
@@ -115,7 +115,7 @@ public:
     const char* PLUGIN_API GetUILanguageString() override;
 
 private:
-    /// Construction, in this order.
+    // Construction, in this order.
     UTF16String ReadClassInfo(const Steinberg::PClassInfo& classInfo);
     UTF16String ReadUnicodeClassInfo(Steinberg::IPluginFactory3& factory);
     UTF16String ReadClassInfo2(Steinberg::IPluginFactory2& factory);
@@ -125,7 +125,7 @@ private:
     void FindFactoryPresets();
     void CreateEditor();
 
-    /// Destruction, in this order.
+    // Destruction, in this order.
     void ReleaseParameters();
     void DisconnectController();
     void ReleaseController();
@@ -133,7 +133,7 @@ private:
 
     Steinberg::FUnknown* HostContext();
 
-    /// Buses, while suspended.
+    // Buses, while suspended.
     void BuildIOConfiguration();
     std::vector<AudioFilterBusDescription> ReadBuses(Steinberg::Vst::BusDirection direction);
     void ActivateBuses(Steinberg::Vst::BusDirection direction, Steinberg::Vst::BusType type);
@@ -143,7 +143,7 @@ private:
     void FillProcessData();
     void FlushParameterChanges();
 
-    /// Parameters.
+    // Parameters.
     void BuildParameterInfos();
     void TakeProgramChange(std::uint32_t id, int index);
     void FitParameterQueues();
@@ -152,7 +152,7 @@ private:
     bool FindParameterID(int index, std::uint32_t& id) const;
     int FindParameterIndex(Steinberg::Vst::ParamID id) const;
 
-    /// The process thread's.
+    // The process thread's.
     void UpdateProcessContext();
     void UpdateMusicalTime(const utility::Tempo& tempo);
     void PassInputSilence(ChannelFlags inFlags);
@@ -194,8 +194,7 @@ private:
     ParameterChanges mOutputChanges;         // what process writes
     ParameterChangeTransfer mOutputTransfer; // waiting for the controller
     bool mProcessErrorReported = false;
-    std::atomic<int> mWantedQueues =
-        -1; // number of parameters that the parameter changes have not been fitted to yet
+    std::atomic<int> mWantedQueues = -1; // what the parameter changes are to be fitted to next; -1 for nothing
     std::atomic<bool> mFlushing = false;
     HostRunLoop mRunLoop;
 };
