@@ -108,7 +108,7 @@ void RemoveTimerWatch(WatchID watch)
     GetLoop().mQueue.Remove(watch);
 }
 
-void SetMainThreadClock(boost::function<unsigned long long()> nanos)
+void SetMainThreadClock(const boost::function<unsigned long long()>& nanos)
 {
     GetLoop().mQueue.SetClock(nanos);
     ScheduleNextPump();

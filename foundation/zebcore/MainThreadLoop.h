@@ -42,6 +42,6 @@ ZEB_EXPORT void RemoveTimerWatch(WatchID watch);
 
 /// For tests: the clock, in nanoseconds, that decides what is due. What is queued keeps the time it still has to
 /// wait. While a clock is set, nothing ever sleeps. An empty function restores the real clock. [main]
-ZEB_EXPORT void SetMainThreadClock(boost::function<unsigned long long()> nanos);
+ZEB_EXPORT void SetMainThreadClock(const boost::function<unsigned long long()>& nanos);
 
 } // namespace zebcore::threads

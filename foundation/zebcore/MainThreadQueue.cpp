@@ -19,14 +19,14 @@ MainThreadQueue::Nanos NextTurn(MainThreadQueue::Nanos due, MainThreadQueue::Nan
     return due + period * ((now - due) / period + 1);
 }
 
-/// Marks a call as running, also when it ends with an exception.
-class RunningMark
+/// Ends a run, also when it ends with an exception.
+class RunEnd
 {
 public:
-    explicit RunningMark(bool& running) : mRunning(running) { mRunning = true; }
-    RunningMark(const RunningMark&) = delete;
-    RunningMark& operator=(const RunningMark&) = delete;
-    ~RunningMark() { mRunning = false; }
+    explicit RunEnd(bool& running) : mRunning(running) {}
+    RunEnd(const RunEnd&) = delete;
+    RunEnd& operator=(const RunEnd&) = delete;
+    ~RunEnd() { mRunning = false; }
 
 private:
     bool& mRunning;
@@ -81,7 +81,8 @@ bool MainThreadQueue::RunDue()
         Call& call = *entry->mCall;
         if (call.mRunning)
             continue;
-        const RunningMark mark(call.mRunning);
+        call.mRunning = true;
+        const RunEnd end(call.mRunning);
         ran = true;
         call.mFunction();
     }

@@ -32,7 +32,7 @@ UTF16String NumberToString(double value, unsigned long /*integerDigits*/, unsign
 {
     std::array<char, kLongestText> buffer{};
     const int precision = static_cast<int>(std::min(decimals, kMostDecimals));
-    const auto end =
+    const auto* end =
         std::to_chars(buffer.data(), buffer.data() + buffer.size(), value, std::chars_format::fixed, precision).ptr;
     return AsciiToUTF16(WithoutSignOfZero({buffer.data(), static_cast<std::size_t>(end - buffer.data())}));
 }

@@ -3,7 +3,7 @@
 #include "foundation/zebcore/StringConversion.h"
 #include "foundation/zebcore/internal/OSModulePlatform.h"
 
-#include <utility>
+#include <memory>
 
 namespace zebcore::utility
 {
@@ -60,7 +60,9 @@ OSModuleRef LoadOSModule(const UTF16String& path) noexcept
                                if (binary.empty())
                                    return nullptr;
                                void* handle = platform::OpenModule(narrowPath, binary, LastFailure());
-                               return handle == nullptr ? nullptr : new OSModule{handle, UTF16FromNarrow(binary)};
+                               if (handle == nullptr)
+                                   return nullptr;
+                               return std::make_unique<OSModule>(OSModule{handle, UTF16FromNarrow(binary)}).release();
                            });
 }
 

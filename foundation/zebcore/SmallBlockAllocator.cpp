@@ -8,9 +8,9 @@ void* SmallBlockAllocator::Allocate(std::size_t size)
     return ::operator new(size);
 }
 
-void SmallBlockAllocator::Dispose(void* block, std::size_t size) noexcept
+void SmallBlockAllocator::Dispose(void* block, std::size_t /*size*/) noexcept
 {
-    ::operator delete(block, size);
+    ::operator delete(block);
 }
 
 } // namespace zebcore::utility

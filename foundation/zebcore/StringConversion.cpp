@@ -89,11 +89,12 @@ UTF8String UTF16to8(std::u16string_view text)
 UTF16String UTF8to16(std::u8string_view text, UnicodeErrorCode* errorCode, unsigned long* errorPosition)
 {
     const std::string_view narrow = AsNarrow(text);
-    const auto firstIllFormed = utf8::find_invalid(narrow.begin(), narrow.end());
+    const char* end = narrow.data() + narrow.size();
+    const char* firstIllFormed = utf8::find_invalid(narrow.data(), end);
     if (errorCode != nullptr)
-        *errorCode = firstIllFormed == narrow.end() ? kUnicodeError_None : kUnicodeError_IllFormed;
+        *errorCode = firstIllFormed == end ? kUnicodeError_None : kUnicodeError_IllFormed;
     if (errorPosition != nullptr)
-        *errorPosition = static_cast<unsigned long>(firstIllFormed - narrow.begin());
+        *errorPosition = static_cast<unsigned long>(firstIllFormed - narrow.data());
     return UTF16FromNarrow(narrow);
 }
 
@@ -104,7 +105,7 @@ std::string NarrowFromUTF8(std::u8string_view text)
 
 UTF8String UTF8FromNarrow(std::string_view text)
 {
-    return UTF8String(reinterpret_cast<const char8_t*>(text.data()), text.size());
+    return {reinterpret_cast<const char8_t*>(text.data()), text.size()};
 }
 
 std::string NarrowFromUTF16(std::u16string_view text)

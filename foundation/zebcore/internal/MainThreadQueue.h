@@ -4,7 +4,6 @@
 
 #include <boost/function.hpp>
 
-#include <compare>
 #include <map>
 #include <memory>
 #include <mutex>
@@ -49,7 +48,10 @@ private:
         Nanos mDue;
         WatchID mSequence;
 
-        auto operator<=>(const Key&) const = default;
+        bool operator<(const Key& other) const
+        {
+            return mDue != other.mDue ? mDue < other.mDue : mSequence < other.mSequence;
+        }
     };
     struct Entry
     {
