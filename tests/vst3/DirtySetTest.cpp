@@ -40,10 +40,11 @@ TEST(DirtySet, TakesWhatWasAddedInOrder)
         SCOPED_TRACE(test.mSize);
         DirtySet set(test.mSize);
         EXPECT_FALSE(set.MayHaveAny());
-        for (auto number = test.mNumbers.rbegin(); number != test.mNumbers.rend(); ++number)
+        const std::vector<std::size_t> descending(test.mNumbers.rbegin(), test.mNumbers.rend());
+        for (const std::size_t number : descending)
         {
-            set.Add(*number);
-            set.Add(*number);
+            set.Add(number);
+            set.Add(number);
         }
         EXPECT_EQ(set.MayHaveAny(), !test.mNumbers.empty());
         EXPECT_EQ(TakeAll(set), test.mNumbers);

@@ -128,7 +128,7 @@ TEST_F(HostAttributeListTest, KeysAreCaseSensitiveAndReplaced)
 TEST_F(HostAttributeListTest, GetStringCopiesUnitsWithoutTerminator)
 {
     EXPECT_EQ(mList->setString("t", u"0123456789"), kResultOk);
-    std::array<char16_t, 12> buffer;
+    std::array<char16_t, 12> buffer{};
     buffer.fill(u'#');
     EXPECT_EQ(mList->getString("t", buffer.data(), 4), kResultOk);
     EXPECT_TRUE(std::u16string(buffer.begin(), buffer.end()) == u"0123########");

@@ -62,6 +62,7 @@ TEST(ParameterTransportThreads, ManyWritersOfOneParameter)
     transfer.SetParameterIDs({7});
     std::atomic<int> running{kWriters};
     std::vector<std::jthread> writers;
+    writers.reserve(kWriters);
     for (int writer = 0; writer < kWriters; ++writer)
         writers.emplace_back(
             [&, writer]
@@ -110,6 +111,7 @@ TEST(ParameterTransportThreads, NothingIsLostThatFits)
             }
         });
     std::vector<std::jthread> writers;
+    writers.reserve(kWriters);
     for (int writer = 0; writer < kWriters; ++writer)
         writers.emplace_back(
             [&, writer]
@@ -135,6 +137,7 @@ TEST(ParameterTransportThreads, NewIDsWhileOthersReadAndWrite)
     transfer.SetParameterIDs({1, 2});
     std::atomic<bool> stop{false};
     std::vector<std::jthread> threads;
+    threads.reserve(3);
     for (int writer = 0; writer < 2; ++writer)
         threads.emplace_back(
             [&, writer]
@@ -172,6 +175,7 @@ TEST(ParameterTransportThreads, ShapesFromSeveralThreads)
     ParameterChangeTransfer transfer;
     {
         std::vector<std::jthread> threads;
+        threads.reserve(3);
         for (ParamID thread = 0; thread < 3; ++thread)
             threads.emplace_back(
                 [&transfer, thread]

@@ -18,7 +18,7 @@ std::string Decode(const UTF16String& text)
     Steinberg::TUID id;
     std::memset(id, 0x55, sizeof(id));
     DecodeFilterID(text, id);
-    return std::string(id, sizeof(id));
+    return {id, sizeof(id)};
 }
 
 std::string Bytes(std::initializer_list<int> bytes)

@@ -43,7 +43,7 @@ std::string Read(VST3MemoryStream& stream, int32 count)
     std::array<char, 64> buffer{};
     int32 read = -1;
     EXPECT_EQ(stream.read(buffer.data(), count, &read), Steinberg::kResultOk);
-    return std::string(buffer.data(), static_cast<std::size_t>(read));
+    return {buffer.data(), static_cast<std::size_t>(read)};
 }
 
 void SeekTo(VST3MemoryStream& stream, int64 position)

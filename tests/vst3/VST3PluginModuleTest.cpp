@@ -24,7 +24,6 @@ namespace
 
 using zebtest::EffectBundle;
 using zebtest::FixtureBundle;
-using zebtest::FixtureFolder;
 using zebtest::RecorderOf;
 using ModulePtr = boost::intrusive_ptr<VST3PluginModule>;
 using Texts = std::vector<std::string>;

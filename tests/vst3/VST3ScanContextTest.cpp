@@ -23,7 +23,7 @@ namespace
 
 PluginLocator LocatorOf(const std::filesystem::path& path)
 {
-    return PluginLocator(kTechnologyVST3, zebcore::filesupport::FromNativePath(path.string()));
+    return {kTechnologyVST3, zebcore::filesupport::FromNativePath(path.string())};
 }
 
 PluginLocator Fixture(std::string_view name)

@@ -35,7 +35,7 @@ void PutIfNewer(std::atomic<std::uint64_t>& place, std::uint64_t ticket, std::ui
 void ParameterRing::Write(const ParameterQueueValue& value)
 {
     const std::uint64_t ticket = mNextWrite.fetch_add(1, std::memory_order_acq_rel);
-    const std::uint64_t bits = std::bit_cast<std::uint64_t>(value.mValue);
+    const auto bits = std::bit_cast<std::uint64_t>(value.mValue);
     Words& words = mPlaces[ticket % kCapacity];
     PutIfNewer(words[0], ticket, static_cast<std::uint32_t>(bits >> kTagShift));
     PutIfNewer(words[1], ticket, static_cast<std::uint32_t>(bits));

@@ -19,7 +19,7 @@ namespace
 
 // Counts of plug-ins lie. A shell of thousands of classes is real; this many, or such a row of classes that the
 // factory cannot describe, is not.
-constexpr int32 kMaxClasses = 65536;
+constexpr int32 kMaxClasses = 16384;
 constexpr int32 kMaxFailuresInARow = 1024;
 
 // Calls `visit` with each class that the factory can describe, until it returns true; returns whether it did.

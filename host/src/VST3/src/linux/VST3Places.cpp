@@ -21,7 +21,7 @@ Dir MakeDir(std::string_view path)
 const char* GetVariable(const char* name)
 {
     const char* value = std::getenv(name);
-    return value && *value ? value : nullptr;
+    return value && *value != '\0' ? value : nullptr;
 }
 
 std::vector<Dir> SplitPath(std::string_view path)
