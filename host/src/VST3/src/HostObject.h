@@ -8,7 +8,7 @@
 namespace zebaudiofilterhost::vst3
 {
 
-/// The count of an object that plug-ins hold, 1 at first. The SDK's own helper reads the value a second time after
+/// The count of an object that plug-ins hold, 1 at first. The SDK's own function reads the value again after
 /// changing it, so that two threads can see the same result: this one does not. [any]
 class HostReferenceCount
 {
