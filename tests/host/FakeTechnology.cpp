@@ -115,8 +115,8 @@ void FakeScanContext::MakeFilter(FakeFilter& filter)
     if (!filter.synth)
     {
         const AudioFilterCategory category = mSkipCategory ? kCategoryNotQueried : kCategoryVST3Delay;
-        mDescriptors.push_back(
-            new AudioFilterDescriptor(mPlugin->locator, u"N", u"V", 1, category, filter.id, Guid(), filter.synth));
+        mDescriptors.push_back(new AudioFilterDescriptor(mPlugin->locator, filter.name, u"V", 1, category, filter.id,
+                                                         Guid(), filter.synth));
     }
 }
 

@@ -16,6 +16,7 @@ struct FakeFilter
     UTF16String id;
     bool synth = false;
     bool throws = false; // when it is made, for the first time only
+    UTF16String name = u"N";
 };
 
 struct FakePlugin
