@@ -78,6 +78,10 @@ ExitCode Report(const Failure& failure, const Arguments& arguments, bool json, C
     {
         console.Print(ToText(FailureDocument(arguments.command, failure)));
     }
+    for (const std::string& detail : failure.Details())
+    {
+        console.Warn("  " + detail);
+    }
     console.Warn(std::string("zebhost: ") + failure.what());
     return failure.Code();
 }
@@ -105,6 +109,11 @@ ExitCode Guarded(int argc, const char* const* argv, Console& console)
     catch (const std::exception& error)
     {
         return Report(Failure(ExitCode::JobFailed, std::string("something unforeseen went wrong: ") + error.what()),
+                      arguments, json, console);
+    }
+    catch (...)
+    {
+        return Report(Failure(ExitCode::JobFailed, "a plug-in threw something that tells nothing: ask its maker"),
                       arguments, json, console);
     }
 }

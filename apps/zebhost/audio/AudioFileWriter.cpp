@@ -8,9 +8,8 @@
 namespace zebhost
 {
 
-AudioFileWriter::AudioFileWriter(const std::string& path, bool overwrite, const SampleFormat& format,
-                                 const AudioFileReader& like)
-    : mOutput(path, overwrite), mFormat(format), mChannels(like.Channels())
+AudioFileWriter::AudioFileWriter(OutputFile& output, const SampleFormat& format, const AudioFileReader& like)
+    : mOutput(output), mFormat(format), mChannels(like.Channels())
 {
     SF_INFO info{};
     info.channels = mChannels;
@@ -19,7 +18,7 @@ AudioFileWriter::AudioFileWriter(const std::string& path, bool overwrite, const 
     mFile.reset(sf_open_fd(mOutput.Descriptor(), SFM_WRITE, &info, SF_FALSE));
     if (mFile == nullptr)
     {
-        throw Failure(ExitCode::FileTrouble, path + " cannot be written (" + sf_strerror(nullptr) +
+        throw Failure(ExitCode::FileTrouble, mOutput.Path() + " cannot be written (" + sf_strerror(nullptr) +
                                                  "): choose another kind of file, such as .wav");
     }
     CopyHead(like);

@@ -15,8 +15,9 @@ namespace zebhost
 class AudioFileWriter
 {
 public:
-    // Channels, rate, speaker positions and texts are those of `like`. Throws a Failure if it cannot be written.
-    AudioFileWriter(const std::string& path, bool overwrite, const SampleFormat& format, const AudioFileReader& like);
+    // Channels, rate, speaker positions and texts are those of `like`. `output` outlives this. Throws a Failure if it
+    // cannot be written.
+    AudioFileWriter(OutputFile& output, const SampleFormat& format, const AudioFileReader& like);
 
     void Write(const float* const* channels, int firstFrame, int frames);
     // Completes the file and gives it its name.
@@ -35,7 +36,7 @@ private:
     int ToInteger(float value);
     void Count(std::int64_t written, int frames);
 
-    OutputFile mOutput;
+    OutputFile& mOutput;
     SampleFormat mFormat;
     int mChannels;
     SoundFile mFile;

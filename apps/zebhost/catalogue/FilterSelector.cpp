@@ -1,6 +1,6 @@
 #include "catalogue/FilterSelector.h"
 
-#include "catalogue/LoadProblem.h"
+#include "catalogue/DisplayName.h"
 #include "catalogue/PluginFinder.h"
 #include "catalogue/ScanSession.h"
 #include "cli/Failure.h"
@@ -8,11 +8,11 @@
 #include "output/Strings.h"
 
 #include <host/AudioFilterDescriptor.h>
-#include <host/PluginModuleInfoManager.h>
 
 #include <algorithm>
+#include <array>
 #include <cctype>
-#include <functional>
+#include <iterator>
 #include <optional>
 
 namespace zebhost
@@ -20,7 +20,6 @@ namespace zebhost
 
 using zebaudiofilterhost::AudioFilterDescriptorManager;
 using zebaudiofilterhost::PluginLocator;
-using zebaudiofilterhost::PluginModuleInfoManager;
 
 namespace
 {
@@ -67,22 +66,21 @@ std::optional<PathAndClass> SplitPath(const std::string& text)
 
 std::string NameOf(const Catalogue::Descriptor& descriptor)
 {
-    return Printable(descriptor->GetName());
+    return DisplayName(*descriptor);
 }
 
-std::string Candidates(const Descriptors& descriptors)
+std::vector<std::string> Candidates(const Descriptors& descriptors)
 {
     constexpr std::size_t kMost = 12;
-    std::string lines;
+    std::vector<std::string> lines;
     for (std::size_t index = 0; index < std::min(descriptors.size(), kMost); ++index)
     {
         const Catalogue::Descriptor& each = descriptors[index];
-        lines +=
-            "  " + NameOf(each) + "  [" + ToUTF8(each->GetUniqueID()) + "]  " + PathOf(each->GetLocator()) + "\n";
+        lines.push_back(NameOf(each) + "  [" + ToUTF8(each->GetUniqueID()) + "]  " + PathOf(each->GetLocator()));
     }
     if (descriptors.size() > kMost)
     {
-        lines += "  and " + std::to_string(descriptors.size() - kMost) + " more\n";
+        lines.push_back("and " + std::to_string(descriptors.size() - kMost) + " more");
     }
     return lines;
 }
@@ -112,18 +110,19 @@ Descriptors Fitting(const Descriptors& all, const std::string& wanted)
     return {};
 }
 
-class SilentObserver : public IScanObserver
+class ProblemKeeper : public IScanObserver
 {
 public:
     void Stepping(const PluginLocator&, const std::string&, std::size_t, std::size_t) override {}
-    void Finished(const PluginLocator&, const Outcome&) override {}
+    void Finished(const PluginLocator&, const Outcome& outcome) override { mProblem = outcome.problem; }
     bool ShallStop() const override { return false; }
+
+    std::string mProblem;
 };
 
 } // namespace
 
-FilterSelector::FilterSelector(const Catalogue& catalogue, Console& console)
-    : mCatalogue(catalogue), mConsole(console)
+FilterSelector::FilterSelector(const Catalogue& catalogue) : mCatalogue(catalogue)
 {
 }
 
@@ -194,20 +193,20 @@ Catalogue::Descriptor FilterSelector::FindByPath(const std::string& path, const 
     {
         return fitting.front();
     }
-    const std::string candidates = Candidates(fitting.empty() ? mCatalogue.EffectsOf(locator) : fitting);
-    mConsole.Warn(candidates.substr(0, candidates.find_last_not_of('\n') + 1));
-    throw Failure(ExitCode::NotFound, (fitting.empty() ? path + " has no effect named " + className
-                                                       : path + " has several effects that fit") +
-                                          ": give one of the above as '" + path + "#NAME'");
+    const std::string what =
+        fitting.empty() ? path + " has no effect named " + className + " (instruments are not in the catalogue)"
+                        : path + " has several effects that fit";
+    throw Failure(ExitCode::NotFound, what + ": give one of the above as '" + path + "#NAME'",
+                  Candidates(fitting.empty() ? mCatalogue.EffectsOf(locator) : fitting));
 }
 
 void FilterSelector::ScanBundle(const PluginLocator& locator) const
 {
-    SilentObserver observer;
+    ProblemKeeper observer;
     ScanSession(nullptr, observer, {}).Run({locator});
-    if (PluginModuleInfoManager::GetInstance().FindPluginInfo(locator) == nullptr)
+    if (!observer.mProblem.empty())
     {
-        throw Failure(ExitCode::NotLoaded, LoadProblem(locator));
+        throw Failure(ExitCode::NotLoaded, observer.mProblem);
     }
     if (mCatalogue.EffectsOf(locator).empty())
     {
@@ -235,10 +234,9 @@ Catalogue::Descriptor FilterSelector::FindByName(const std::string& name) const
         throw Failure(ExitCode::NotFound, "no filter is named " + name +
                                               ": 'zebhost list' shows all names, 'zebhost scan' looks for new ones");
     }
-    const std::string candidates = Candidates(fitting);
-    mConsole.Warn(candidates.substr(0, candidates.find_last_not_of('\n') + 1));
     throw Failure(ExitCode::NotFound,
-                  name + " fits " + std::to_string(fitting.size()) + " filters: give the ID of one of the above");
+                  name + " fits " + std::to_string(fitting.size()) + " filters: give the ID of one of the above",
+                  Candidates(fitting));
 }
 
 } // namespace zebhost

@@ -12,7 +12,7 @@ namespace zebhost
 class FilterSelector
 {
 public:
-    FilterSelector(const Catalogue& catalogue, Console& console);
+    explicit FilterSelector(const Catalogue& catalogue);
 
     // Never null: throws a Failure that tells the candidates when there are several, and what to do when there is
     // none. Blocked plug-ins are refused.
@@ -27,7 +27,6 @@ private:
     void ScanBundle(const zebaudiofilterhost::PluginLocator& locator) const;
 
     const Catalogue& mCatalogue;
-    Console& mConsole;
 };
 
 } // namespace zebhost

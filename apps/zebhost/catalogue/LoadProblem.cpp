@@ -13,7 +13,7 @@ std::string LoadProblem(const zebaudiofilterhost::PluginLocator& locator)
     std::string problem = Printable(zebaudiofilterhost::PluginModule::GetLoadProblem(locator.GetPath()));
     if (problem.empty())
     {
-        return PathOf(locator) + " could not be loaded: it does not start up as a plug-in; ask its maker";
+        return PathOf(locator) + " holds no audio plug-in: none of its classes is one";
     }
     while (problem.back() == '.')
     {

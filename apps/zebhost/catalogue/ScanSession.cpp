@@ -30,7 +30,7 @@ namespace
 
 constexpr const char* kAtHand = "at hand in a scan that did not end";
 
-IScanObserver::Outcome OutcomeOf(const PluginLocator& locator)
+IScanObserver::Outcome OutcomeOf(const PluginLocator& locator, const std::string& thrown)
 {
     IScanObserver::Outcome outcome;
     outcome.loaded = PluginModuleInfoManager::GetInstance().FindPluginInfo(locator) != nullptr;
@@ -38,7 +38,10 @@ IScanObserver::Outcome OutcomeOf(const PluginLocator& locator)
     outcome.effects = static_cast<std::size_t>(std::count_if(descriptors.begin(), descriptors.end(),
                                                              [&locator](const auto& descriptor)
                                                              { return descriptor->GetLocator() == locator; }));
-    outcome.problem = outcome.loaded ? std::string() : LoadProblem(locator);
+    if (!outcome.loaded)
+    {
+        outcome.problem = thrown.empty() ? LoadProblem(locator) : thrown;
+    }
     return outcome;
 }
 
@@ -74,8 +77,7 @@ void ScanSession::RunTechnology(const std::vector<PluginLocator>& locators)
             return;
         }
         const bool wasKnown = Announce(locator);
-        ScanOne(locator);
-        Conclude(locator, wasKnown);
+        Conclude(locator, wasKnown, ScanGuarded(locator));
         ++mDone;
     }
 }
@@ -93,6 +95,25 @@ bool ScanSession::Announce(const PluginLocator& locator)
     return wasKnown;
 }
 
+// What a plug-in throws ends its own scan, and no other's.
+std::string ScanSession::ScanGuarded(const PluginLocator& locator)
+{
+    const std::string what = PathOf(locator) + " could not be scanned: it threw an exception";
+    try
+    {
+        ScanOne(locator);
+        return {};
+    }
+    catch (const std::exception& error)
+    {
+        return what + ", \"" + error.what() + "\"";
+    }
+    catch (...)
+    {
+        return what;
+    }
+}
+
 void ScanSession::ScanOne(const PluginLocator& locator)
 {
     const CrashGuard guard(PathOf(locator),
@@ -108,6 +129,7 @@ void ScanSession::ScanOne(const PluginLocator& locator)
     int total = 0;
     while (scanner.GetCurrentProgressInfo(announced, detail, current, total))
     {
+        guard.NoteProgress();
         mObserver.Stepping(locator, Printable(detail), mDone + 1, mTotal);
         scanner.ContinueScan();
         zebcore::threads::PumpMainThread();
@@ -115,9 +137,9 @@ void ScanSession::ScanOne(const PluginLocator& locator)
     scanner.EndScan();
 }
 
-void ScanSession::Conclude(const PluginLocator& locator, bool wasKnown)
+void ScanSession::Conclude(const PluginLocator& locator, bool wasKnown, const std::string& thrown)
 {
-    const IScanObserver::Outcome outcome = OutcomeOf(locator);
+    const IScanObserver::Outcome outcome = OutcomeOf(locator, thrown);
     if (mCatalogue != nullptr)
     {
         if (outcome.loaded || wasKnown)

@@ -49,10 +49,12 @@ public:
 
 private:
     void RunTechnology(const std::vector<zebaudiofilterhost::PluginLocator>& locators);
+    // Returns what the plug-in threw, as a sentence; empty if it did not.
+    std::string ScanGuarded(const zebaudiofilterhost::PluginLocator& locator);
     void ScanOne(const zebaudiofilterhost::PluginLocator& locator);
     // Returns whether the catalogue had a record of it.
     bool Announce(const zebaudiofilterhost::PluginLocator& locator);
-    void Conclude(const zebaudiofilterhost::PluginLocator& locator, bool wasKnown);
+    void Conclude(const zebaudiofilterhost::PluginLocator& locator, bool wasKnown, const std::string& thrown);
 
     Catalogue* mCatalogue;
     IScanObserver& mObserver;

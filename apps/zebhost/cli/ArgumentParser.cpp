@@ -35,12 +35,14 @@ CLI::Option* AddOption(CLI::App& app, const OptionSpec& spec)
     return option;
 }
 
+// What is missing is told later, in words of our own; so nothing is required here. Extra arguments of an option would
+// have brackets around a value taken off, which may stand in a file's name.
 CLI::Option* AddOperand(CLI::App& app, const OperandSpec& spec)
 {
+    constexpr int kAnyNumber = 1 << 20;
     CLI::Option* option = app.add_option(std::string(spec.name))->type_size(1);
-    option->expected(spec.required ? 1 : 0, spec.repeatable ? CLI::detail::expected_max_vector_size : 1);
-    option->multi_option_policy(CLI::MultiOptionPolicy::TakeAll);
-    return option->required(spec.required)->allow_extra_args(false);
+    option->expected(spec.repeatable ? kAnyNumber : 1)->allow_extra_args(false);
+    return option->multi_option_policy(CLI::MultiOptionPolicy::TakeAll);
 }
 
 // A command of two words stands below its first word.
@@ -52,8 +54,8 @@ CLI::App* AddCommand(CLI::App& root, const CommandSpec& spec)
     {
         const std::vector<CLI::App*> known =
             root.get_subcommands([&words](CLI::App* app) { return app->get_name() == words.front(); });
-        parent =
-            !known.empty() ? known.front() : root.add_subcommand(words.front())->require_subcommand(1)->fallthrough();
+        parent = !known.empty() ? known.front()
+                                : root.add_subcommand(words.front())->require_subcommand(0, 1)->fallthrough();
     }
     return parent->add_subcommand(words.back())->fallthrough();
 }
@@ -126,12 +128,28 @@ void CheckChoices(const CommandSpec& spec, const Arguments& arguments)
     }
 }
 
-[[noreturn]] void RefuseUsage(const CLI::ParseError& error, const std::string& command)
+[[noreturn]] void RefuseUsage(const std::string& what, const std::string& command)
 {
-    std::string what = error.what();
-    std::replace(what.begin(), what.end(), '\n', ' ');
     const std::string help = command.empty() ? "zebhost --help" : "zebhost " + command + " --help";
-    throw Failure(ExitCode::Usage, std::string(Trimmed(what)) + "; see '" + help + "'");
+    throw Failure(ExitCode::Usage, what + "; see '" + help + "'");
+}
+
+std::string InOneLine(std::string text)
+{
+    std::replace(text.begin(), text.end(), '\n', ' ');
+    return std::string(Trimmed(text));
+}
+
+void CheckOperands(const CommandSpec& spec, const Arguments& arguments)
+{
+    for (const OperandSpec& operand : spec.operands)
+    {
+        if (operand.required && !arguments.Has(operand.name))
+        {
+            RefuseUsage(std::string(operand.name) + " is missing: give " + std::string(operand.help),
+                        arguments.command);
+        }
+    }
 }
 
 // The parser's tree of commands, and where each value goes.
@@ -140,7 +158,7 @@ class Parser
 public:
     Parser()
     {
-        mRoot.require_subcommand(1);
+        mRoot.require_subcommand(0, 1);
         mRoot.set_help_flag("-h,--help");
         mRoot.set_version_flag("--version", std::string("zebhost"));
         for (const OptionSpec& option : CommonOptions())
@@ -168,9 +186,13 @@ public:
         {
             arguments.Add("version", {});
         }
+        catch (const CLI::ExtrasError&)
+        {
+            RefuseExtras();
+        }
         catch (const CLI::ParseError& error)
         {
-            RefuseUsage(error, ParsedCommandName(mRoot));
+            RefuseUsage(InOneLine(error.what()), ParsedCommandName(mRoot));
         }
         arguments.command = ParsedCommandName(mRoot);
         Collect(arguments);
@@ -178,17 +200,35 @@ public:
     }
 
 private:
+    [[noreturn]] void RefuseExtras() const
+    {
+        const std::string command = ParsedCommandName(mRoot);
+        const std::vector<std::string> extras = mRoot.remaining(true);
+        const std::string first = extras.empty() ? std::string() : extras.front();
+        const bool isCommand = FindCommand(command) == nullptr && first.substr(0, 1) != "-";
+        RefuseUsage(isCommand ? "there is no command '" + command + (command.empty() ? "" : " ") + first + "'"
+                              : "'" + first + "' is not expected here",
+                    FindCommand(command) == nullptr ? std::string() : command);
+    }
+
     void Collect(Arguments& arguments) const
     {
         TakeValues(mCommon, arguments);
-        for (const ParserCommand& command : mCommands)
+        const auto command =
+            std::find_if(mCommands.begin(), mCommands.end(),
+                         [&arguments](const ParserCommand& each) { return each.spec->name == arguments.command; });
+        if (arguments.Has("help") || arguments.Has("version"))
         {
-            if (command.spec->name == arguments.command)
-            {
-                TakeValues(command.options, arguments);
-                CheckChoices(*command.spec, arguments);
-            }
+            return;
         }
+        if (command == mCommands.end())
+        {
+            RefuseUsage(arguments.command.empty() ? "give a command" : arguments.command + " needs a second word",
+                        arguments.command);
+        }
+        TakeValues(command->options, arguments);
+        CheckOperands(*command->spec, arguments);
+        CheckChoices(*command->spec, arguments);
     }
 
     CLI::App mRoot{"", "zebhost"};

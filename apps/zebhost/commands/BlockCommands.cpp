@@ -42,7 +42,7 @@ PluginLocator BlockedPlugin(const CommandContext& context, const std::string& te
     }
     if (fitting.empty())
     {
-        const PluginLocator locator = FilterSelector(context.catalogue, context.console).SelectPlugin(text);
+        const PluginLocator locator = FilterSelector(context.catalogue).SelectPlugin(text);
         if (!BannedPluginManager::GetInstance().IsPluginBanned(locator))
         {
             throw Failure(ExitCode::NotFound, PathOf(locator) + " is not blocked: 'zebhost blocks' shows what is");
@@ -67,8 +67,7 @@ void Tell(const CommandContext& context, const PluginLocator& locator, const std
 
 ExitCode RunBlock(CommandContext& context)
 {
-    const PluginLocator locator =
-        FilterSelector(context.catalogue, context.console).SelectPlugin(context.arguments.Text("PLUGIN"));
+    const PluginLocator locator = FilterSelector(context.catalogue).SelectPlugin(context.arguments.Text("PLUGIN"));
     context.catalogue.Block(locator, context.arguments.Text("reason", "blocked by hand"));
     Tell(context, locator, " is blocked; 'zebhost unblock' lets it be used again");
     return ExitCode::Done;

@@ -82,6 +82,7 @@ Json FileRenderer::FilterDocument() const
 Json FileRenderer::Render(const std::string& input, const std::string& output)
 {
     AudioFileReader reader(input);
+    OutputFile file(output, mOptions.overwrite);
     const std::unique_ptr<AudioFileReader> sideChain = OpenSideChain(reader);
     const SampleFormat format = ChooseFormat(reader.Format(), input, output, mOptions.format, reader.Channels(),
                                              reader.SampleRate(), reader.Frames());
@@ -90,7 +91,7 @@ Json FileRenderer::Render(const std::string& input, const std::string& output)
     const std::vector<AutomationEvent> events =
         mOptions.automation.empty() ? std::vector<AutomationEvent>()
                                     : ReadAutomation(mOptions.automation, *mFilter, reader.SampleRate());
-    AudioFileWriter writer(output, mOptions.overwrite, format, reader);
+    AudioFileWriter writer(file, format, reader);
     RemarkOnRouting(reader, routing);
     const RenderJob::Progress progress = MakeProgress(reader);
     const RunningFilter running(*mFilter, reader.SampleRate(), mOptions.settleMs);

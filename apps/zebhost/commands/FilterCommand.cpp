@@ -1,8 +1,8 @@
 #include "commands/FilterCommand.h"
 
+#include "catalogue/DisplayName.h"
 #include "catalogue/FilterSelector.h"
 #include "catalogue/PluginFinder.h"
-#include "output/PrintableText.h"
 
 #include <host/AudioFilterDescriptor.h>
 
@@ -10,7 +10,7 @@ namespace zebhost
 {
 
 FilterOfCommand::FilterOfCommand(const CommandContext& context, unsigned int settleMs)
-    : mDescriptor(FilterSelector(context.catalogue, context.console).Select(context.arguments.Text("FILTER")))
+    : mDescriptor(FilterSelector(context.catalogue).Select(context.arguments.Text("FILTER")))
     , mGuard(PathOf(mDescriptor->GetLocator()), "its maker should know; 'zebhost block " +
                                                     PathOf(mDescriptor->GetLocator()) + "' keeps it from being used")
     , mFilter(LoadFilter(mDescriptor, settleMs))
@@ -19,7 +19,7 @@ FilterOfCommand::FilterOfCommand(const CommandContext& context, unsigned int set
 
 std::string FilterOfCommand::Name() const
 {
-    return Printable(mDescriptor->GetName());
+    return DisplayName(*mDescriptor);
 }
 
 } // namespace zebhost

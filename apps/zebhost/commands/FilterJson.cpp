@@ -1,5 +1,6 @@
 #include "commands/FilterJson.h"
 
+#include "catalogue/DisplayName.h"
 #include "catalogue/PluginFinder.h"
 #include "output/PrintableText.h"
 
@@ -31,7 +32,7 @@ std::string TechnologyName(const AudioFilterDescriptor& descriptor)
 Json DescriptorJson(const AudioFilterDescriptor& descriptor)
 {
     return Json{{"id", ToUTF8(descriptor.GetUniqueID())},
-                {"name", Printable(descriptor.GetName())},
+                {"name", DisplayName(descriptor)},
                 {"vendor", Printable(descriptor.GetVendorString())},
                 {"category", Printable(descriptor.GetCategoryName())},
                 {"version", descriptor.GetVersion()},

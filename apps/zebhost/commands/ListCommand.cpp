@@ -1,3 +1,4 @@
+#include "catalogue/DisplayName.h"
 #include "catalogue/PluginFinder.h"
 #include "cli/Failure.h"
 #include "commands/Commands.h"
@@ -21,7 +22,7 @@ namespace
 
 bool Holds(const AudioFilterDescriptor& descriptor, const std::string& text)
 {
-    const std::vector<std::string> places = {Printable(descriptor.GetName()), Printable(descriptor.GetVendorString()),
+    const std::vector<std::string> places = {DisplayName(descriptor), Printable(descriptor.GetVendorString()),
                                              Printable(descriptor.GetCategoryName()),
                                              ToUTF8(descriptor.GetUniqueID()), PathOf(descriptor.GetLocator())};
     return std::any_of(places.begin(), places.end(),
@@ -35,7 +36,7 @@ std::vector<Catalogue::Descriptor> Selected(const CommandContext& context)
     std::erase_if(effects, [&text](const Catalogue::Descriptor& each) { return !Holds(*each, text); });
     std::stable_sort(effects.begin(), effects.end(),
                      [](const auto& a, const auto& b)
-                     { return Lowered(Printable(a->GetName())) < Lowered(Printable(b->GetName())); });
+                     { return Lowered(DisplayName(*a)) < Lowered(DisplayName(*b)); });
     return effects;
 }
 
@@ -60,9 +61,9 @@ void PrintTable(const CommandContext& context, const std::vector<Catalogue::Desc
                            : std::vector<std::string>{"NAME", "VENDOR", "CATEGORY", "CHANNELS"});
     for (const Catalogue::Descriptor& each : effects)
     {
-        table.AddRow({Printable(each->GetName()), Printable(each->GetVendorString()),
-                      Printable(each->GetCategoryName()), Layouts(*each), TechnologyName(*each),
-                      ToUTF8(each->GetUniqueID()), PathOf(each->GetLocator())});
+        table.AddRow({DisplayName(*each), Printable(each->GetVendorString()), Printable(each->GetCategoryName()),
+                      Layouts(*each), TechnologyName(*each), ToUTF8(each->GetUniqueID()),
+                      PathOf(each->GetLocator())});
     }
     context.console.Print(table.Text(context.console.HasOutputColour()));
 }
@@ -72,7 +73,7 @@ void PrintNames(const CommandContext& context, const std::vector<Catalogue::Desc
     std::set<std::string> names;
     for (const Catalogue::Descriptor& each : effects)
     {
-        names.insert(Printable(each->GetName()));
+        names.insert(DisplayName(*each));
     }
     for (const std::string& name : names)
     {

@@ -94,7 +94,7 @@ void PrintResults(const CommandContext& context, const std::vector<Result>& resu
         context.Print(document);
         return;
     }
-    TextTable table({"STATE", "PATH", ""});
+    TextTable table({"STATE", "PATH", "RESULT"});
     for (const Result& result : results)
     {
         table.AddRow({result.state, result.path, Detail(result)});
@@ -187,9 +187,14 @@ std::string Summary(const ScanPlan& plan, const Reporter& reporter)
     {
         return count == 0 ? std::string() : ", " + std::to_string(count) + " " + what;
     };
+    const std::string rest = part(reporter.mFailures, "could not be loaded") + part(plan.toDrop.size(), "dropped") +
+                             part(plan.skipped.size(), "blocked");
+    if (plan.toScan.empty())
+    {
+        return "zebhost: nothing to scan" + rest + "; --full scans again what is in the catalogue";
+    }
     return "zebhost: " + Counted(reporter.mResults.size(), "plug-in") + " scanned, " +
-           Counted(reporter.mEffects, "effect") + " found" + part(reporter.mFailures, "could not be loaded") +
-           part(plan.toDrop.size(), "dropped") + part(plan.skipped.size(), "blocked");
+           Counted(reporter.mEffects, "effect") + " found" + rest;
 }
 
 } // namespace

@@ -127,7 +127,7 @@ std::string Document(const std::string& message)
 } // namespace
 
 CrashGuard::CrashGuard(const std::string& what, const std::string& advice, unsigned int seconds)
-    : mPreviousDepth(sDepth.load())
+    : mPreviousDepth(sDepth.load()), mSeconds(seconds)
 {
     if (mPreviousDepth >= kDeepest)
     {
@@ -139,9 +139,14 @@ CrashGuard::CrashGuard(const std::string& what, const std::string& advice, unsig
     texts = {"zebhost: " + crashed + "\n", "zebhost: " + timedOut + "\n", Document(crashed), Document(timedOut)};
     sDepth.store(mPreviousDepth + 1);
     Install();
-    if (seconds > 0)
+    NoteProgress();
+}
+
+void CrashGuard::NoteProgress() const
+{
+    if (mSeconds > 0)
     {
-        alarm(seconds);
+        alarm(mSeconds);
     }
 }
 

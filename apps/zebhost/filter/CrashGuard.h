@@ -10,12 +10,15 @@ namespace zebhost
 class CrashGuard
 {
 public:
-    // `what` begins the sentence: "/x/Y.vst3, at hand in the scan,". `advice` ends it. A time of more than 0 seconds
-    // ends the process in the same way when the guard lives longer.
+    // `what` begins the sentence, such as a bundle's path, and `advice` ends it. With a time of more than 0 seconds the
+    // process ends in the same way when there is no progress for so long.
     CrashGuard(const std::string& what, const std::string& advice, unsigned int seconds = 0);
     ~CrashGuard();
     CrashGuard(const CrashGuard&) = delete;
     CrashGuard& operator=(const CrashGuard&) = delete;
+
+    // The time begins anew.
+    void NoteProgress() const;
 
     // Where the failure document of --json goes; without it none is written.
     static void WriteDocuments(const std::string& command, int descriptor);
@@ -27,6 +30,7 @@ public:
 
 private:
     int mPreviousDepth;
+    unsigned int mSeconds;
 };
 
 } // namespace zebhost

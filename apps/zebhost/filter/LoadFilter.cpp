@@ -1,14 +1,16 @@
 #include "filter/LoadFilter.h"
 
+#include "catalogue/DisplayName.h"
 #include "catalogue/LoadProblem.h"
 #include "catalogue/PluginFinder.h"
 #include "cli/Failure.h"
-#include "output/PrintableText.h"
 
 #include <foundation/zebcore/MainThreadLoop.h>
 #include <host/AudioFilterDescriptor.h>
 #include <host/PluginModuleInfoManager.h>
 #include <utility/EffectUtils.h>
+
+#include <exception>
 
 namespace zebhost
 {
@@ -20,7 +22,7 @@ namespace
 
 std::string Title(const Catalogue::Descriptor& descriptor)
 {
-    return Printable(descriptor->GetName()) + " in " + PathOf(descriptor->GetLocator());
+    return DisplayName(*descriptor) + " in " + PathOf(descriptor->GetLocator());
 }
 
 void CheckUsable(const Catalogue::Descriptor& descriptor)
@@ -44,12 +46,25 @@ void CheckUsable(const Catalogue::Descriptor& descriptor)
     }
 }
 
+FilterPointer Create(const Catalogue::Descriptor& descriptor)
+{
+    try
+    {
+        return zebaudiofilterhost::utility::CreateAudioFilter(descriptor->GetUniqueID());
+    }
+    catch (const std::exception& error)
+    {
+        throw Failure(ExitCode::NotLoaded, Title(descriptor) + " could not be loaded: it threw an exception, \"" +
+                                               error.what() + "\"; ask its maker");
+    }
+}
+
 } // namespace
 
 FilterPointer LoadFilter(const Catalogue::Descriptor& descriptor, unsigned int settleMs)
 {
     CheckUsable(descriptor);
-    const FilterPointer filter = zebaudiofilterhost::utility::CreateAudioFilter(descriptor->GetUniqueID());
+    const FilterPointer filter = Create(descriptor);
     if (filter == nullptr)
     {
         throw Failure(ExitCode::NotLoaded, LoadProblem(descriptor->GetLocator()));

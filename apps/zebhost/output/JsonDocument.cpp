@@ -14,7 +14,8 @@ Json FailureDocument(std::string_view command, const Failure& failure)
     document["ok"] = false;
     document["error"] = Json{{"code", static_cast<int>(failure.Code())},
                              {"kind", ExitCodeName(failure.Code())},
-                             {"message", failure.what()}};
+                             {"message", failure.what()},
+                             {"details", failure.Details()}};
     return document;
 }
 

@@ -19,7 +19,7 @@ inline constexpr int kJsonSchema = 1;
 // What every document begins with: "schema", "command", "ok" true.
 Json NewDocument(std::string_view command);
 
-// The document of a command that failed: "ok" false, and "error" with "code", "kind" and "message".
+// The document of a command that failed: "ok" false, and "error" with "code", "kind", "message" and "details".
 Json FailureDocument(std::string_view command, const Failure& failure);
 
 // As text that is valid UTF-8 whatever bytes went in, with a line end.
