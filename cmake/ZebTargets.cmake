@@ -18,20 +18,32 @@ add_library(zeb_options INTERFACE)
 target_compile_options(zeb_options INTERFACE
     -Wall -Wextra -Wpedantic -Wshadow -Wconversion -Wsign-conversion -Wnon-virtual-dtor -Wold-style-cast
     -Woverloaded-virtual $<$<BOOL:${ZEB_WARNINGS_AS_ERRORS}>:-Werror>)
-# g++ 12 sees overlaps, overflows and bounds broken in its own std::string once it inlines operator+ (GCC bugs 105329 and 105651).
+# g++ 12 sees overlaps, overflows and bounds broken in its own std::string once it inlines
+# operator+ (GCC bugs 105329 and 105651).
 target_compile_options(zeb_options INTERFACE
     $<$<AND:$<CXX_COMPILER_ID:GNU>,$<CONFIG:Release>>:-Wno-restrict;-Wno-stringop-overflow;-Wno-array-bounds>)
 if(ZEB_SANITIZE)
-    add_compile_options(-fsanitize=${ZEB_SANITIZE} -fno-omit-frame-pointer -fno-sanitize-recover=all)
+    add_compile_options(-fsanitize=${ZEB_SANITIZE} -fno-omit-frame-pointer -fno-sanitize-recover=all
+        -g1) # Lines are all that a report needs
     add_link_options(-fsanitize=${ZEB_SANITIZE})
 endif()
 
 # Boost and the standard library, compiled once for all layers.
-file(WRITE ${PROJECT_BINARY_DIR}/precompiled.cpp "")
+file(GENERATE OUTPUT ${PROJECT_BINARY_DIR}/precompiled.cpp CONTENT "// Carries the precompiled header.\n")
 add_library(zeb_precompiled OBJECT ${PROJECT_BINARY_DIR}/precompiled.cpp)
 target_compile_options(zeb_precompiled PRIVATE -Winvalid-pch)
 target_link_libraries(zeb_precompiled PRIVATE zeb_options Boost::boost Threads::Threads)
 target_precompile_headers(zeb_precompiled PRIVATE ${PROJECT_SOURCE_DIR}/cmake/Precompiled.h)
+
+# The same for tests, with GoogleTest.
+if(ZEB_BUILD_TESTS)
+    find_package(GTest REQUIRED)
+    file(GENERATE OUTPUT ${PROJECT_BINARY_DIR}/precompiled_test.cpp CONTENT "int main() {}\n")
+    add_executable(zeb_test_precompiled EXCLUDE_FROM_ALL ${PROJECT_BINARY_DIR}/precompiled_test.cpp)
+    target_link_libraries(zeb_test_precompiled PRIVATE zeb_options Boost::boost Threads::Threads GTest::gmock)
+    target_precompile_headers(zeb_test_precompiled PRIVATE
+        ${PROJECT_SOURCE_DIR}/cmake/Precompiled.h <gmock/gmock.h> <gtest/gtest.h>)
+endif()
 
 # zeb_add_layer(NAME SOURCES ... PUBLIC_HEADERS ... DEPENDS ... LIBRARIES ...)
 #   PUBLIC_HEADERS  installed, and compiled alone by the header check
@@ -50,7 +62,7 @@ endfunction()
 
 function(zeb_add_shared_library)
     get_property(layers GLOBAL PROPERTY ZEB_LAYERS)
-    file(WRITE ${PROJECT_BINARY_DIR}/shared.cpp "")
+    file(GENERATE OUTPUT ${PROJECT_BINARY_DIR}/shared.cpp CONTENT "// The library is made of its layers.\n")
     add_library(zebaudiofilterhost SHARED ${PROJECT_BINARY_DIR}/shared.cpp)
     add_library(zebaudiofilterhost::zebaudiofilterhost ALIAS zebaudiofilterhost)
     set_target_properties(zebaudiofilterhost PROPERTIES
@@ -77,8 +89,8 @@ endfunction()
 #   Links every layer from the lowest up to UP_TO, so that a test reaches internal classes.
 function(zeb_add_test name)
     cmake_parse_arguments(arg "" "UP_TO;TIMEOUT" "SOURCES;LIBRARIES;NEEDS;DEFINITIONS;LABELS" ${ARGN})
-    find_package(GTest REQUIRED)
     add_executable(${name} ${arg_SOURCES})
+    target_precompile_headers(${name} REUSE_FROM zeb_test_precompiled)
     target_link_libraries(${name} PRIVATE zeb_options)
     get_property(layers GLOBAL PROPERTY ZEB_LAYERS)
     foreach(layer IN LISTS layers)
