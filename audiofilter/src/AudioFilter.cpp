@@ -5,8 +5,6 @@
 #include "utility/EffectUtils.h"
 #include "utility/ThreadUtils.h"
 
-#include <boost/bind/bind.hpp>
-
 namespace zebaudiofilterhost
 {
 
@@ -30,7 +28,7 @@ AudioFilter::AudioFilter(const UTF16String& id, const UTF16String& displayName)
     mMainTargetBus.SetType(AudioFilterBusDescription::kBusType_Main);
     mSideChainTargetBus.SetType(AudioFilterBusDescription::kBusType_SideChain);
     if (CurrentThreadIDIsMainThreadID())
-        mUITimerConnection = ModuleUITimer::GetInstance().ConnectTick(boost::bind(&AudioFilter::TickWhileHeld, this));
+        mUITimerConnection = ModuleUITimer::GetInstance().ConnectTick([this] { TickWhileHeld(); });
 }
 
 AudioFilter::~AudioFilter() = default;
@@ -68,7 +66,7 @@ void AudioFilter::Resume()
 
 boost::intrusive_ptr<AudioFilter> AudioFilter::Clone() const
 {
-    const boost::intrusive_ptr<AudioFilter> clone = utility::CreateAudioFilter(mFilterID);
+    boost::intrusive_ptr<AudioFilter> clone = utility::CreateAudioFilter(mFilterID);
     if (!clone)
         return clone;
     clone->RequestIOConfiguration(LayoutsOf(mInputBuses), LayoutsOf(mOutputBuses));

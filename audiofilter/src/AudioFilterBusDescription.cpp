@@ -83,22 +83,22 @@ bool AudioFilterBusDescription::IsEquivalent(const AudioFilterBusDescription& ot
 
 AudioFilterBusDescription AudioFilterBusDescription::CreateMono(const UTF16String& name, Type type)
 {
-    return AudioFilterBusDescription(name, zebmediatypes::CreateMonoChannelLayout(), type);
+    return {name, zebmediatypes::CreateMonoChannelLayout(), type};
 }
 
 AudioFilterBusDescription AudioFilterBusDescription::CreateStereo(const UTF16String& name, Type type)
 {
-    return AudioFilterBusDescription(name, zebmediatypes::CreateStereoChannelLayout(), type);
+    return {name, zebmediatypes::CreateStereoChannelLayout(), type};
 }
 
 AudioFilterBusDescription AudioFilterBusDescription::CreateSurround51(const UTF16String& name, Type type)
 {
-    return AudioFilterBusDescription(name, zebmediatypes::CreateBroadcast51ChannelLayout(), type);
+    return {name, zebmediatypes::CreateBroadcast51ChannelLayout(), type};
 }
 
 AudioFilterBusDescription AudioFilterBusDescription::CreateSurround71(const UTF16String& name, Type type)
 {
-    return AudioFilterBusDescription(name, zebmediatypes::Create7_1ChannelLayout(), type);
+    return {name, zebmediatypes::Create7_1ChannelLayout(), type};
 }
 
 bool AreAudioFilterBusDescriptionsEquivalent(const std::vector<AudioFilterBusDescription>& a,

@@ -85,7 +85,7 @@ void SaveChannelMap(const ChannelMap& map, PropList& section)
     };
     for (int slot = 0; slot < map.GetNumberOfChannels(); ++slot)
     {
-        const ChannelLayout layout = map.GetChannelLayout(slot);
+        const ChannelLayout& layout = map.GetChannelLayout(slot);
         if (map.Find(slot) >= 0 && !layout.empty())
         {
             for (const AudioChannelDescription& plugChannel : layout)

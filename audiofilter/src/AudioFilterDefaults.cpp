@@ -104,7 +104,7 @@ bool AudioFilter::HasCustomEditor() const
 
 boost::intrusive_ptr<AudioFilterEditor> AudioFilter::CreateCustomEditor()
 {
-    return boost::intrusive_ptr<AudioFilterEditor>();
+    return {};
 }
 
 bool AudioFilter::IsProxy() const
@@ -114,7 +114,7 @@ bool AudioFilter::IsProxy() const
 
 boost::intrusive_ptr<AudioFilterDescriptor> AudioFilter::CreateFilterDescriptor(const PluginLocator&, bool)
 {
-    return boost::intrusive_ptr<AudioFilterDescriptor>();
+    return {};
 }
 
 } // namespace zebaudiofilterhost

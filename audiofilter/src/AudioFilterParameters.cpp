@@ -29,7 +29,7 @@ float AudioFilter::GetParameter(int) const
 
 boost::intrusive_ptr<AudioFilterParameterInfo> AudioFilter::GetParameterInfo(int) const
 {
-    return boost::intrusive_ptr<AudioFilterParameterInfo>();
+    return {};
 }
 
 UTF16String AudioFilter::GetParameterString(int index) const

@@ -154,7 +154,7 @@ int AudioFilter::GetNumFactoryPresets() const
 
 UTF16String AudioFilter::GetFactoryPresetName(int) const
 {
-    return UTF16String();
+    return {};
 }
 
 void AudioFilter::SetFactoryPreset(int)

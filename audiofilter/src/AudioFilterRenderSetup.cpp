@@ -136,9 +136,9 @@ void AudioFilter::CollectRenderIndices(RenderIndices& indices) const
     auto silent = indices.silent.begin();
     for (int channel = 0; channel < known; ++channel)
     {
-        if (written.count(channel) != 0)
+        if (written.contains(channel))
             continue;
-        if (fed.count(channel) != 0)
+        if (fed.contains(channel))
             *silent++ = channel;
         else
             *delayed++ = channel;

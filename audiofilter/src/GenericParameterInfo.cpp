@@ -111,7 +111,7 @@ UTF16String GenericParameterInfo::GetParameterString(float normalized) const
     case kUnit_Integer:
         return IntegerText(FromNormalized(normalized));
     default:
-        return UTF16String();
+        return {};
     }
 }
 

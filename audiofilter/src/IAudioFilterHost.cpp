@@ -3,8 +3,6 @@
 namespace zebaudiofilterhost
 {
 
-IAudioFilterHost::~IAudioFilterHost()
-{
-}
+IAudioFilterHost::~IAudioFilterHost() = default;
 
 } // namespace zebaudiofilterhost

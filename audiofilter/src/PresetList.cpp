@@ -37,14 +37,14 @@ void PresetList::GetPresetNames(std::set<UTF16String>& names) const
 boost::intrusive_ptr<PresetData> PresetList::GetPreset(const UTF16String& name) const
 {
     PropList* section = mPropList != nullptr ? mPropList->GetSubList(UTF16to8(name)) : nullptr;
-    return boost::intrusive_ptr<PresetData>(section != nullptr ? new PresetData(*section) : nullptr);
+    return section != nullptr ? new PresetData(*section) : nullptr;
 }
 
 boost::intrusive_ptr<PresetData> PresetList::AppendPreset(const UTF16String& name)
 {
     if (mPropList == nullptr || mPropList->GetSubList(UTF16to8(name)) != nullptr)
-        return boost::intrusive_ptr<PresetData>();
-    const boost::intrusive_ptr<PresetData> preset(new PresetData(mPropList->GetOrCreateSubList(UTF16to8(name))));
+        return {};
+    boost::intrusive_ptr<PresetData> preset(new PresetData(mPropList->GetOrCreateSubList(UTF16to8(name))));
     mPresetListChangedSignal(*this);
     return preset;
 }

@@ -29,11 +29,12 @@ void ModuleSteps::RunInitialize() const
 
 void ModuleSteps::RunTerminate() const
 {
-    for (auto entry = mEntries.rbegin(); entry != mEntries.rend(); ++entry)
+    const auto run = [](const Entry& entry)
     {
-        if (entry->terminate)
-            entry->terminate();
-    }
+        if (entry.terminate)
+            entry.terminate();
+    };
+    std::for_each(mEntries.rbegin(), mEntries.rend(), run);
 }
 
 } // namespace zebaudiofilterhost

@@ -2,7 +2,6 @@
 
 #include "foundation/zebcore/Threads.h"
 
-#include <boost/bind/bind.hpp>
 #include <boost/signals2/signal.hpp>
 
 namespace zebaudiofilterhost
@@ -20,7 +19,7 @@ class ModuleUITimer::Impl
 public:
     boost::signals2::connection ConnectTick(const boost::signals2::slot<void()>& slot)
     {
-        const boost::signals2::connection connection = mTickSignal.connect(slot);
+        boost::signals2::connection connection = mTickSignal.connect(slot);
         if (!mRunning)
             QueueTick();
         return connection;
@@ -30,7 +29,7 @@ private:
     void QueueTick()
     {
         mRunning = true;
-        zebcore::threads::AsyncCallFromMainThread(boost::bind(&Impl::OnTimeElapsed, this), kTickDelayMs);
+        zebcore::threads::AsyncCallFromMainThread([this] { OnTimeElapsed(); }, kTickDelayMs);
     }
 
     void OnTimeElapsed()

@@ -39,7 +39,7 @@ protected:
 
     static boost::intrusive_ptr<RecordingFilter> AsRecording(const boost::intrusive_ptr<AudioFilter>& filter)
     {
-        return boost::intrusive_ptr<RecordingFilter>(dynamic_cast<RecordingFilter*>(filter.get()));
+        return dynamic_cast<RecordingFilter*>(filter.get());
     }
 };
 
