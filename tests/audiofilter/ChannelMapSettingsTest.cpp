@@ -23,7 +23,7 @@ constexpr auto kOutput = AudioFilter::kDirection_Output;
 
 boost::intrusive_ptr<testing::RecordingFilter> StereoOnFour()
 {
-    const auto filter = MakeFilter({2}, {2});
+    auto filter = MakeFilter({2}, {2});
     filter->SetMainTargetBus(MakeBus(4));
     filter->SetUseChannelMap(true);
     return filter;

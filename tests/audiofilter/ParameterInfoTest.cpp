@@ -16,9 +16,8 @@ namespace
 boost::intrusive_ptr<GenericParameterInfo> MakeInfo(int unit, float lo, float hi, bool logarithmic = false,
                                                     bool canBeAutomated = true)
 {
-    return boost::intrusive_ptr<GenericParameterInfo>(
-        new GenericParameterInfo(u"Gain", u"dB", static_cast<AudioFilterParameterInfoUnit>(unit), 0, lo, hi,
-                                 canBeAutomated, logarithmic, 1, 6));
+    return new GenericParameterInfo(u"Gain", u"dB", static_cast<AudioFilterParameterInfoUnit>(unit), 0, lo, hi,
+                                    canBeAutomated, logarithmic, 1, 6);
 }
 
 // The text at normalised 0, which is the lo bound whatever the range.
