@@ -10,8 +10,8 @@ namespace zebhost
 class CrashGuard
 {
 public:
-    // `what` begins the sentence, such as a bundle's path, and `advice` ends it. With a time of more than 0 seconds the
-    // process ends in the same way when there is no progress for so long.
+    // `what` begins the sentence, such as a bundle's path, and `advice` ends it. With a time of more than 0 seconds
+    // the process ends in the same way when there is no progress for so long.
     CrashGuard(const std::string& what, const std::string& advice, unsigned int seconds = 0);
     ~CrashGuard();
     CrashGuard(const CrashGuard&) = delete;
