@@ -59,8 +59,8 @@ constexpr std::array kLabelNames{
 
 void WriteLabel(zebcore::utility::oUTF16StringStream& text, AudioChannelLabel label)
 {
-    const auto known = std::find_if(kLabelNames.begin(), kLabelNames.end(),
-                                    [&](const LabelName& name) { return name.mLabel == label; });
+    const auto* known = std::find_if(kLabelNames.begin(), kLabelNames.end(),
+                                     [&](const LabelName& name) { return name.mLabel == label; });
     if (known != kLabelNames.end())
         text << known->mName;
     else

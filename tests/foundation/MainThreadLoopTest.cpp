@@ -239,6 +239,7 @@ TEST(MainThreadLoopThreads, CallsFromManyThreadsAllRunHere)
     int ran = 0; // No atomic: the calls run on one thread.
     int elsewhere = 0;
     std::vector<std::thread> threads;
+    threads.reserve(kThreads);
     for (int i = 0; i < kThreads; ++i)
         threads.emplace_back(
             [&]

@@ -5,9 +5,9 @@
 #include <gtest/gtest.h>
 
 #include <dlfcn.h>
-#include <stdlib.h>
 #include <sys/utsname.h>
 
+#include <cstdlib>
 #include <filesystem>
 #include <fstream>
 #include <string>
@@ -77,7 +77,7 @@ TEST_F(OSModuleTest, LoadsBundlesAndPlainFiles)
     for (const Case& bundle : cases)
     {
         Install(bundle.mBinary);
-        const OSModuleRef module = LoadOSModule(Path(bundle.mLoadedAs));
+        OSModuleRef module = LoadOSModule(Path(bundle.mLoadedAs));
         ASSERT_NE(nullptr, module) << NarrowFromUTF16(GetLastOSModuleError());
         EXPECT_TRUE(GetOSModuleBinaryPath(module) == Path(bundle.mBinary));
         EXPECT_TRUE(FindOSModuleBinary(Path(bundle.mLoadedAs)) == Path(bundle.mBinary));
@@ -94,7 +94,7 @@ TEST_F(OSModuleTest, LoadsBundlesAndPlainFiles)
 TEST_F(OSModuleTest, AReleasedModuleStaysMapped)
 {
     Install("A.so");
-    const OSModuleRef module = LoadOSModule(Path("A.so"));
+    OSModuleRef module = LoadOSModule(Path("A.so"));
     const ModuleFunction answer = GetFunctionPointerFromModuleImpl(module, "TestModuleAnswer");
     ASSERT_NE(nullptr, answer);
     ReleaseOSModule(module);

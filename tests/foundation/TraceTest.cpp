@@ -148,8 +148,10 @@ TEST_F(TraceTest, ASinkMayReplaceItself)
 TEST_F(TraceTest, ThreadsTraceWhileTheConfigurationChanges)
 {
     constexpr int kRounds = 500;
+    constexpr int kTracers = 3;
     std::vector<std::thread> tracers;
-    for (int i = 0; i < 3; ++i)
+    tracers.reserve(kTracers);
+    for (int i = 0; i < kTracers; ++i)
         tracers.emplace_back(
             []
             {
