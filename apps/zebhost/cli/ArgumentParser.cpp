@@ -18,37 +18,37 @@ using OptionNames = std::vector<std::pair<CLI::Option*, std::string>>;
 
 struct ParserCommand
 {
-    const CommandSpec* spec = nullptr;
+    const CommandSpec* row = nullptr;
     CLI::App* app = nullptr;
     OptionNames options;
 };
 
-CLI::Option* AddOption(CLI::App& app, const OptionSpec& spec)
+CLI::Option* AddOption(CLI::App& app, const OptionSpec& row)
 {
-    const std::string name = "--" + std::string(spec.name);
-    if (spec.values == Values::None)
+    const std::string name = "--" + std::string(row.name);
+    if (row.values == Values::None)
     {
         return app.add_flag(name);
     }
     CLI::Option* option = app.add_option(name)->type_size(1)->expected(1)->allow_extra_args(false);
-    option->multi_option_policy(spec.repeatable ? CLI::MultiOptionPolicy::TakeAll : CLI::MultiOptionPolicy::Throw);
+    option->multi_option_policy(row.repeatable ? CLI::MultiOptionPolicy::TakeAll : CLI::MultiOptionPolicy::Throw);
     return option;
 }
 
 // What is missing is told later, in words of our own; so nothing is required here. Extra arguments of an option would
 // have brackets around a value taken off, which may stand in a file's name.
-CLI::Option* AddOperand(CLI::App& app, const OperandSpec& spec)
+CLI::Option* AddOperand(CLI::App& app, const OperandSpec& row)
 {
     constexpr int kAnyNumber = 1 << 20;
-    CLI::Option* option = app.add_option(std::string(spec.name))->type_size(1);
-    option->expected(spec.repeatable ? kAnyNumber : 1)->allow_extra_args(false);
+    CLI::Option* option = app.add_option(std::string(row.name))->type_size(1);
+    option->expected(row.repeatable ? kAnyNumber : 1)->allow_extra_args(false);
     return option->multi_option_policy(CLI::MultiOptionPolicy::TakeAll);
 }
 
 // A command of two words stands below its first word.
-CLI::App* AddCommand(CLI::App& root, const CommandSpec& spec)
+CLI::App* AddCommand(CLI::App& root, const CommandSpec& row)
 {
-    const std::vector<std::string> words = Split(spec.name, ' ');
+    const std::vector<std::string> words = Split(row.name, ' ');
     CLI::App* parent = &root;
     if (words.size() == 2)
     {
@@ -60,14 +60,14 @@ CLI::App* AddCommand(CLI::App& root, const CommandSpec& spec)
     return parent->add_subcommand(words.back())->fallthrough();
 }
 
-ParserCommand MakeCommand(CLI::App& root, const CommandSpec& spec)
+ParserCommand MakeCommand(CLI::App& root, const CommandSpec& row)
 {
-    ParserCommand command{&spec, AddCommand(root, spec), {}};
-    for (const OperandSpec& operand : spec.operands)
+    ParserCommand command{&row, AddCommand(root, row), {}};
+    for (const OperandSpec& operand : row.operands)
     {
         command.options.emplace_back(AddOperand(*command.app, operand), std::string(operand.name));
     }
-    for (const OptionSpec& option : spec.options)
+    for (const OptionSpec& option : row.options)
     {
         command.options.emplace_back(AddOption(*command.app, option), std::string(option.name));
     }
@@ -110,16 +110,16 @@ void CheckChoice(std::string_view what, const std::vector<std::string>& given,
     }
 }
 
-void CheckChoices(const CommandSpec& spec, const Arguments& arguments)
+void CheckChoices(const CommandSpec& row, const Arguments& arguments)
 {
-    for (const OptionSpec& option : spec.options)
+    for (const OptionSpec& option : row.options)
     {
         if (option.values == Values::Choice)
         {
             CheckChoice("--" + std::string(option.name), arguments.All(option.name), option.choices);
         }
     }
-    for (const OperandSpec& operand : spec.operands)
+    for (const OperandSpec& operand : row.operands)
     {
         if (operand.values == Values::Choice)
         {
@@ -140,9 +140,9 @@ std::string InOneLine(std::string text)
     return std::string(Trimmed(text));
 }
 
-void CheckOperands(const CommandSpec& spec, const Arguments& arguments)
+void CheckOperands(const CommandSpec& row, const Arguments& arguments)
 {
-    for (const OperandSpec& operand : spec.operands)
+    for (const OperandSpec& operand : row.operands)
     {
         if (operand.required && !arguments.Has(operand.name))
         {
@@ -165,9 +165,9 @@ public:
         {
             mCommon.emplace_back(AddOption(mRoot, option), std::string(option.name));
         }
-        for (const CommandSpec& spec : CommandTable())
+        for (const CommandSpec& row : CommandTable())
         {
-            mCommands.push_back(MakeCommand(mRoot, spec));
+            mCommands.push_back(MakeCommand(mRoot, row));
         }
     }
 
@@ -216,7 +216,7 @@ private:
         TakeValues(mCommon, arguments);
         const auto command =
             std::find_if(mCommands.begin(), mCommands.end(),
-                         [&arguments](const ParserCommand& each) { return each.spec->name == arguments.command; });
+                         [&arguments](const ParserCommand& each) { return each.row->name == arguments.command; });
         if (arguments.Has("help") || arguments.Has("version"))
         {
             return;
@@ -227,8 +227,8 @@ private:
                         arguments.command);
         }
         TakeValues(command->options, arguments);
-        CheckOperands(*command->spec, arguments);
-        CheckChoices(*command->spec, arguments);
+        CheckOperands(*command->row, arguments);
+        CheckChoices(*command->row, arguments);
     }
 
     CLI::App mRoot{"", "zebhost"};

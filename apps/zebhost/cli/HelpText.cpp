@@ -136,9 +136,9 @@ std::string CommandHelp(const CommandSpec& command, std::size_t width)
 
 std::string HelpFor(std::string_view command, std::size_t width)
 {
-    if (const CommandSpec* spec = FindCommand(command))
+    if (const CommandSpec* row = FindCommand(command))
     {
-        return CommandHelp(*spec, width);
+        return CommandHelp(*row, width);
     }
     if (command.empty())
     {
