@@ -30,9 +30,11 @@ AudioFilterRegistrar::FactoryVector& AudioFilterRegistrar::GetFactoryVector()
 void AudioFilterRegistrar::RegisterDeferredDescriptors()
 {
     // By index and with a copy of the pair: a descriptor function may itself make a registrar.
-    for (std::size_t index = 0; index < GetFactoryVector().size(); ++index)
+    std::size_t index = 0;
+    while (index < GetFactoryVector().size())
     {
         const auto [descriptorFunction, factoryFunction] = GetFactoryVector()[index];
+        ++index;
         const boost::intrusive_ptr<AudioFilterDescriptor> descriptor = descriptorFunction();
         if (descriptor)
         {

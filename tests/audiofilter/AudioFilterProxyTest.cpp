@@ -103,7 +103,7 @@ protected:
 
     static boost::intrusive_ptr<LiveFilter> MakeConfigured()
     {
-        const boost::intrusive_ptr<LiveFilter> filter(new LiveFilter);
+        boost::intrusive_ptr<LiveFilter> filter(new LiveFilter);
         filter->SetSampleRate(96000.0F);
         filter->SetBlockSize(256);
         filter->SetMainTargetBus(MakeBus(4));

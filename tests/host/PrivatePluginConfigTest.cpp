@@ -110,7 +110,9 @@ TEST_F(PrivatePluginConfigTest, NamesAndFoldersSurviveTheMove)
         EXPECT_FALSE(ResultHolds(u8"vst"));
 
         const UTF16String elsewhere = u"/opt/vst & vst3/" + folder;
-        StartElsewhere(elsewhere + u"/3", elsewhere + u"/2");
+        const UTF16String newVST = elsewhere + u"/2";
+        const UTF16String newVST3 = elsewhere + u"/3";
+        StartElsewhere(newVST3, newVST);
         EXPECT_EQ(CatalogueIDs().size(), 2 * names.size());
         for (std::size_t index = 0; index < names.size(); ++index)
         {
@@ -121,8 +123,8 @@ TEST_F(PrivatePluginConfigTest, NamesAndFoldersSurviveTheMove)
             ASSERT_TRUE(ofVST && ofVST3);
             EXPECT_TRUE(ofVST->GetName() == names[index]);
             EXPECT_TRUE(ofVST3->GetName() == names[index]);
-            EXPECT_EQ(Text(ofVST->GetLocator()), Text(VST2(elsewhere + u"/2" + file + u".vst")));
-            EXPECT_EQ(Text(ofVST3->GetLocator()), Text(VST3(elsewhere + u"/3" + file + u".vst3")));
+            EXPECT_EQ(Text(ofVST->GetLocator()), Text(VST2(newVST + file + u".vst")));
+            EXPECT_EQ(Text(ofVST3->GetLocator()), Text(VST3(newVST3 + file + u".vst3")));
         }
     }
 }
