@@ -134,7 +134,8 @@ TEST(RefCountedObject, ManyThreadsShareOneObject)
             {
                 for (int i = 0; i < kRounds; ++i)
                 {
-                    const boost::intrusive_ptr<Ledger> another = mine;
+                    boost::intrusive_ptr<Ledger> another;
+                    another = mine;
                     ++another->mEntries[owner];
                 }
                 mine.reset();
