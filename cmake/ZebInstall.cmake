@@ -22,4 +22,17 @@ install(FILES ${PROJECT_BINARY_DIR}/zebaudiofilterhost.pc DESTINATION ${CMAKE_IN
 if(TARGET zebhost)
     set_target_properties(zebhost PROPERTIES INSTALL_RPATH $ORIGIN/../${CMAKE_INSTALL_LIBDIR})
     install(TARGETS zebhost)
+
+    # The program prints its own manual page and completions, all from the table of its options.
+    set(pages ${PROJECT_BINARY_DIR}/share)
+    file(MAKE_DIRECTORY ${pages})
+    set(print "\"$0\" man >zebhost.1 && \"$0\" completion bash >zebhost && \"$0\" completion zsh >_zebhost \
+&& \"$0\" completion fish >zebhost.fish")
+    add_custom_command(OUTPUT ${pages}/zebhost.1 COMMAND sh -c "${print}" $<TARGET_FILE:zebhost>
+        WORKING_DIRECTORY ${pages} DEPENDS zebhost VERBATIM)
+    add_custom_target(zebhost_pages ALL DEPENDS ${pages}/zebhost.1)
+    install(FILES ${pages}/zebhost.1 DESTINATION ${CMAKE_INSTALL_MANDIR}/man1)
+    install(FILES ${pages}/zebhost DESTINATION ${CMAKE_INSTALL_DATADIR}/bash-completion/completions)
+    install(FILES ${pages}/_zebhost DESTINATION ${CMAKE_INSTALL_DATADIR}/zsh/site-functions)
+    install(FILES ${pages}/zebhost.fish DESTINATION ${CMAKE_INSTALL_DATADIR}/fish/vendor_completions.d)
 endif()
