@@ -26,6 +26,10 @@ if(ZEB_SANITIZE)
     add_compile_options(-fsanitize=${ZEB_SANITIZE} -fno-omit-frame-pointer -fno-sanitize-recover=all
         -g1) # Lines are all that a report needs
     add_link_options(-fsanitize=${ZEB_SANITIZE})
+    if(ZEB_SANITIZE MATCHES undefined)
+        add_compile_options(-fno-sanitize=vptr) # A plug-in's objects keep to a binary interface, not to our types
+        add_link_options(-fno-sanitize=vptr)
+    endif()
 endif()
 
 # Boost and the standard library, compiled once for all layers.
