@@ -31,7 +31,7 @@ public:
     UTF16String AsString() const;
 
     constexpr bool operator==(const Guid&) const = default;
-    constexpr std::strong_ordering operator<=>(const Guid&) const = default;
+    constexpr std::strong_ordering operator<=>(const Guid&) const = default; // NOLINT(modernize-use-nullptr)
 
 private:
     std::uint32_t mData1 = 0;
