@@ -45,7 +45,8 @@ enum RenderingContext
 /// call Resume, then ProcessWithMapping for each block from one process thread, and Suspend after the last block:
 /// nothing here refuses a block at the wrong time. Every virtual has a working default, so the base class is a filter
 /// without parameters and buses that reports silence. A filter with a posted parameter change outlives the
-/// application's last pointer until the change has run. It dies on the main thread.
+/// application's last pointer until the change has run, so suspend it before letting go, and flush it if it gets no
+/// ticks: else it stays for ever. It dies on the main thread.
 class ZEB_EXPORT AudioFilter : public virtual zebcore::utility::RefCountedObject,
                                public ProcessMessageHandler,
                                private boost::noncopyable
@@ -94,11 +95,13 @@ public:
     virtual void Process(float** in, float** out, int frames, ChannelFlags inFlags, ChannelFlags& outFlags);
 
     /// One block in the application's channels: routes them through the channel maps if they are in use, runs queued
-    /// parameter changes, processes, and delays what passes by the plug-in by its latency.
+    /// parameter changes, processes, and delays what passes by the plug-in by its latency. Without output buses, what
+    /// passes by is left alone.
     ///
     /// With mapping, `in` and `out` hold a pointer for each main target channel, and for each further application
     /// channel that a map names; without, one for each channel of the plug-in. `frames` must not exceed the block
-    /// size. A set bit of inFlags says that the input holds silence and is not read. A set bit of outFlags says that
+    /// size. A set bit of inFlags says that the input holds silence: its buffer is not given to the plug-in, but with
+    /// mapping it must still be there and be zero, since what passes by is read. A set bit of outFlags says that
     /// the output may be taken as silent without reading it; the plug-in's own bits come in its channel order.
     /// [process]
     virtual void ProcessWithMapping(float** in, float** out, int frames, ChannelFlags inFlags,
@@ -145,8 +148,9 @@ public:
     /// Stops processing. Call it after the last block. Fires the suspended-state signal. [main]
     virtual void Suspend();
 
-    /// Runs waiting parameter changes, sizes everything for the block size, buses, maps and latency of now, and
-    /// starts processing. Fires the suspended-state signal. [main, suspended]
+    /// Runs waiting parameter changes, sizes everything for the block size, buses and maps of now and for the latency
+    /// known so far, and starts processing. Fires the suspended-state signal. If GetInitialDelay differs afterwards,
+    /// Suspend and Resume once more: what passes by the plug-in is then aligned. [main, suspended]
     virtual void Resume();
 
     /// Real time at first. [main, suspended]
@@ -229,7 +233,8 @@ public:
     /// Whether CreateCustomEditor gives an editor; false here. [main]
     virtual bool HasCustomEditor() const;
 
-    /// A new editor, which must not outlive the filter; null if there is none. [main]
+    /// The plug-in's editor, for most technologies the same one at each call: open it in one place at a time. It must
+    /// not outlive the filter. Null if there is none. [main]
     virtual boost::intrusive_ptr<AudioFilterEditor> CreateCustomEditor();
 
     /// Whether this stands in for a filter whose plug-in is missing; false here. [any]
@@ -343,7 +348,8 @@ public:
     /// Disconnects a plug-in channel. Fires the channel-map signal even if it was not connected. [main]
     void RemoveChannelMapping(Direction direction, int plugChannel);
 
-    /// Selects routing through the maps; takes effect at the next Resume. Off at first. [main, suspended]
+    /// Selects routing through the maps. Call Resume before the next block, which sizes what routing needs. Off at
+    /// first. [main, suspended]
     void SetUseChannelMap(bool use);
     bool GetUseChannelMap() const;
 
@@ -354,8 +360,9 @@ public:
     /// suspended]
     void SetDefaultChannelMap(Direction direction);
 
-    /// Gives each side-chain channel a plug-in input that is not taken; with `clearFirst` those that have one lose it
-    /// first. Fires the channel-map signal. [main]
+    /// Connects each side-chain channel, as far as there are any, to the first plug-in input whose number no slot has
+    /// as its source. With `clearFirst`, plug-in inputs that bear the numbers of the side-chain channels are
+    /// disconnected first. Fires the channel-map signal. [main]
     void AutoConnectSideChainChannels(bool clearFirst);
 
     /// A map from the first of the buses to the channels of the target with the same labels or, if no label agrees,
@@ -385,7 +392,7 @@ public:
     // Cloning
 
     /// Runs the filter's queued parameter changes and clones it; `filter` must not be null. [main]
-    static boost::intrusive_ptr<AudioFilter> Clone(const boost::intrusive_ptr<AudioFilter>& filter);
+    static boost::intrusive_ptr<AudioFilter> Clone(boost::intrusive_ptr<AudioFilter> filter);
 
     // Signals. Slots run on the thread that fires.
 
@@ -448,7 +455,8 @@ private:
     void MarkSilentChannels(ChannelFlags& flags);
     void PassDelayedChannels(float** in, float** out, int frames, ChannelFlags& flags);
 
-    // Destruction runs from the last field to the first: what the tick may use dies after the connection to it.
+    // The order is that of destruction, backwards: the connection to the tick goes before the signals above it. No
+    // tick can come between, since both belong to the main thread.
     PresetChangedSignal mPresetChangedSignal;
     AutomatedParameterChangeSignal mAutomatedParameterChangeSignal;
     ParameterPropertiesChangedSignal mParameterPropertiesChangedSignal;

@@ -44,8 +44,8 @@ public:
     /// size. Does not allocate. [process]
     void WriteData(float** channelData, unsigned int frames);
 
-    /// One pointer a channel to `frames` delayed samples, for the block just written; `frames` must not exceed the
-    /// buffer size. Null on an invalid line. Valid until the next operation. Does not allocate. [process]
+    /// One pointer a channel to `frames` delayed samples, for the block just written. Null on an invalid line, or
+    /// with more frames than the buffer size. Valid until the next operation. Does not allocate. [process]
     float** GetDelayedOutput(unsigned int frames);
 
 private:

@@ -86,9 +86,11 @@ boost::intrusive_ptr<AudioFilter> AudioFilter::Clone() const
     return clone;
 }
 
-boost::intrusive_ptr<AudioFilter> AudioFilter::Clone(const boost::intrusive_ptr<AudioFilter>& filter)
+boost::intrusive_ptr<AudioFilter> AudioFilter::Clone(boost::intrusive_ptr<AudioFilter> filter)
 {
-    filter->FlushMessageQueue(); // So that queued parameter changes are in the state that gets saved
+    // So that queued parameter changes are in the state that gets saved. The filter is held here, since a slot may
+    // drop the caller's pointer.
+    filter->FlushMessageQueue();
     return filter->Clone();
 }
 

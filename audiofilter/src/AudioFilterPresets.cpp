@@ -9,10 +9,23 @@ namespace zebaudiofilterhost
 bool AudioFilter::LoadSettings(const PresetData& preset)
 {
     StartLoadingSettings();
-    const bool loaded = ValidatePresetVersion(preset.GetVersion()) && LoadByType(preset);
-    // Also after a refusal, so that the application shows what stands now.
-    FinishLoadingSettings(true);
-    BumpParameterDirtyCount();
+    // Also after a refusal or a throw, so that the application shows what stands now.
+    const auto finish = [this]
+    {
+        FinishLoadingSettings(true);
+        BumpParameterDirtyCount();
+    };
+    bool loaded = false;
+    try
+    {
+        loaded = ValidatePresetVersion(preset.GetVersion()) && LoadByType(preset);
+    }
+    catch (...)
+    {
+        finish();
+        throw;
+    }
+    finish();
     return loaded;
 }
 

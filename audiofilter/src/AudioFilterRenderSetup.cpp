@@ -93,6 +93,7 @@ void AudioFilter::BuildChannelMaps()
     mSilentChannels.assign(SizeOf(mainChannels), -1);
     mOutputChannelIndices.assign(outputs, -1);
     mOutputPointers.assign(outputs, mDiscardBuffer.data());
+    // Without outputs nothing passes by either: the application keeps what it has.
     if (!mOutputBuses.empty() && mainChannels > 0)
         mDelayLine = new DelayLine(static_cast<unsigned int>(std::max(mBlockSize, 0)), LatencyForDelayLine(),
                                    static_cast<unsigned int>(mainChannels));
@@ -127,6 +128,8 @@ void AudioFilter::CollectRenderIndices(RenderIndices& indices) const
 {
     const int mainChannels = mMainTargetBus.GetChannelCount();
     const int allChannels = mainChannels + mSideChainTargetBus.GetChannelCount();
+    // Plug-in channels count only as far as the application has channels, whatever slots the maps name; the side
+    // chain widens the inputs alone.
     const std::set<int> fed = CollectConnections(mInputChannelMap, allChannels, indices.inputs);
     const std::set<int> written = CollectConnections(mOutputChannelMap, mainChannels, indices.outputs);
 

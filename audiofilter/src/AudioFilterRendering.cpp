@@ -101,7 +101,7 @@ void AudioFilter::PassDelayedChannels(float** in, float** out, int frames, Chann
     const auto count = static_cast<unsigned int>(frames);
     mDelayLine->WriteData(in, count);
     float** const delayed = mDelayLine->GetDelayedOutput(count);
-    if (delayed == nullptr) // There was no memory for the line
+    if (delayed == nullptr) // There was no memory for the line, or it was made for smaller blocks
         return;
     for (int& element : mDelayedChannels)
     {

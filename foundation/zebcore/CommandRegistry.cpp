@@ -17,7 +17,8 @@ struct Entry
 
 std::map<UTF16String, Entry>& Entries()
 {
-    static std::map<UTF16String, Entry> sEntries;
+    // Never destroyed: an application's own statics may terminate the module as they go.
+    static auto& sEntries = *new std::map<UTF16String, Entry>;
     return sEntries;
 }
 

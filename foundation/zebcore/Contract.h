@@ -12,7 +12,7 @@ ZEB_EXPORT bool IsDebuggerAttached();
 /// the debugger. [any]
 ZEB_EXPORT bool BreakAfterContractDialog(const char* expression, const char* file, const char* function, int line);
 
-/// Reports, breaks into an attached debugger, then throws config::Error. [any]
+/// Reports, breaks into an attached debugger, then throws config::Error. [main]
 [[noreturn]] ZEB_EXPORT void RaiseContractViolation(const char* expression, const char* file, const char* function,
                                                     int line);
 

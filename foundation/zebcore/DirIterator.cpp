@@ -53,7 +53,8 @@ bool IsSubdirectory(const UTF16String& path, unsigned char type, BackLinkTest& l
     if (type != DT_LNK && type != DT_UNKNOWN)
         return type == DT_DIR;
     const FileStatus status = GetFileStatus(path);
-    return status.IsDirectory() && !(type == DT_LNK && leadsBack(status));
+    // Where the type is unknown it may be a link, too; a true sub-directory is never on its own way.
+    return status.IsDirectory() && !leadsBack(status);
 }
 
 Names ReadSubdirNames(const UTF16String& directory)

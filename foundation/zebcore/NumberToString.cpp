@@ -18,11 +18,11 @@ constexpr unsigned long kMostDecimals = 100;
 /// Sign, digits of the largest double, point, decimals.
 constexpr std::size_t kLongestText = 1 + std::numeric_limits<double>::max_exponent10 + 1 + 1 + kMostDecimals;
 
-/// "-0.00" tells a reader nothing that "0.00" does not.
-std::string_view WithoutSignOfZero(std::string_view text)
+/// "-0.00" and "-nan" tell a reader nothing that "0.00" and "nan" do not.
+std::string_view WithoutIdleSign(std::string_view text)
 {
-    const bool isZero = text.find_first_not_of("-0.") == std::string_view::npos;
-    return isZero && text.starts_with('-') ? text.substr(1) : text;
+    const bool isIdle = text == "-nan" || text.find_first_not_of("-0.") == std::string_view::npos;
+    return isIdle && text.starts_with('-') ? text.substr(1) : text;
 }
 
 } // namespace
@@ -34,7 +34,7 @@ UTF16String NumberToString(double value, unsigned long /*integerDigits*/, unsign
     const int precision = static_cast<int>(std::min(decimals, kMostDecimals));
     const auto* end =
         std::to_chars(buffer.data(), buffer.data() + buffer.size(), value, std::chars_format::fixed, precision).ptr;
-    return AsciiToUTF16(WithoutSignOfZero({buffer.data(), static_cast<std::size_t>(end - buffer.data())}));
+    return AsciiToUTF16(WithoutIdleSign({buffer.data(), static_cast<std::size_t>(end - buffer.data())}));
 }
 
 } // namespace zebcore::utility

@@ -1,9 +1,10 @@
 #include "foundation/zebcore/OSModule.h"
 
-#include "foundation/zebcore/StringConversion.h"
+#include "foundation/zebcore/NativePath.h"
 #include "foundation/zebcore/internal/OSModulePlatform.h"
 
 #include <memory>
+#include <stdexcept>
 
 namespace zebcore::utility
 {
@@ -25,7 +26,15 @@ std::string& LastFailure()
 
 void SetLastFailure(const UTF16String& path, const char* reason)
 {
-    LastFailure() = "\"" + NarrowFromUTF16(path) + "\" could not be loaded: " + reason + ".";
+    LastFailure() = "\"" + filesupport::ToNativePath(path) + "\" could not be loaded: " + reason + ".";
+}
+
+std::string NativePath(const UTF16String& path)
+{
+    // The system would stop at a zero unit, and load a file of another name.
+    if (path.find(u'\0') != UTF16String::npos)
+        throw std::invalid_argument("its path holds a zero unit");
+    return filesupport::ToNativePath(path);
 }
 
 /// Runs a step that works with the platform. Nothing it throws gets out, what a plug-in's initializers throw
@@ -52,18 +61,19 @@ auto WithoutThrowing(const UTF16String& path, Step step) noexcept -> decltype(st
 
 OSModuleRef LoadOSModule(const UTF16String& path) noexcept
 {
-    return WithoutThrowing(path,
-                           [&]() -> OSModuleRef
-                           {
-                               const std::string narrowPath = NarrowFromUTF16(path);
-                               const std::string binary = platform::FindBinary(narrowPath, LastFailure());
-                               if (binary.empty())
-                                   return nullptr;
-                               void* handle = platform::OpenModule(narrowPath, binary, LastFailure());
-                               if (handle == nullptr)
-                                   return nullptr;
-                               return std::make_unique<OSModule>(OSModule{handle, UTF16FromNarrow(binary)}).release();
-                           });
+    return WithoutThrowing(
+        path,
+        [&]() -> OSModuleRef
+        {
+            const std::string nativePath = NativePath(path);
+            const std::string binary = platform::FindBinary(nativePath, LastFailure());
+            if (binary.empty())
+                return nullptr;
+            void* handle = platform::OpenModule(nativePath, binary, LastFailure());
+            if (handle == nullptr)
+                return nullptr;
+            return std::make_unique<OSModule>(OSModule{handle, filesupport::FromNativePath(binary)}).release();
+        });
 }
 
 void ReleaseOSModule(OSModuleRef module) noexcept
@@ -76,13 +86,13 @@ void ReleaseOSModule(OSModuleRef module) noexcept
 
 UTF16String FindOSModuleBinary(const UTF16String& path) noexcept
 {
-    return WithoutThrowing(path, [&]
-                           { return UTF16FromNarrow(platform::FindBinary(NarrowFromUTF16(path), LastFailure())); });
+    return WithoutThrowing(
+        path, [&] { return filesupport::FromNativePath(platform::FindBinary(NativePath(path), LastFailure())); });
 }
 
 UTF16String GetLastOSModuleError()
 {
-    return UTF16FromNarrow(LastFailure());
+    return filesupport::FromNativePath(LastFailure());
 }
 
 void* GetOSModuleHandle(OSModuleRef module) noexcept

@@ -6,7 +6,8 @@
 #include "foundation/zebcore/StringTypes.h"
 
 /// Property lists as text and files. The text is XML in UTF-8, described in docs/PROPERTY-LISTS.md. Whatever a list
-/// holds comes back bit for bit: NaN payloads, line ends, zero units, lone surrogates, ill-formed UTF-8.
+/// holds, down to kMaxListDepth, comes back bit for bit: NaN payloads, line ends, zero units, lone surrogates,
+/// ill-formed UTF-8.
 namespace zebcore::proplist::utils
 {
 

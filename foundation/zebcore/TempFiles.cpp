@@ -49,7 +49,10 @@ pid_t MakerOf(std::string_view name, std::string_view prefix)
     name.remove_prefix(prefix.size());
     pid_t pid = 0;
     const auto [end, error] = std::from_chars(name.data(), name.data() + name.size(), pid);
-    return error == std::errc() && pid > 0 && end != name.data() + name.size() && *end == '-' ? pid : 0;
+    name.remove_prefix(static_cast<std::size_t>(end - name.data()));
+    const bool hasCount =
+        name.size() > 1 && name.front() == '-' && name.find_first_not_of("0123456789", 1) == std::string_view::npos;
+    return error == std::errc() && pid > 0 && hasCount ? pid : 0;
 }
 
 // A process of the number may be missing here and run on another machine that shares the folder, so age counts, too.

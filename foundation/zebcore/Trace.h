@@ -43,7 +43,7 @@ ZEB_EXPORT void Trace(const unsigned char* line);
 ZEB_EXPORT void DebugTrace(const unsigned char* text);
 
 /// The two words that a trace point keeps. They need no order between them: racing threads lose at most one update of
-/// the flag, and the next look at the counter makes up for it.
+/// the flag, which then stays as it was until the configuration changes again.
 struct TracePoint
 {
     std::atomic<bool> mEnabled{false};

@@ -60,6 +60,11 @@ TEST_F(AudioFilterCloneTest, CarriesBusesRateSettingsMapsAndPresetName)
     EXPECT_EQ(clone->GetInputBuses().size(), 2U);
     EXPECT_EQ(clone->GetNumberOfInputChannels(), 3);
     EXPECT_EQ(clone->mParameters, filter->mParameters);
+    struct Probe : public RecordingFilter
+    {
+        using RecordingFilter::mSampleRate;
+    };
+    EXPECT_EQ((*clone).*(&Probe::mSampleRate), 48000.0F);
     EXPECT_TRUE(clone->GetUseChannelMap());
     EXPECT_TRUE(clone->GetChannelMap(AudioFilter::kDirection_Input) ==
                 filter->GetChannelMap(AudioFilter::kDirection_Input));

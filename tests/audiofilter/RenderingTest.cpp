@@ -69,6 +69,25 @@ TEST_F(RenderingTest, ConnectedChannelsArePassedWithoutACopy)
     EXPECT_EQ(call.frames, kFrames);
 }
 
+TEST_F(RenderingTest, EditsWhileMapsAreOffDoNotReachTheArrays)
+{
+    Start({1}, {1}, 2, {{0, 0}}, {{0, 0}});
+    mFilter->SetUseChannelMap(false);
+    mFilter->SetChannelMap(MakeMap(2, {{1, 0}}), kInput);
+    mFilter->SetUseChannelMap(true);
+    EXPECT_EQ(Block().in[0], mIn.Channel(0));
+}
+
+TEST_F(RenderingTest, ANewBlockSizeRebuildsNothingBeforeResume)
+{
+    Start({1}, {1}, 2, {{0, 0}}, {{0, 0}}, kFrames);
+    mIn.Fill(1.0F);
+    Block();
+    mFilter->SetBlockSize(4 * kFrames);
+    Block();
+    EXPECT_EQ(mOut.Channel(1)[0], 1.0F); // Still the old line with its content
+}
+
 TEST_F(RenderingTest, SilentAndUnconnectedInputsGetSilence)
 {
     Start({3}, {1}, 4, {{1, 0}, {3, 1}}, {{0, 0}});

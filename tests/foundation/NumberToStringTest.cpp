@@ -40,6 +40,7 @@ TEST(NumberToString, PrintsWhatIsNoNumber)
     EXPECT_TRUE(Text(std::numeric_limits<double>::infinity(), 2) == u"inf");
     EXPECT_TRUE(Text(-std::numeric_limits<double>::infinity(), 2) == u"-inf");
     EXPECT_TRUE(Text(std::numeric_limits<double>::quiet_NaN(), 2) == u"nan");
+    EXPECT_TRUE(Text(-std::numeric_limits<double>::quiet_NaN(), 2) == u"nan");
 }
 
 TEST(NumberToString, BearsExtremes)

@@ -1,5 +1,6 @@
 #include "foundation/zebcore/OSModule.h"
 
+#include "foundation/zebcore/NativePath.h"
 #include "foundation/zebcore/StringConversion.h"
 
 #include <gtest/gtest.h>
@@ -48,7 +49,7 @@ protected:
         fs::create_directories((mFolder / relativePath).parent_path());
         std::ofstream(mFolder / relativePath, std::ios::binary) << content;
     }
-    UTF16String Path(const std::string& name) const { return UTF16FromNarrow((mFolder / name).string()); }
+    UTF16String Path(const std::string& name) const { return filesupport::FromNativePath((mFolder / name).string()); }
 
     static bool LastErrorHolds(const std::string& text)
     {
@@ -73,6 +74,7 @@ TEST_F(OSModuleTest, LoadsBundlesAndPlainFiles)
         {"D.vst/D.so", "D.vst"},
         {"E.vst/E-vst.so", "E.vst"},
         {"F.so", "F.so"},
+        {"\xFF\xC3.vst3" + inBundle + "/\xFF\xC3.so", "\xFF\xC3.vst3"},
     };
     for (const Case& bundle : cases)
     {

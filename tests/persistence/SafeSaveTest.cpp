@@ -295,8 +295,8 @@ TEST_F(SafeSaveTest, WhatKilledSavesLeftBehindIsRemoved)
     ASSERT_EQ(waitpid(child, nullptr, 0), child); // nobody has its number any more
     const std::string dead = std::to_string(child);
     const std::string own = std::to_string(getpid());
-    for (const std::string& name :
-         {"a.tmp-" + dead + "-1", "a.tmp-" + own + "-999999", std::string("a.tmp-notes"), "b.tmp-" + dead + "-1"})
+    for (const std::string& name : {"a.tmp-" + dead + "-1", "a.tmp-" + own + "-999999", std::string("a.tmp-notes"),
+                                    "a.tmp-" + dead + "-1-notes", "b.tmp-" + dead + "-1"})
     {
         mFolder.Write(name, "x");
         std::filesystem::last_write_time(mFolder.Path(name),
@@ -305,5 +305,5 @@ TEST_F(SafeSaveTest, WhatKilledSavesLeftBehindIsRemoved)
     mFolder.Write("a.tmp-" + dead + "-2", "young: perhaps of another machine");
     Save(mFolder.File("a"), u8"x");
     EXPECT_FALSE(std::filesystem::exists(mFolder.Path("a.tmp-" + dead + "-1")));
-    EXPECT_EQ(mFolder.CountFiles(), 5U);
+    EXPECT_EQ(mFolder.CountFiles(), 6U);
 }

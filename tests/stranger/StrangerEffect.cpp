@@ -1,5 +1,5 @@
-// A gain behind a fixed look-ahead, with an editor: latency to see at the right sample, a parameter to save and restore,
-// and a window to open.
+// A gain behind a fixed look-ahead, with an editor: latency to see at the right sample, a parameter to save and
+// restore, and a window to open.
 
 #include <juce_audio_utils/juce_audio_utils.h>
 

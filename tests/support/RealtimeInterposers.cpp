@@ -87,8 +87,8 @@ ZEB_INTERPOSE void free(void* block) noexcept
 }
 
 // One lock function of the C library: counted, then carried out.
-#define ZEB_INTERPOSE_LOCK(name, parameters, arguments, specification)                                               \
-    ZEB_INTERPOSE int name parameters specification                                                                  \
+#define ZEB_INTERPOSE_LOCK(name, parameters, arguments, exceptions)                                                  \
+    ZEB_INTERPOSE int name parameters exceptions                                                                     \
     {                                                                                                                \
         static int(*sOriginal) parameters = nullptr;                                                                 \
         Record(Violation::Lock);                                                                                     \

@@ -87,6 +87,7 @@ TEST(DelayLine, BlockAboveTheBufferSizeChangesNothing)
     Source source;
     line->WriteData(source.Next(5), 5);
     EXPECT_EQ(line->GetDelayedOutput(4)[0][3], 4.0F);
+    EXPECT_EQ(line->GetDelayedOutput(5), nullptr);
 }
 
 TEST(DelayLine, SameBufferSizeKeepsTheContentAndAnyDelayEmptiesIt)

@@ -43,6 +43,28 @@ boost::intrusive_ptr<VST3AudioFilter> MakeGain()
     return module->CreateVST3AudioFilter(ids.front());
 }
 
+// Answers every question, so that the whole process context is filled.
+class Host final : public IAudioFilterHost
+{
+public:
+    bool GetTimeInfo(utility::TimecodeFormat& /*format*/, int& /*first*/, int& /*second*/) const override
+    {
+        return false;
+    }
+    bool GetTempo(utility::Tempo& tempo) const override
+    {
+        tempo.mTempo = 120.0;
+        tempo.mNumerator = 4;
+        tempo.mDenominator = 4;
+        return true;
+    }
+    bool GetTransportState(bool& playing, bool& /*recording*/, bool& /*looping*/) const override
+    {
+        playing = true;
+        return true;
+    }
+};
+
 class ProcessPath : public ::testing::Test
 {
 protected:
@@ -53,6 +75,7 @@ protected:
         ASSERT_TRUE(mFilter);
         const ChannelLayout stereo = zebmediatypes::CreateStereoChannelLayout();
         mFilter->RequestIOConfiguration({stereo}, {stereo});
+        mFilter->SetAudioFilterHost(&mHost);
         mFilter->SetSampleRate(48000.0F);
         mFilter->SetBlockSize(kFrames);
         mFilter->SetMainTargetBus(Surround());
@@ -66,6 +89,7 @@ protected:
         if (mFilter)
         {
             mFilter->FlushMessageQueue();
+            mFilter->SetAudioFilterHost(nullptr);
         }
     }
 
@@ -96,6 +120,10 @@ protected:
         const auto direction = round % 2 == 0 ? AudioFilter::kDirection_Input : AudioFilter::kDirection_Output;
         mFilter->PostSetParameter(0, static_cast<float>(round % 100) / 100.0F);
         mFilter->AssignChannelMapping(direction, round % 2, round % static_cast<int>(kChannels));
+        if (round % 64 == 0)
+        {
+            mFilter->restartComponent(Steinberg::Vst::kParamTitlesChanged);
+        }
         mFilter->OnUITimerTick();
     }
 
@@ -112,6 +140,7 @@ protected:
         }
     }
 
+    Host mHost;
     boost::intrusive_ptr<VST3AudioFilter> mFilter;
     std::atomic<bool> mDone{false};
 };

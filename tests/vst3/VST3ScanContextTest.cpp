@@ -151,6 +151,8 @@ TEST_F(VST3ScanContextTest, StartingOverForgetsTheBundleInProgress)
     mContext->SetPluginLocators({Fixture("Normal")}, false);
     EXPECT_TRUE(Progress(Fixture("Normal")).first.empty());
     EXPECT_FALSE(mContext->Continue());
+    ASSERT_NE(InfoOf(Fixture("Normal")), nullptr);
+    EXPECT_FALSE(InfoOf(Fixture("Normal"))->HasAnyNonSynthEffect()) << "its only class lies before the old index";
     EXPECT_EQ(InfoOf(Trio()), nullptr);
     mContext->SetPluginLocators({Trio()}, false);
     EXPECT_TRUE(mContext->Continue());

@@ -48,7 +48,7 @@ void DelayLine::AppendWrapped(float** channelData, unsigned int frames)
 
 float** DelayLine::GetDelayedOutput(unsigned int frames)
 {
-    if (!mValid)
+    if (!mValid || frames > mBufferSize) // A larger block would begin in front of the ring
         return nullptr;
 
     const int ringLength = static_cast<int>(mRingLength);

@@ -19,7 +19,17 @@ void ProcessMessageHandler::PumpFromProcessThread()
         // The message list holds a reference until after this one is gone, so nothing is freed here.
         const boost::intrusive_ptr<Message> message = std::move(mRing[read]);
         mReadIndex.store((read + 1) % kRingSize, std::memory_order_release); // Gives the empty place back
-        message->SetState(message->ExecuteOnProcessThread() ? Message::kState_Finished : Message::kState_ProcessDone);
+        bool done = true;
+        try
+        {
+            done = message->ExecuteOnProcessThread();
+        }
+        catch (...)
+        {
+            message->SetState(Message::kState_Finished); // Else the list would keep it, and its filter, for ever
+            throw;
+        }
+        message->SetState(done ? Message::kState_Finished : Message::kState_ProcessDone);
     }
 }
 

@@ -7,6 +7,7 @@
 #include <foundation/zebcore/FileUtils.h>
 #include <foundation/zebcore/NativePath.h>
 #include <foundation/zebcore/SafeSave.h>
+#include <foundation/zebcore/XmlUtils.h>
 
 #include <array>
 #include <ctime>
@@ -24,7 +25,10 @@ constexpr int kVersion = 1;
 
 std::string Key(const PluginLocator& locator)
 {
-    return zebcore::filesupport::ToNativePath(locator.ToString());
+    // Bytes that are no UTF-8 can't stand in JSON; escaped they can.
+    zebcore::UTF16String key;
+    zebcore::xml::utils::EncodeReservedCharacters(locator.ToString(), key);
+    return ToUTF8(key);
 }
 
 std::string TimeOfNow()

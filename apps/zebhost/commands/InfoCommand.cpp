@@ -1,4 +1,5 @@
 #include "audio/ChannelNames.h"
+#include "catalogue/PluginFinder.h"
 #include "catalogue/PresetStore.h"
 #include "commands/Commands.h"
 #include "commands/FilterCommand.h"
@@ -96,7 +97,7 @@ std::string Text(const CommandContext& context, const FilterOfCommand& filter)
     return filter.Name() + (vendor.empty() ? "" : " by " + vendor) + "\n" +                                   //
            "ID:           " + ToUTF8(descriptor.GetUniqueID()) + "\n" +                                       //
            "Kind:         " + TechnologyName(descriptor) + (category.empty() ? "" : ", " + category) + "\n" + //
-           "Path:         " + ToUTF8(descriptor.GetLocator().GetPath()) + "\n" +                              //
+           "Path:         " + PathOf(descriptor.GetLocator()) + "\n" +                                        //
            BusLines("Input:        ", filter->GetInputBuses()) +                                              //
            BusLines("Output:       ", filter->GetOutputBuses()) +                                             //
            "Latency:      " + Counted(static_cast<std::size_t>(std::max(filter->GetInitialDelay(), 0)), "frame") +

@@ -7,7 +7,8 @@
 namespace zebcore::utility::platform
 {
 
-// The platform's side of OSModule.h. Paths and texts are UTF-8. failure receives a sentence that names the file.
+// The platform's side of OSModule.h. Paths are as the system takes them, also inside the texts. failure receives a
+// sentence that names the file.
 
 /// Empty on failure.
 std::string FindBinary(const std::string& path, std::string& failure);

@@ -103,7 +103,8 @@ std::string FindBinary(const std::string& path, std::string& failure)
     const fs::file_status status = fs::status(bundle, error);
     if (!fs::exists(status))
     {
-        failure = Quoted(bundle) + " does not exist.";
+        const bool isMissing = status.type() == fs::file_type::not_found;
+        failure = Quoted(bundle) + (isMissing ? " does not exist." : " cannot be reached: " + error.message() + ".");
         return {};
     }
     if (!fs::is_directory(status))

@@ -1,9 +1,8 @@
 #include "foundation/zebcore/internal/OSModulePlatform.h"
 
-#include "foundation/zebcore/StringConversion.h"
-#include "foundation/zebcore/mac/MACtoZEB.h"
-
 #include <CoreFoundation/CoreFoundation.h>
+
+#include <array>
 
 namespace zebcore::utility::platform
 {
@@ -27,9 +26,9 @@ std::string ExecutablePath(CFBundleRef bundle)
     const CFURLRef url = CFBundleCopyExecutableURL(bundle);
     if (url == nullptr)
         return {};
-    const CFStringRef path = CFURLCopyFileSystemPath(url, kCFURLPOSIXPathStyle);
-    const std::string result = NarrowFromUTF16(MACtoZEB(path));
-    CFRelease(path);
+    std::array<UInt8, 4096> path{};
+    const bool isKnown = CFURLGetFileSystemRepresentation(url, true, path.data(), static_cast<CFIndex>(path.size()));
+    const std::string result = isKnown ? reinterpret_cast<const char*>(path.data()) : "";
     CFRelease(url);
     return result;
 }

@@ -24,10 +24,12 @@ public:
     explicit Halving(const zab::UTF16String& id) : AudioFilter(id, u"Halving")
     {
         AddInputBus(zab::AudioFilterBusDescription::CreateMono(u"In", zab::AudioFilterBusDescription::kBusType_Main));
-        AddOutputBus(zab::AudioFilterBusDescription::CreateMono(u"Out", zab::AudioFilterBusDescription::kBusType_Main));
+        AddOutputBus(
+            zab::AudioFilterBusDescription::CreateMono(u"Out", zab::AudioFilterBusDescription::kBusType_Main));
     }
 
-    void Process(float** in, float** out, int frames, zab::ChannelFlags /*inFlags*/, zab::ChannelFlags& outFlags) override
+    void Process(float** in, float** out, int frames, zab::ChannelFlags /*inFlags*/,
+                 zab::ChannelFlags& outFlags) override
     {
         std::transform(in[0], in[0] + frames, out[0], [](float sample) { return sample / 2; });
         outFlags = zab::ChannelFlags();
@@ -36,7 +38,8 @@ public:
 
 boost::intrusive_ptr<zab::AudioFilterDescriptor> DescribeHalving()
 {
-    return new zab::AudioFilterDescriptor(u"Halving", 1, zab::AudioFilterCategory(1), kHalvingID, kHalvingGuid, false);
+    return new zab::AudioFilterDescriptor(u"Halving", 1, zab::AudioFilterCategory(1), kHalvingID, kHalvingGuid,
+                                          false);
 }
 
 boost::intrusive_ptr<zab::AudioFilter> MakeHalving(const zab::UTF16String& id)

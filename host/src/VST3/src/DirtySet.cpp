@@ -30,14 +30,16 @@ void DirtySet::Remove(std::size_t number)
     for (std::size_t level = 0; level < mLevels.size(); ++level, number /= kBits)
     {
         const std::uint64_t bit = BitOf(number);
-        if ((mLevels[level][number / kBits].fetch_and(~bit, std::memory_order_acq_rel) & ~bit) != 0)
-            return;
+        const std::uint64_t others = mLevels[level][number / kBits].fetch_and(~bit, std::memory_order_acq_rel) & ~bit;
+        // Asked ahead of the others: whoever added below saw the bit still set, or sets it again.
         const bool addedMeanwhile = level > 0 && mLevels[level - 1][number].load(std::memory_order_acquire) != 0;
         if (addedMeanwhile)
         {
             AddAbove(level, number);
             return;
         }
+        if (others != 0)
+            return;
     }
 }
 

@@ -12,8 +12,9 @@ namespace zebaudiofilterhost::vst3
 
 /// A set of numbers that any thread adds to and one takes from, in ascending order, at a cost that follows what is in
 /// it and not how large it could be. A tree of words of 64 bits: a bit says that there may be something in the word
-/// below it. Whoever adds sets bits upward from the leaf; whoever takes clears them downward: so a bit whose leaf was
-/// emptied meanwhile can stay behind, and a number is never lost. No lock, no allocation after construction.
+/// below it. Whoever adds sets bits upward from the leaf; who takes all clears them downward; who removes one clears
+/// them upward and puts back what was filled below meanwhile: so a bit over an empty word can stay behind, and a
+/// number is never lost. No lock, no allocation after construction.
 class DirtySet
 {
 public:

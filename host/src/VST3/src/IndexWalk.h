@@ -11,7 +11,7 @@ enum class IndexWalk
     kStop     ///< the walk has what it wants
 };
 
-/// No list of a plug-in is longer.
+/// No list of a plug-in is longer; what lies beyond is not seen, since some plug-ins answer for any index.
 inline constexpr int kMaxListLength = 32768;
 /// So many indices in a row without anything show that the list has ended, whatever its count says.
 inline constexpr int kMaxMissingInARow = 256;

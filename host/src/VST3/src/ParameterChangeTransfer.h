@@ -48,7 +48,8 @@ public:
     /// Takes the oldest change of the ID out. False, with nothing written, when there is none. [any], one at a time
     bool GetNextChange(Steinberg::Vst::ParamID id, double& value, Steinberg::int32& sampleOffset);
 
-    /// Moves all that is pending, by ascending ID and oldest first. True if something was moved. [process], or
+    /// Moves what is pending, by ascending ID and oldest first. Changes of an ID behind one that another thread is
+    /// just writing keep their order and come with a later call. True if something was moved. [process], or
     /// [main, suspended]
     bool TransferChangesTo(ParameterChanges& changes);
 

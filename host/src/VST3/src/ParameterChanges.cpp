@@ -35,6 +35,21 @@ void ParameterChanges::SetMaxParameters(int32 count)
     mUsedCount = std::min(mUsedCount, count);
 }
 
+ParameterChanges::Queues ParameterChanges::MakeQueues(int32 count)
+{
+    Queues queues;
+    queues.reserve(static_cast<std::size_t>(count));
+    for (int32 index = 0; index < count; ++index)
+        queues.push_back(MakeQueue(kUnusedQueue));
+    return queues;
+}
+
+void ParameterChanges::Swap(Queues& queues)
+{
+    mQueues.swap(queues);
+    mUsedCount = 0;
+}
+
 void ParameterChanges::ClearQueue()
 {
     mUsedCount = 0;

@@ -17,6 +17,8 @@ namespace zebaudiofilterhost::vst3
 class ParameterChanges final : public Steinberg::Vst::IParameterChanges
 {
 public:
+    using Queues = std::vector<PluginPtr<ParameterValueQueue>>;
+
     ParameterChanges() = default;
     ~ParameterChanges() = default;
 
@@ -26,6 +28,13 @@ public:
     /// Makes or drops queues so that `count` different parameters fit into a block without allocating. A negative
     /// count does nothing. [main, suspended]
     void SetMaxParameters(Steinberg::int32 count);
+
+    /// `count` queues that no parameter uses, for Swap. [any]
+    static Queues MakeQueues(Steinberg::int32 count);
+    /// Exchanges the queues for others without allocating, which has the effect of SetMaxParameters; none is in use
+    /// afterwards. [process]
+    void Swap(Queues& queues);
+
     /// Nothing counts as used any more; the queues keep their points until they are used again.
     void ClearQueue();
 
@@ -43,7 +52,7 @@ public:
 
 private:
     HostReferenceCount mReferenceCount;
-    std::vector<PluginPtr<ParameterValueQueue>> mQueues;
+    Queues mQueues;
     Steinberg::int32 mUsedCount = 0;
 };
 

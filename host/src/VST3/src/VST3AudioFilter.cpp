@@ -70,7 +70,7 @@ VST3AudioFilter::VST3AudioFilter(Steinberg::IPluginFactory* factory, const Stein
     SetDisplayName(name);
     mInitialized = ok;
     BuildParameterInfos();
-    FitParameterQueues();
+    TakeOfferedQueues();
     BuildIOConfiguration();
     if (mProcessor)
         mLatency = static_cast<int>(mProcessor->getLatencySamples());
@@ -229,6 +229,8 @@ void VST3AudioFilter::ReleaseParameters()
 {
     mParameters.Publish({});
     mParameters.FreeRetired();
+    FreeSpentQueues();
+    const std::unique_ptr<QueueSet> offered(mOfferedQueues.exchange(nullptr));
 }
 
 void VST3AudioFilter::DisconnectController()

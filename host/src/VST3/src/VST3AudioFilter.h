@@ -33,8 +33,9 @@ inline constexpr std::uint32_t kNoParameterID = 4294967295U;
 
 /// One class of a VST 3 bundle as a filter, and the host that this plug-in talks to.
 ///
-/// A plug-in that does not come up leaves an object that is safe to use in every way and does nothing: IsInitialized
-/// tells. The plug-in's references on the host faces do not count; the filter lives by its own count alone.
+/// A plug-in that does not come up leaves an object without buses that never processes: IsInitialized tells. What was
+/// made of it until then stays, and is still asked for state and parameters. The plug-in's references on the host
+/// faces do not count; the filter lives by its own count alone.
 class VST3AudioFilter : public AudioFilter,
                         public Steinberg::Vst::IHostApplication,
                         public Steinberg::Vst::IComponentHandler,
@@ -115,6 +116,14 @@ public:
     const char* PLUGIN_API GetUILanguageString() override;
 
 private:
+    // Queues for the parameters of a rebuild, on their way to whoever processes, and those replaced on the way back.
+    struct QueueSet
+    {
+        ParameterChanges::Queues mInput;
+        ParameterChanges::Queues mOutput;
+        QueueSet* mNext = nullptr;
+    };
+
     // Construction, in this order.
     UTF16String ReadClassInfo(const Steinberg::PClassInfo& classInfo);
     UTF16String ReadUnicodeClassInfo(Steinberg::IPluginFactory3& factory);
@@ -145,8 +154,11 @@ private:
 
     // Parameters.
     void BuildParameterInfos();
+    void RebuildParameterInfos();
+    void OfferQueues(int count);
+    void TakeOfferedQueues();
+    void FreeSpentQueues();
     void TakeProgramChange(std::uint32_t id, int index);
-    void FitParameterQueues();
     void PassOutputToController();
     boost::intrusive_ptr<VST3ParameterInfo> FindParameterInfo(int index) const;
     bool FindParameterID(int index, std::uint32_t& id) const;
@@ -194,7 +206,9 @@ private:
     ParameterChanges mOutputChanges;         // what process writes
     ParameterChangeTransfer mOutputTransfer; // waiting for the controller
     bool mProcessErrorReported = false;
-    std::atomic<int> mWantedQueues = -1; // what the parameter changes are to be fitted to next; -1 for nothing
+    std::atomic<unsigned int> mRebuildsAsked = 0;    // by restartComponent, and not yet answered
+    std::atomic<QueueSet*> mOfferedQueues = nullptr; // owned; taken by the next block, flush or Resume
+    std::atomic<QueueSet*> mSpentQueues = nullptr;   // owned list; freed on the main thread
     std::atomic<bool> mFlushing = false;
     HostRunLoop mRunLoop;
 };

@@ -1,6 +1,8 @@
 #include "host/src/VST3/src/IndexWalk.h"
+#include "host/src/VST3/src/ScopeExit.h"
 #include "host/src/VST3/src/VST3AudioFilter.h"
 
+#include <memory>
 #include <utility>
 
 namespace zebaudiofilterhost::vst3
@@ -43,7 +45,10 @@ std::vector<ListedParameter> ListParameters(Steinberg::Vst::IEditController& con
                                     ParameterInfo info = {};
                                     const Steinberg::tresult result = controller.getParameterInfo(index, info);
                                     parameters.push_back({info.id, info.flags, info.unitId});
-                                    return result == Steinberg::kResultOk ? IndexWalk::kFound : IndexWalk::kMissing;
+                                    // Some describe the parameter and report a failure all the same.
+                                    const bool told =
+                                        result == Steinberg::kResultOk || info.id != 0 || info.title[0] != 0;
+                                    return told ? IndexWalk::kFound : IndexWalk::kMissing;
                                 });
     parameters.resize(static_cast<std::size_t>(length));
     return parameters;
@@ -60,8 +65,29 @@ bool IsIndexOf(int index, const ParameterTable& table)
 // the old one as a whole.
 void VST3AudioFilter::BuildParameterInfos()
 {
-    if (!mController)
+    // Of several threads that ask at once the first works for all, and begins anew when another has asked meanwhile:
+    // two rebuilds at the same time could publish parts of different lists. Bounded, for a controller that asks again
+    // whenever it is asked.
+    if (!mController || mRebuildsAsked.fetch_add(1) != 0)
         return;
+    constexpr int kMaxRounds = 4;
+    bool settled = false;
+    const ScopeExit giveUp(
+        [&]
+        {
+            if (!settled)
+                mRebuildsAsked = 0;
+        });
+    for (int round = 0; round < kMaxRounds && !settled; ++round)
+    {
+        unsigned int asked = mRebuildsAsked;
+        RebuildParameterInfos();
+        settled = mRebuildsAsked.compare_exchange_strong(asked, 0);
+    }
+}
+
+void VST3AudioFilter::RebuildParameterInfos()
+{
     const int32 count = mController->getParameterCount();
     ParameterTable table;
     const std::vector<ListedParameter> parameters = ListParameters(*mController, count);
@@ -74,14 +100,16 @@ void VST3AudioFilter::BuildParameterInfos()
         {
             boost::intrusive_ptr<VST3ParameterInfo> info(
                 new VST3ParameterInfo(mController.Get(), static_cast<int>(index)));
-            table.mParameterIndexByID.insert_or_assign(info->GetParameterID(), table.mParameterInfos.size());
+            // The first keeps an ID that comes again: parameters that can't be read all have the ID 0.
+            table.mParameterIndexByID.try_emplace(info->GetParameterID(), table.mParameterInfos.size());
             table.mParameterInfos.push_back(std::move(info));
         }
         table.mParameterIDs.push_back(parameter.id);
     }
     mInputTransfer.SetParameterIDs(table.mParameterIDs);
     mOutputTransfer.SetParameterIDs(table.mParameterIDs);
-    mWantedQueues = count < 0 ? -1 : static_cast<int>(table.mParameterIDs.size());
+    if (count >= 0)
+        OfferQueues(static_cast<int>(table.mParameterIDs.size()));
     mParameters.Publish(std::move(table));
 }
 
@@ -94,12 +122,22 @@ void VST3AudioFilter::TakeProgramChange(std::uint32_t id, int index)
     mProgramChangeID.store(id, std::memory_order_release); // whoever sees the ID sees its index
 }
 
-// A rebuild does not touch the parameter changes, which a block may be using: they follow here, before the next one.
-void VST3AudioFilter::FitParameterQueues()
+// A rebuild does not touch the parameter changes, which a block may be using: it makes queues for the new list, and
+// the next block swaps them in.
+void VST3AudioFilter::OfferQueues(int count)
 {
-    const int count = mWantedQueues.exchange(-1);
-    mInputChanges.SetMaxParameters(count);
-    mOutputChanges.SetMaxParameters(count);
+    auto offer = std::make_unique<QueueSet>();
+    offer->mInput = ParameterChanges::MakeQueues(count);
+    offer->mOutput = ParameterChanges::MakeQueues(count);
+    // Released to the thread that takes it; an older one that nobody has taken comes back.
+    const std::unique_ptr<QueueSet> older(mOfferedQueues.exchange(offer.release(), std::memory_order_acq_rel));
+}
+
+void VST3AudioFilter::FreeSpentQueues()
+{
+    QueueSet* spent = mSpentQueues.exchange(nullptr, std::memory_order_acquire); // what the taker swapped out
+    while (spent != nullptr)
+        std::unique_ptr<QueueSet>(std::exchange(spent, spent->mNext));
 }
 
 int VST3AudioFilter::GetParameterCount() const
@@ -151,6 +189,7 @@ void VST3AudioFilter::OnUITimerTick()
     mParameters.FreeRetired();
     mInputTransfer.FreeRetired();
     mOutputTransfer.FreeRetired();
+    FreeSpentQueues();
     if (mVendorEffect && mVendorEffect->IsDirty())
         BumpParameterDirtyCount();
     if (mController)

@@ -177,6 +177,7 @@ boost::intrusive_ptr<VST3PluginModule> GetVST3Plugin(const UTF16String& path)
         return nullptr;
     }
     GetModules().AddPluginModule(module);
+    PluginModule::SetLoadProblem(path, {});
     return module;
 }
 

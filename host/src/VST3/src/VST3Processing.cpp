@@ -51,6 +51,7 @@ void VST3AudioFilter::Process(float** in, float** out, int frames, ChannelFlags 
     {
         UpdateProcessContext();
         outFlags = ChannelFlags();
+        TakeOfferedQueues();
         PassInputSilence(inFlags);
         for (int offset = 0; offset < frames;)
         {
@@ -61,6 +62,23 @@ void VST3AudioFilter::Process(float** in, float** out, int frames, ChannelFlags 
         outFlags |= CollectOutputSilence();
     }
     catch (...) // what a plug-in throws ends the block, and goes no further
+    {
+    }
+}
+
+// Swaps in the queues that a rebuild of the parameter list has made; those replaced go to the main thread to be
+// freed.
+void VST3AudioFilter::TakeOfferedQueues()
+{
+    if (mOfferedQueues.load(std::memory_order_relaxed) == nullptr)
+        return;
+    QueueSet* const taken = mOfferedQueues.exchange(nullptr, std::memory_order_acquire); // sees the queues made
+    if (taken == nullptr)
+        return;
+    mInputChanges.Swap(taken->mInput);
+    mOutputChanges.Swap(taken->mOutput);
+    taken->mNext = mSpentQueues.load(std::memory_order_relaxed);
+    while (!mSpentQueues.compare_exchange_weak(taken->mNext, taken, std::memory_order_release)) // gives them away
     {
     }
 }

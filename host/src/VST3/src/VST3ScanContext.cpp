@@ -20,6 +20,7 @@ void VST3ScanContext::SetPluginLocators(const std::vector<PluginLocator>& locato
     mFilterIDs.clear();
     mDescriptors.clear();
     mModule.reset();
+    // mFilterIndex stays: a context that is given new bundles in the middle of one goes on at that class.
 }
 
 bool VST3ScanContext::GetCurrentProgressInfo(PluginLocator& locator, UTF16String& detail, unsigned long& index) const

@@ -93,7 +93,7 @@ void VST3AudioFilter::Resume()
         AudioFilter::Resume();
         return;
     }
-    FitParameterQueues();
+    TakeOfferedQueues();
     SetupProcessing();
     AllocateBusBuffers();
     FillProcessData();
@@ -102,6 +102,8 @@ void VST3AudioFilter::Resume()
     if (GetSideChainTargetBusChannelCount() != 0)
         ActivateBuses(Steinberg::Vst::kInput, Steinberg::Vst::kAux);
     mProcessErrorReported = false;
+    // The delay line is sized in here, by the latency known so far: one that the plug-in finds only now takes effect
+    // with the next Resume.
     AudioFilter::Resume();
     mLatency = static_cast<int>(mProcessor->getLatencySamples());
 }
@@ -176,11 +178,10 @@ void VST3AudioFilter::FlushMessageQueue()
 // are not active, too.
 void VST3AudioFilter::FlushParameterChanges()
 {
-    if (!mSuspended || !mInitialized || mFlushing)
+    if (!mSuspended || !mInitialized || mFlushing.exchange(true))
         return;
-    FitParameterQueues();
-    mFlushing = true;
     const ScopeExit done([this] { mFlushing = false; });
+    TakeOfferedQueues();
     try
     {
         mOutputChanges.ClearQueue();

@@ -9,7 +9,7 @@ namespace zebaudiofilterhost::vst3
 
 std::span<const Steinberg::FIDString> GetPlatformViewTypes()
 {
-    static constexpr std::array<Steinberg::FIDString, 1> kTypes = {Steinberg::kPlatformTypeX11EmbedWindowID};
+    static const std::array<Steinberg::FIDString, 1> kTypes = {Steinberg::kPlatformTypeX11EmbedWindowID};
     return kTypes;
 }
 
