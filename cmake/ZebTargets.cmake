@@ -7,12 +7,6 @@ find_package(EXPAT REQUIRED)
 
 set_property(GLOBAL PROPERTY ZEB_LAYERS "")
 
-function(zeb_add_folder folder)
-    if(EXISTS ${CMAKE_CURRENT_SOURCE_DIR}/${folder}/CMakeLists.txt)
-        add_subdirectory(${folder})
-    endif()
-endfunction()
-
 # Warnings, sanitizers and definitions that all of our own targets share.
 add_library(zeb_options INTERFACE)
 target_compile_options(zeb_options INTERFACE
