@@ -200,11 +200,12 @@ TEST_F(MainThreadLoopTest, AChangeOfClockKeepsTheTimeToWait)
 {
     Call('a', 30);
     mMillis += 10;
-    unsigned long long other = 500;
-    SetMainThreadClock([&] { return other * 1'000'000ULL; });
-    other = 519;
+    // Shared, since the clock is asked once more when the fixture puts the real one back.
+    const auto other = std::make_shared<unsigned long long>(500);
+    SetMainThreadClock([other] { return *other * 1'000'000ULL; });
+    *other = 519;
     EXPECT_FALSE(PumpMainThread());
-    other = 520;
+    *other = 520;
     EXPECT_TRUE(PumpMainThread());
     EXPECT_EQ("a", mRan);
 }
