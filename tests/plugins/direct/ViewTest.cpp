@@ -69,7 +69,8 @@ protected:
         return pixel;
     }
 
-    // Serves the view's descriptor as a host's run loop does.
+    // Serves the view's descriptor and timer as a host's run loop does: events that Xlib has read while it waited for
+    // an answer wake no descriptor.
     template <class Done>
     bool RunUntil(Done done)
     {
@@ -78,6 +79,8 @@ protected:
             pollfd descriptor{mPlugin.host->descriptor, POLLIN, 0};
             if (poll(&descriptor, 1, 20) > 0)
                 mPlugin.host->eventHandler->onFDIsSet(mPlugin.host->descriptor);
+            else
+                mPlugin.host->timerHandler->onTimer();
         }
         return done();
     }
