@@ -222,7 +222,7 @@ ExitCode RunScan(CommandContext& context)
     PrintResults(context, results, trouble);
     if (trouble)
     {
-        throw *trouble;
+        throw Failure(*trouble);
     }
     context.console.Remark(Summary(plan, reporter));
     return ExitCode::Done;

@@ -35,7 +35,7 @@ int IgnoreError(Display*, XErrorEvent*)
 int EndWithoutServer(Display*)
 {
     constexpr std::string_view kMessage = "zebhost: the X server has gone, and the window with it: start it again\n";
-    static_cast<void>(!write(STDERR_FILENO, kMessage.data(), kMessage.size()));
+    [[maybe_unused]] const ssize_t written = write(STDERR_FILENO, kMessage.data(), kMessage.size());
     _exit(static_cast<int>(ExitCode::JobFailed));
 }
 
@@ -193,7 +193,7 @@ private:
             mClosed = true;
         }
         // Whatever a plug-in's window says of itself, it is to be seen.
-        else if (event.type == CreateNotify && event.xcreatewindow.parent == mWindow)
+        else if (event.type == CreateNotify && event.xcreatewindow.parent == mWindow) // NOLINT(bugprone-branch-clone)
         {
             XMapWindow(mDisplay, event.xcreatewindow.window);
         }
