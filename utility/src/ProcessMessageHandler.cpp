@@ -95,7 +95,7 @@ void ProcessMessageHandler::RunMainStages()
         return;
     const FlagWhileAlive running(mRunningMainStages);
     // By index and with a reference: a stage may post, which moves the list, or flush, which shortens it.
-    for (std::size_t i = 0; i < mMessages.size(); ++i)
+    for (std::size_t i = 0; i < mMessages.size(); ++i) // NOLINT(modernize-loop-convert)
     {
         const boost::intrusive_ptr<Message> message = mMessages[i];
         if (message->GetState() == Message::kState_ProcessDone)

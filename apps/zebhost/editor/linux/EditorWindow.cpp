@@ -188,12 +188,13 @@ private:
 
     void Handle(const XEvent& event)
     {
+        // NOLINTNEXTLINE(bugprone-branch-clone)
         if (event.type == ClientMessage && static_cast<Atom>(event.xclient.data.l[0]) == mCloseRequest)
         {
             mClosed = true;
         }
         // Whatever a plug-in's window says of itself, it is to be seen.
-        else if (event.type == CreateNotify && event.xcreatewindow.parent == mWindow) // NOLINT(bugprone-branch-clone)
+        else if (event.type == CreateNotify && event.xcreatewindow.parent == mWindow)
         {
             XMapWindow(mDisplay, event.xcreatewindow.window);
         }

@@ -82,7 +82,7 @@ void VST3AudioFilterEditor::Open(void* parent)
     mOpen = mView->attached(parent, type) == kResultOk;
     if (!mOpen)
         mRunLoop.ForgetSince(mRegistrationsBeforeOpen);
-    if (parent && type == GetPlatformViewTypes().front())
+    if (parent != nullptr && type == GetPlatformViewTypes().front())
         MakeParentWindowOpaque(parent);
 }
 

@@ -17,7 +17,7 @@ using Steinberg::Linux::ITimerHandler;
 // One of the two handlers is set.
 struct RunLoop::Registration
 {
-    unsigned int mNumber;
+    unsigned int mNumber = 0;
     PluginPtr<IEventHandler> mEventHandler;
     PluginPtr<ITimerHandler> mTimerHandler;
     zebcore::threads::WatchID mWatch = zebcore::threads::kNoWatch;
