@@ -64,8 +64,8 @@ def picture(path):
 def main():
     words = sys.argv[1:]
     if words[:1] == ['make']:
-        random.seed(7)
-        write_wav(words[1], 2, 48000, [random.uniform(-0.5, 0.5) for _ in range(2 * 48000)])
+        noise = random.Random(7)  # The same noise each time
+        write_wav(words[1], 2, 48000, [noise.uniform(-0.5, 0.5) for _ in range(2 * 48000)])
     elif words[:1] == ['compare']:
         compare(words[1], words[2], float(words[4]), int(words[6]))
     elif words[:1] == ['picture']:
