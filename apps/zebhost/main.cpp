@@ -21,7 +21,7 @@ namespace
 
 using CommandFunction = ExitCode (*)(CommandContext&);
 
-constexpr std::array<std::pair<std::string_view, CommandFunction>, 12> kCommands = {{{"scan", RunScan},
+constexpr std::array<std::pair<std::string_view, CommandFunction>, 13> kCommands = {{{"scan", RunScan},
                                                                                      {"list", RunList},
                                                                                      {"info", RunInfo},
                                                                                      {"params", RunParams},
@@ -32,7 +32,8 @@ constexpr std::array<std::pair<std::string_view, CommandFunction>, 12> kCommands
                                                                                      {"edit", RunEdit},
                                                                                      {"block", RunBlock},
                                                                                      {"unblock", RunUnblock},
-                                                                                     {"blocks", RunBlocks}}};
+                                                                                     {"blocks", RunBlocks},
+                                                                                     {"console", RunConsole}}};
 
 ExitCode RunWithLibrary(const Arguments& arguments, Console& console)
 {

@@ -175,6 +175,7 @@ printf '%s\n' "${COMPREPLY[@]}"
     EXPECT_EQ(complete({"render", "--format", "fl"}), "float\n");
     EXPECT_EQ(complete({"info", "Zeb Ga"}), "Zeb Gain\n");
     EXPECT_EQ(complete({"completion", "z"}), "zsh\n");
+    EXPECT_EQ(complete({"console", "zeb"}), "zebaudiofilterhost.BuildPrivatePluginConfig\n");
 }
 
 } // namespace

@@ -42,6 +42,21 @@ std::vector<CommandSpec> BlockCommands()
 
 std::vector<CommandSpec> ShellCommands()
 {
+    CommandSpec console = {
+        "console",
+        "run one of the library's console commands",
+        "Without NAME the commands are listed. The ARGUMENTS reach the command as one text with blanks between them, "
+        "and what it writes is printed as it stands; so its usage, when it does not take the ARGUMENTS, is no "
+        "failure "
+        "of zebhost's. Give full paths.",
+        {{"NAME", "the command's name", Values::ConsoleCommand, false},
+         {"ARGUMENTS", "what the command wants", Values::Text, false, true}},
+        {{"names", "", "print the names only, one a line"}},
+        {{"zebhost console", "list the commands"},
+         {"zebhost console zebaudiofilterhost.BuildPrivatePluginConfig "
+          "\"$PWD/Zeb/PrivatePluginConfig,$PWD/Zeb/Plug-Ins\"",
+          "catalogue the VST 3 effects that an application ships in its own folder"}},
+    };
     CommandSpec completion = {
         "completion",
         "print a completion script for a shell",
@@ -59,7 +74,7 @@ std::vector<CommandSpec> ShellCommands()
         {},
         {{"zebhost man | man -l -", "read it"}, {"zebhost man > /usr/local/share/man/man1/zebhost.1", "install it"}},
     };
-    return {completion, man};
+    return {console, completion, man};
 }
 
 } // namespace zebhost

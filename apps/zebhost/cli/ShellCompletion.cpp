@@ -80,6 +80,8 @@ std::string BashValues(Values values, const std::vector<std::string_view>& choic
     case Values::Filter:
     case Values::Plugin:
         return "_zebhost_filters";
+    case Values::ConsoleCommand:
+        return "COMPREPLY=($(compgen -W \"$(zebhost console --names --quiet 2>/dev/null)\" -- \"$cur\"))";
     case Values::File:
         return "compopt -o filenames; COMPREPLY=($(compgen -f -- \"$cur\"))";
     case Values::Folder:
@@ -276,6 +278,11 @@ void AddFishCommand(std::string& script, const CommandSpec& command)
         {
             script += "complete -c zebhost -n " + SingleQuoted(condition) +
                       " -a '(zebhost list --names --quiet 2>/dev/null)'\n";
+        }
+        else if (operand.values == Values::ConsoleCommand)
+        {
+            script += "complete -c zebhost -f -n " + SingleQuoted(condition) +
+                      " -a '(zebhost console --names --quiet 2>/dev/null)'\n";
         }
         else if (operand.values == Values::Choice)
         {

@@ -20,6 +20,7 @@ ExitCode RunEdit(CommandContext& context);
 ExitCode RunBlock(CommandContext& context);
 ExitCode RunUnblock(CommandContext& context);
 ExitCode RunBlocks(CommandContext& context);
+ExitCode RunConsole(CommandContext& context);
 
 // These need neither library nor catalogue.
 ExitCode RunCompletion(const Arguments& arguments, Console& console);
