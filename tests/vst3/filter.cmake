@@ -13,7 +13,6 @@ zeb_add_test(vst3_filter_test
         FilterStateTest.cpp
         FilterThreadsTest.cpp
         IndexWalkTest.cpp
-        PublishedTest.cpp
         RunLoopTest.cpp
         SpeakerArrangementsTest.cpp
     UP_TO zeb_vst3)

@@ -2,7 +2,7 @@
 
 #include "host/src/VST3/src/ParameterChangeTable.h"
 #include "host/src/VST3/src/ParameterChanges.h"
-#include "host/src/VST3/src/Published.h"
+#include "utility/src/Published.h"
 
 #include <pluginterfaces/vst/vsttypes.h>
 

@@ -7,10 +7,10 @@
 #include "host/src/VST3/src/ParameterChanges.h"
 #include "host/src/VST3/src/ParameterTable.h"
 #include "host/src/VST3/src/PluginPtr.h"
-#include "host/src/VST3/src/Published.h"
 #include "host/src/VST3/src/VST3AudioFilterEditor.h"
 #include "host/src/VST3/src/VST3EventList.h"
 #include "host/src/VST3/src/VST3VendorInterfaces.h"
+#include "utility/src/Published.h"
 
 #include <pluginterfaces/base/ipluginbase.h>
 #include <pluginterfaces/vst/ivstaudioprocessor.h>

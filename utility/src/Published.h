@@ -4,7 +4,7 @@
 #include <memory>
 #include <utility>
 
-namespace zebaudiofilterhost::vst3
+namespace zebaudiofilterhost
 {
 
 /// A value that any thread may replace as a whole while any other reads it, the process thread included.
@@ -96,4 +96,4 @@ private:
     mutable std::atomic<unsigned int> mReaders = 0;
 };
 
-} // namespace zebaudiofilterhost::vst3
+} // namespace zebaudiofilterhost

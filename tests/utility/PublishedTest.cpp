@@ -1,4 +1,4 @@
-#include "host/src/VST3/src/Published.h"
+#include "utility/src/Published.h"
 
 #include <gtest/gtest.h>
 
@@ -6,7 +6,7 @@
 #include <thread>
 #include <vector>
 
-using zebaudiofilterhost::vst3::Published;
+using zebaudiofilterhost::Published;
 
 namespace
 {
