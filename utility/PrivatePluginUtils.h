@@ -28,9 +28,9 @@ ZEB_EXPORT extern const zebcore::UTF16String kVST3PluginExtension;
 /// Exceptions of the file layer pass through, and the catalogue then holds the scanned plug-ins alone. A plug-in that
 /// crashes takes the process along and leaves the old file.
 ///
-/// Folders are replaced as text, wherever it stands. So give full paths, with a slash at the end either here and to
-/// the setters or to none of them; and if there are both folders, that of VST 2 must not have "vst3" in its path.
-/// [main]
+/// Folders are replaced as text, wherever it stands, that of VST 3 first. So give full paths, with a slash at the end
+/// either here and to the setters or to none of them; without one, no folder's name may begin with that of the VST 3
+/// folder. [main]
 ZEB_EXPORT void BuildPrivatePluginConfig(const zebcore::UTF16String& resultPath,
                                          const zebcore::UTF16String& vstDirectory,
                                          const zebcore::UTF16String& vst3Directory);

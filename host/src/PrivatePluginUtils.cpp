@@ -3,6 +3,7 @@
 #include "foundation/zebcore/CaseInsensitive.h"
 #include "foundation/zebcore/Dir.h"
 #include "foundation/zebcore/File.h"
+#include "foundation/zebcore/FileExceptions.h"
 #include "foundation/zebcore/FileUtils.h"
 #include "foundation/zebcore/IPlatformByteStream.h"
 #include "foundation/zebcore/SafeSave.h"
@@ -88,14 +89,17 @@ void Scan(const std::vector<PluginLocator>& locators)
 // VST 3 comes first, as "vst" is a part of "vst3".
 void PutPlaceholders(UTF16String& text, const UTF16String& vstDirectory, const UTF16String& vst3Directory)
 {
+    UTF16String vstPath = Escaped(vstDirectory);
     if (!vst3Directory.empty())
     {
         ReplaceAll(text, Escaped(vst3Directory), kVST3PrivateApplicationPluginPath);
         ReplaceAll(text, kVST3PluginExtension, kVST3PluginExtensionPlaceholder);
+        // A VST 2 folder with "vst3" in its path now stands in the text like this.
+        ReplaceAll(vstPath, kVST3PluginExtension, kVST3PluginExtensionPlaceholder);
     }
     if (!vstDirectory.empty())
     {
-        ReplaceAll(text, Escaped(vstDirectory), kVSTPrivateApplicationPluginPath);
+        ReplaceAll(text, vstPath, kVSTPrivateApplicationPluginPath);
         ReplaceAll(text, kVSTPluginExtension, kVSTPluginExtensionPlaceholder);
     }
 }
@@ -104,8 +108,16 @@ void WriteWhole(const UTF16String& path, const UTF16String& text)
 {
     File file(path);
     zebcore::filesupport::SafeSave save(file);
-    zebcore::utility::FileUtils::SimpleWriteStringToFile(save.GetTempFile().FullPath(),
-                                                         zebcore::utility::UTF16to8(text));
+    try
+    {
+        zebcore::utility::FileUtils::SimpleWriteStringToFile(save.GetTempFile().FullPath(),
+                                                             zebcore::utility::UTF16to8(text));
+    }
+    catch (const zebcore::filesupport::file_exception& failure)
+    {
+        // The user knows the file, not the temporary one.
+        throw zebcore::filesupport::file_exception("cannot save", path, failure.Error());
+    }
     save.Commit();
 }
 

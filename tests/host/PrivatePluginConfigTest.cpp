@@ -189,6 +189,38 @@ TEST_F(PrivatePluginConfigTest, FolderThatIsNotGivenLeavesItsPlaceholdersOut)
     EXPECT_EQ(records, 0);
 }
 
+TEST_F(PrivatePluginConfigTest, FoldersOfBothKindsKeepApart)
+{
+    struct Case
+    {
+        UTF16String vst; // folders of the build, below the test's own
+        UTF16String vst3;
+        const char* ofVST; // where the VST 2 plug-in is, with "/2" and "/3" as the folders of the installation
+    };
+    const std::vector<Case> cases = {{u"my vst3/VST", u"my vst3/VST3", "2:/2/a.vst"},
+                                     {u"vst3", u"three", "2:/2/a.vst"},
+                                     {u"vst", u"vst3", "2:/2/a.vst"},
+                                     {u"vst3 & vst3", u"vst3 & vst3/deeper", "2:/2/a.vst"},
+                                     {u"vst/vst3/2", u"vst3", "2:/2/a.vst"},
+                                     {u"vst3/vst3", u"vst3", "2:/3/vst3/a.vst"},
+                                     {u"vst3", u"vst3", "2:/3/a.vst"}};
+    int number = 0;
+    for (const Case& given : cases)
+    {
+        SCOPED_TRACE(Text(given.vst) + " and " + Text(given.vst3));
+        mMachine = FakeMachine();
+        const UTF16String root = PathInFolder("both" + std::to_string(number++)) + u"/";
+        Install(kTechnologyVST, root + given.vst + u"/a.vst", u"vst3 in vst");
+        Install(kTechnologyVST3, root + given.vst3 + u"/b.vst3", u"vst in vst3");
+        utility::BuildPrivatePluginConfig(mResult, root + given.vst, root + given.vst3);
+        EXPECT_FALSE(ResultHolds(zebcore::utility::UTF16to8(root))) << "a folder of the machine that built it";
+        StartElsewhere(u"/3", u"/2");
+        ASSERT_TRUE(Find(u"2:vst3 in vst") && Find(u"3:vst in vst3"));
+        EXPECT_EQ(Text(Find(u"2:vst3 in vst")->GetLocator()), given.ofVST);
+        EXPECT_EQ(Text(Find(u"3:vst in vst3")->GetLocator()), "3:/3/b.vst3");
+    }
+}
+
 TEST_F(PrivatePluginConfigTest, BuildGoesOnWithRealPathsAndTheUsersCatalogue)
 {
     mManager.AddPluginModuleInfo(MakeInfo(VST3(u"/users")));

@@ -4,7 +4,7 @@
 
 #include "foundation/zebcore/FileExceptions.h"
 #include "foundation/zebcore/FileUtils.h"
-#include "foundation/zebcore/internal/FileSystemCalls.h"
+#include "tests/persistence/SaveFaults.h"
 
 #include <gtest/gtest.h>
 
@@ -22,12 +22,6 @@ using namespace zebcore::filesupport;
 namespace
 {
 
-int Fail(int error)
-{
-    errno = error;
-    return -1;
-}
-
 class SafeSaveTest : public testing::Test
 {
 protected:
@@ -43,74 +37,7 @@ protected:
     const TempFolder mFolder;
 };
 
-struct Fault
-{
-    const char* mName;
-    std::function<void(FileSystemCalls&)> mInject;
-    int mError;
-    bool mIsRefusal;
-};
-
-void PrintTo(const Fault& fault, std::ostream* out)
-{
-    *out << fault.mName;
-}
-
-// Fails the calls that follow `good` good ones.
-template <typename Result, typename... Arguments>
-std::function<Result(Arguments...)> FailAfter(int good, int error, std::function<Result(Arguments...)> call)
-{
-    return [good, error, call](Arguments... arguments) mutable
-    {
-        return good-- > 0 ? call(arguments...) : Result{Fail(error)};
-    };
-}
-
-ssize_t WriteOneByte(int descriptor, const void* data, std::size_t /*size*/)
-{
-    return write(descriptor, data, 1);
-}
-
-using Calls = FileSystemCalls;
-
-const Fault kFaults[] = {
-    {"no room for the temporary file", [](Calls& calls) { calls.mOpen = FailAfter(0, ENOSPC, calls.mOpen); }, ENOSPC,
-     false},
-    {"folder is read-only", [](Calls& calls) { calls.mOpen = FailAfter(0, EROFS, calls.mOpen); }, EROFS, false},
-    {"disk full at once", [](Calls& calls) { calls.mWrite = FailAfter(0, ENOSPC, calls.mWrite); }, ENOSPC, false},
-    {"disk full after a short write",
-     [](Calls& calls)
-     { calls.mWrite = FailAfter(1, ENOSPC, std::function<ssize_t(int, const void*, std::size_t)>(WriteOneByte)); },
-     ENOSPC, false},
-    {"nothing written, no reason given",
-     [](Calls& calls)
-     {
-         calls.mWrite = [](int, const void*, std::size_t)
-         {
-             return ssize_t{0};
-         };
-     },
-     ENOSPC, false},
-    {"quota found out at close",
-     [](Calls& calls)
-     {
-         calls.mClose = [good = 1](int descriptor) mutable
-         {
-             close(descriptor);
-             return good-- > 0 ? 0 : Fail(EDQUOT);
-         };
-     },
-     EDQUOT, false},
-    {"flush fails", [](Calls& calls) { calls.mFlush = FailAfter(0, EIO, calls.mFlush); }, EIO, false},
-    {"rename fails", [](Calls& calls) { calls.mRename = FailAfter(0, EIO, calls.mRename); }, EIO, false},
-    {"rename finds no room", [](Calls& calls) { calls.mRename = FailAfter(0, ENOSPC, calls.mRename); }, ENOSPC,
-     false},
-    {"old file is immutable", [](Calls& calls) { calls.mRename = FailAfter(0, EPERM, calls.mRename); }, EPERM, true},
-    {"old file is another's", [](Calls& calls) { calls.mRename = FailAfter(0, EACCES, calls.mRename); }, EACCES,
-     true},
-};
-
-class SafeSaveFaults : public SafeSaveTest, public testing::WithParamInterface<Fault>
+class SafeSaveFaults : public SafeSaveTest, public testing::WithParamInterface<SaveFault>
 {
 };
 
@@ -150,7 +77,7 @@ TEST_P(SafeSaveFaults, OfAFirstSaveLeaveNothing)
     EXPECT_EQ(mFolder.CountFiles(), 0U);
 }
 
-INSTANTIATE_TEST_SUITE_P(Each, SafeSaveFaults, testing::ValuesIn(kFaults));
+INSTANTIATE_TEST_SUITE_P(Each, SafeSaveFaults, testing::ValuesIn(SaveFaults()));
 
 TEST_F(SafeSaveTest, CommitReplacesTheFile)
 {
@@ -190,7 +117,10 @@ TEST_F(SafeSaveTest, ShortAndInterruptedWritesAreCarriedOn)
     int calls = 0;
     FileSystem().mWrite = [&calls](int descriptor, const void* data, std::size_t size)
     {
-        return ++calls % 2 == 0 ? ssize_t{Fail(EINTR)} : write(descriptor, data, std::min<std::size_t>(size, 3));
+        if (++calls % 2 != 0)
+            return write(descriptor, data, std::min<std::size_t>(size, 3));
+        errno = EINTR;
+        return ssize_t{-1};
     };
     Save(mFolder.File("a"), u8"ten letters");
     EXPECT_EQ(mFolder.Read("a"), "ten letters");
