@@ -1,0 +1,215 @@
+// What buses a plug-in has: by the speaker arrangements that it agreed to or, without any, by the number of its pins.
+
+#include "foundation/zebcore/Trace.h"
+#include "host/src/VST/src/VSTAudioFilter.h"
+#include "host/src/VST/src/VSTSpeakerArrangement.h"
+
+#include <algorithm>
+#include <bit>
+#include <string_view>
+#include <utility>
+#include <vector>
+
+namespace zebaudiofilterhost::vst
+{
+
+namespace
+{
+
+constexpr const char* kTraceCategory = "VSTAudioFilter::RequestIOConfiguration()";
+
+constexpr auto kMain = AudioFilterBusDescription::kBusType_Main;
+
+// The first answer of effGetVstVersion that takes speaker arrangements.
+constexpr int kFirstVersionWithArrangements = 2300;
+
+// Pins beyond this are a lie of the plug-in's, and no bus is made of them.
+constexpr int kMaxPins = 4096;
+
+// Of one side.
+struct BusNames
+{
+    std::u16string_view mMono;
+    std::u16string_view mStereo;
+    std::u16string_view mSurround51;
+    std::u16string_view mMultiMono;
+};
+
+constexpr BusNames kInputNames = {u"Mono In", u"Stereo In", u"Surround 5.1 In", u"Multi-Mono In"};
+constexpr BusNames kOutputNames = {u"Mono Out", u"Stereo Out", u"Surround 5.1 Out", u"Multi-Mono Out"};
+
+// Deliberate: an output of any other number of pins is named like an input, as long as the plug-in has no
+// arrangements.
+constexpr BusNames kOutputNamesByCount = {u"Mono Out", u"Stereo Out", u"Surround 5.1 Out", u"Multi-Mono In"};
+
+AudioFilterBusDescription CreateAudioFilterBusDescriptionFromNumChannels(std::u16string_view name, int channelCount)
+{
+    const auto size = static_cast<std::size_t>(std::clamp(channelCount, 0, kMaxPins));
+    return {UTF16String(name), ChannelLayout(size), kMain};
+}
+
+AudioFilterBusDescription CreateNamed(int arrangementType, int channelCount, const BusNames& names)
+{
+    if (arrangementType == kSpeakerArr51)
+        return AudioFilterBusDescription::CreateSurround51(UTF16String(names.mSurround51), kMain);
+    if (arrangementType == kSpeakerArrStereo)
+        return AudioFilterBusDescription::CreateStereo(UTF16String(names.mStereo), kMain);
+    if (arrangementType == kSpeakerArrMono && channelCount == 1)
+        return AudioFilterBusDescription::CreateMono(UTF16String(names.mMono), kMain);
+    return CreateAudioFilterBusDescriptionFromNumChannels(names.mMultiMono, channelCount);
+}
+
+AudioFilterBusDescription CreateFromArrangement(const VstSpeakerArrangement& arrangement, const BusNames& names)
+{
+    return CreateNamed(arrangement.type, arrangement.numChannels, names);
+}
+
+int ArrangementTypeOfCount(int channelCount)
+{
+    switch (channelCount)
+    {
+    case 1:
+        return kSpeakerArrMono;
+    case 2:
+        return kSpeakerArrStereo;
+    case 6:
+        return kSpeakerArr51;
+    default:
+        return kSpeakerArrUserDefined;
+    }
+}
+
+AudioFilterBusDescription CreateFromCount(int channelCount, const BusNames& names)
+{
+    return CreateNamed(ArrangementTypeOfCount(channelCount), channelCount, names);
+}
+
+// Plug-ins may keep the addresses of the arrangements that they were asked with, so these stay for good, and stay
+// reachable. Returns the arrangement for the plug-in.
+VstSpeakerArrangement* KeepForever(SpeakerArrangementPtr arrangement)
+{
+    static auto& kept = *new std::vector<SpeakerArrangementPtr>();
+    kept.push_back(std::move(arrangement));
+    return kept.back().get();
+}
+
+// Pointers travel as numbers.
+long long AddressOf(const void* pointer)
+{
+    return std::bit_cast<long long>(pointer);
+}
+
+bool IsBelievable(const VstSpeakerArrangement* arrangement)
+{
+    return arrangement && arrangement->numChannels > 0 && arrangement->numChannels <= kMaxArrangedChannels;
+}
+
+// An honest arrangement has no more records than these.
+int ReadableRecords(int pins, const ChannelLayout& requested)
+{
+    constexpr int kDeclared = 8;
+    return std::max({kDeclared, pins, static_cast<int>(requested.size())});
+}
+
+// Of both sides, or of none.
+struct Agreement
+{
+    SpeakerArrangementPtr mInput;
+    SpeakerArrangementPtr mOutput;
+};
+
+bool OfferArrangements(const VSTDispatcherBase& plugin, const ChannelLayout& input, const ChannelLayout& output)
+{
+    const long long inputAddress = AddressOf(KeepForever(BuildSpeakerArrangement(input)));
+    VstSpeakerArrangement* const outputArrangement = KeepForever(BuildSpeakerArrangement(output));
+    const bool taken = plugin.Dispatcher(effSetSpeakerArrangement, 0, inputAddress, outputArrangement, 0.0F) != 0;
+    ZEB_TRACE(kTraceCategory,
+              (taken ? "effSetSpeakerArrangement succeeded, inputs= " : "effSetSpeakerArrangement failed, inputs= ")
+                  << input.size() << ", outputs= " << output.size());
+    return taken;
+}
+
+// Asks with the host's layouts and takes what the plug-in then says, which need not be the same.
+Agreement Negotiate(const VSTDispatcherBase& plugin, const AEffect& effect, const ChannelLayout& input,
+                    const ChannelLayout& output)
+{
+    if (!OfferArrangements(plugin, input, output))
+        return {};
+    const VstSpeakerArrangement* inputAnswer = nullptr;
+    const VstSpeakerArrangement* outputAnswer = nullptr;
+    if (plugin.Dispatcher(effGetSpeakerArrangement, 0, AddressOf(&inputAnswer), &outputAnswer, 0.0F) == 0)
+    {
+        ZEB_TRACE(kTraceCategory, "effGetSpeakerArrangement failed");
+        return {};
+    }
+    ZEB_TRACE(kTraceCategory, "effGetSpeakerArrangement succeeded");
+    if (!IsBelievable(inputAnswer) || !IsBelievable(outputAnswer))
+        return {};
+    return {CopySpeakerArrangement(*inputAnswer, ReadableRecords(effect.numInputs, input)),
+            CopySpeakerArrangement(*outputAnswer, ReadableRecords(effect.numOutputs, output))};
+}
+
+} // namespace
+
+void VSTAudioFilter::FreeCurrentSpeakerArrangements()
+{
+    mInputArrangement.reset();
+    mOutputArrangement.reset();
+}
+
+void VSTAudioFilter::BuildIOConfiguration()
+{
+    ClearBusConfiguration();
+    if (mInputArrangement && mOutputArrangement)
+    {
+        AddInputBus(CreateFromArrangement(*mInputArrangement, kInputNames));
+        AddOutputBus(CreateFromArrangement(*mOutputArrangement, kOutputNames));
+    }
+    else
+    {
+        const int inputs = GetEffect() ? GetEffect()->numInputs : 0;
+        const int outputs = GetEffect() ? GetEffect()->numOutputs : 0;
+        ZEB_TRACE("VST", "BuildIOConfiguration(), using numInputs/numOutputs, numInputs=" << inputs << ", numOutputs="
+                                                                                          << outputs);
+        AddInputBus(CreateFromCount(inputs, kInputNames));
+        AddOutputBus(CreateFromCount(outputs, kOutputNamesByCount));
+    }
+    mOutputChannelsToClear = GetNumberOfOutputChannels();
+    PreparePins();
+}
+
+void VSTAudioFilter::RequestIOConfiguration(const std::vector<ChannelLayout>& inputs,
+                                            const std::vector<ChannelLayout>& outputs)
+{
+    mMonoThroughStereo = false;
+    FreeCurrentSpeakerArrangements();
+    if (inputs.size() != 1 || outputs.size() != 1)
+        return;
+    const ChannelLayout& input = inputs.front();
+    const ChannelLayout& output = outputs.front();
+    if (GetEffect() && Dispatcher(effGetVstVersion, 0, 0, nullptr, 0.0F) >= kFirstVersionWithArrangements)
+    {
+        Agreement agreement = Negotiate(*this, *GetEffect(), input, output);
+        mInputArrangement = std::move(agreement.mInput);
+        mOutputArrangement = std::move(agreement.mOutput);
+    }
+    BuildIOConfiguration();
+
+    const bool stereo = GetNumberOfInputChannels() == 2 && GetNumberOfOutputChannels() == 2;
+    if (!stereo || !CanMono() || input.size() != 1 || output.size() != 1)
+        return;
+    ZEB_TRACE(kTraceCategory, "CanMono");
+    mMonoThroughStereo = true;
+    ClearBusConfiguration();
+    AddInputBus(AudioFilterBusDescription::CreateMono(UTF16String(kInputNames.mMono), kMain));
+    AddOutputBus(AudioFilterBusDescription::CreateMono(UTF16String(kOutputNames.mMono), kMain));
+    PreparePins();
+}
+
+bool VSTAudioFilter::CanUseSideChaining() const
+{
+    const std::pair channels(GetNumberOfInputChannels(), GetNumberOfOutputChannels());
+    return channels == std::pair(4, 2) || channels == std::pair(2, 1) || channels == std::pair(3, 2);
+}
+
+} // namespace zebaudiofilterhost::vst
