@@ -32,8 +32,7 @@ public:
 private:
     using Map = std::map<const void*, Handler>;
 
-    Map Current() const;
-    void Replace(Map map);
+    void Replace(Map handlers);
 
     Published<Map> mHandlers;
 };

@@ -106,6 +106,7 @@ private:
 
     // The record of audioMasterGetTime, which is filled on whatever thread asks.
     void MarkTransport(bool playing);
+    void RewindTimeInfo();
     void UpdateMusicalTime(const IAudioFilterHost& host);
 
     // The process thread's.

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <cstddef>
 #include <vector>
 
 namespace zebaudiofilterhost::vst
@@ -10,17 +11,19 @@ namespace zebaudiofilterhost::vst
 class VSTPins
 {
 public:
-    /// Sizes everything for a plug-in with so many pins, and buses with so many channels. Counts that no plug-in has
-    /// are not believed. [main, suspended]
+    /// Pins beyond these are a lie of the plug-in's.
+    static constexpr int kMaxPins = 4096;
+
+    /// Sizes everything for a plug-in with so many pins, and buses with so many channels. [main, suspended]
     void Prepare(int inputPins, int outputPins, int inputChannels, int outputChannels, int blockSize);
 
-    /// Largest number of frames that the pins beyond the buses can take. Never 0 behind Prepare. [process]
+    /// Most frames that the pins beyond the buses can take at once; 1 or more behind Prepare. [process]
     int GetMaxFrames() const { return static_cast<int>(mSilence.size()); }
 
-    /// Connects the buses' channels from a frame on, and all other pins for `frames`. [process]
+    /// Connects the buses' channels from a frame on, and the other pins for `frames`. [process]
     void Connect(float** in, float** out, int offset, int frames);
-    /// The one channel to both input pins, and from the first output pin; the second one writes into `scratch` as far
-    /// as that reaches. [process]
+    /// Connects one channel to both input pins, and the first output pin to one channel; the second one writes into
+    /// `scratch` as far as that reaches. [process]
     void ConnectMono(float** in, float** out, int offset, int frames, std::vector<float>& scratch);
 
     /// Valid until the next Prepare. [process]
@@ -29,11 +32,12 @@ public:
     int GetOutputCount() const { return static_cast<int>(mOutputs.size()); }
 
 private:
-    void ConnectBeyond(std::size_t inputs, std::size_t outputs, int frames);
+    void ConnectRest(std::size_t inputs, std::size_t outputs, int frames);
 
     std::vector<float*> mInputs;
     std::vector<float*> mOutputs;
-    std::size_t mInputPins = 0; // what the plug-in has
+    std::size_t mInputPins = 0; // that are connected anew for each block; those behind them stay as they are
+    std::size_t mOutputPins = 0;
     std::size_t mInputChannels = 0;
     std::size_t mOutputChannels = 0;
     std::vector<float> mSilence;
