@@ -19,7 +19,16 @@ std::filesystem::path FixtureBundle(std::string_view name); // "NullFactory" giv
 std::filesystem::path HazardBundle(std::string_view name);
 std::filesystem::path EffectBundle(std::string_view name);
 
-// The binary inside a bundle.
+// The same for VST 2, whose plug-ins are bundles or plain files: "Normal" gives .../Normal.vst if there is one, else
+// .../Normal.so.
+std::filesystem::path VST2FixtureFolder();
+std::filesystem::path VST2HazardFolder();
+std::filesystem::path VST2EffectFolder();
+std::filesystem::path VST2Fixture(std::string_view name);
+std::filesystem::path VST2Hazard(std::string_view name);
+std::filesystem::path VST2Effect(std::string_view name);
+
+// The binary inside a bundle; a plain file is its own.
 std::filesystem::path BinaryOf(const std::filesystem::path& bundle);
 
 } // namespace zebtest

@@ -1,0 +1,8 @@
+#include "examples/effects/vst2/support/Effect.h"
+
+extern "C" __attribute__((visibility("default"))) zebaudiofilterhost::vst::AEffect*
+VSTPluginMain(zebaudiofilterhost::vst::audioMasterCallback host)
+{
+    effects::vst2::Effect* effect = effects::vst2::MakeEffect(host);
+    return effect != nullptr ? effect->Binary() : nullptr;
+}

@@ -1,0 +1,7 @@
+#include "tests/plugins/vst2/support/MakeInstance.h"
+
+extern "C" __attribute__((visibility("default"))) zebaudiofilterhost::vst::AEffect*
+main_macho(zebaudiofilterhost::vst::audioMasterCallback host)
+{
+    return vst2fixture::MakeInstance("main_macho", host);
+}

@@ -1,0 +1,6 @@
+// Behaves.
+#include "tests/plugins/vst2/support/Behaviour.h"
+
+void vst2fixture::Vary(Behaviour&)
+{
+}

@@ -1,0 +1,7 @@
+// One too old to be accepted.
+#include "tests/plugins/vst2/support/Behaviour.h"
+
+void vst2fixture::Vary(Behaviour& behaviour)
+{
+    behaviour[Knob::kVersion] = 2299;
+}
