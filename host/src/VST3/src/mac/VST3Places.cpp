@@ -1,6 +1,6 @@
 #include "host/src/VST3/src/VST3Places.h"
 
-#include "host/src/VST3/src/mac/MacLibraryFolder.h"
+#include "host/src/mac/MacLibraryFolder.h"
 
 namespace zebaudiofilterhost::vst3
 {

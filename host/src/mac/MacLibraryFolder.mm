@@ -1,10 +1,10 @@
-#include "host/src/VST3/src/mac/MacLibraryFolder.h"
+#include "host/src/mac/MacLibraryFolder.h"
 
 #include "foundation/zebcore/NativePath.h"
 
 #import <Foundation/Foundation.h>
 
-namespace zebaudiofilterhost::vst3
+namespace zebaudiofilterhost
 {
 
 Dir GetMacLibraryFolder(bool user)
@@ -22,4 +22,4 @@ Dir GetMacLibraryFolder(bool user)
     }
 }
 
-} // namespace zebaudiofilterhost::vst3
+} // namespace zebaudiofilterhost
