@@ -1,0 +1,7 @@
+// Has no editor.
+#include "tests/plugins/vst2/support/Behaviour.h"
+
+void vst2fixture::Vary(Behaviour& behaviour)
+{
+    behaviour[Knob::kEditor] = 0;
+}

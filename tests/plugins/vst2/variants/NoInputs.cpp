@@ -1,0 +1,8 @@
+// No pins in and two out.
+#include "tests/plugins/vst2/support/Behaviour.h"
+
+void vst2fixture::Vary(Behaviour& behaviour)
+{
+    behaviour[Knob::kInputs] = 0;
+    behaviour[Knob::kAcceptArrangements] = 0;
+}
