@@ -23,9 +23,6 @@ constexpr auto kMain = AudioFilterBusDescription::kBusType_Main;
 // The first answer of effGetVstVersion that takes speaker arrangements.
 constexpr int kFirstVersionWithArrangements = 2300;
 
-// Pins beyond this are a lie of the plug-in's, and no bus is made of them.
-constexpr int kMaxPins = 4096;
-
 // Of one side.
 struct BusNames
 {
@@ -44,7 +41,7 @@ constexpr BusNames kOutputNamesByCount = {u"Mono Out", u"Stereo Out", u"Surround
 
 AudioFilterBusDescription CreateAudioFilterBusDescriptionFromNumChannels(std::u16string_view name, int channelCount)
 {
-    const auto size = static_cast<std::size_t>(std::clamp(channelCount, 0, kMaxPins));
+    const auto size = static_cast<std::size_t>(std::clamp(channelCount, 0, VSTPins::kMaxPins));
     return {UTF16String(name), ChannelLayout(size), kMain};
 }
 
