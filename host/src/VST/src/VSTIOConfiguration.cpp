@@ -101,11 +101,12 @@ bool IsBelievable(const VstSpeakerArrangement* arrangement)
     return arrangement && arrangement->numChannels > 0 && arrangement->numChannels <= kMaxArrangedChannels;
 }
 
-// An honest arrangement has no more records than these.
-int ReadableRecords(int pins, const ChannelLayout& requested)
+// Only a plug-in with so many pins is taken to have kept more than the declared records: some keep these, and the
+// number of channels that they were asked for.
+int ReadableRecords(int pins)
 {
     constexpr int kDeclared = 8;
-    return std::max({kDeclared, pins, static_cast<int>(requested.size())});
+    return std::max(kDeclared, pins);
 }
 
 // Of both sides, or of none.
@@ -142,8 +143,8 @@ Agreement Negotiate(const VSTDispatcherBase& plugin, const AEffect& effect, cons
     ZEB_TRACE(kTraceCategory, "effGetSpeakerArrangement succeeded");
     if (!IsBelievable(inputAnswer) || !IsBelievable(outputAnswer))
         return {};
-    return {CopySpeakerArrangement(*inputAnswer, ReadableRecords(effect.numInputs, input)),
-            CopySpeakerArrangement(*outputAnswer, ReadableRecords(effect.numOutputs, output))};
+    return {CopySpeakerArrangement(*inputAnswer, ReadableRecords(effect.numInputs)),
+            CopySpeakerArrangement(*outputAnswer, ReadableRecords(effect.numOutputs))};
 }
 
 } // namespace
