@@ -11,8 +11,8 @@ int32 ChannelCount(SpeakerArrangement arrangement);
 
 struct Bus
 {
-    const char16_t* name;
-    SpeakerArrangement arrangement; // 0 for an event bus
+    const char16_t* name = nullptr;
+    SpeakerArrangement arrangement = 0; // 0 for an event bus
     BusType type = kMain;
     MediaType media = kAudio;
     bool active = false;

@@ -35,6 +35,7 @@ public:
         return kResultOk;
     }
 
+    // NOLINTNEXTLINE(readability-non-const-parameter): the linter sees no override in a class template
     tresult PLUGIN_API getParamValueByString(ParamID id, TChar* text, ParamValue& normalized) override
     {
         const Parameter* parameter = mParameters.Find(id);

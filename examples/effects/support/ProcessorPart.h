@@ -48,6 +48,7 @@ public:
     tresult PLUGIN_API setActive(TBool) override { return kResultOk; }
 
     // All main buses get the same arrangement, one that the effect says it can do.
+    // NOLINTNEXTLINE(readability-non-const-parameter): the linter sees no override in a class template
     tresult PLUGIN_API setBusArrangements(SpeakerArrangement* inputs, int32 inputCount, SpeakerArrangement* outputs,
                                           int32 outputCount) override
     {

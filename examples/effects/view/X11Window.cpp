@@ -76,7 +76,7 @@ void X11Window::Resize(int width, int height)
 
 void X11Window::Fill(Colour colour, int x, int y, int width, int height)
 {
-    const GC graphics = static_cast<GC>(mGraphics);
+    auto* const graphics = static_cast<GC>(mGraphics);
     XSetForeground(mDisplay, graphics, static_cast<unsigned long>(colour));
     XFillRectangle(mDisplay, mWindow, graphics, x, y, static_cast<unsigned>(width), static_cast<unsigned>(height));
 }

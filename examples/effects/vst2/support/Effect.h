@@ -26,7 +26,7 @@ struct Description
     std::int32_t uniqueID;
     const char* name;
     VstPlugCategory category;
-    std::vector<Parameter> parameters;
+    std::vector<Parameter> parameters{};
     std::int32_t flags = 0; // beside effFlagsCanReplacing
 };
 
