@@ -160,7 +160,8 @@ PluginLocator FilterSelector::SelectPlugin(const std::string& text) const
         const PluginLocator locator = BundleLocator(text);
         if (locator.GetTechnologyType() == zebaudiofilterhost::kTechnologyNone)
         {
-            throw Failure(ExitCode::NotFound, text + " is not named like a plug-in bundle: its name ends in .vst3");
+            throw Failure(ExitCode::NotFound,
+                          text + " is not named like a plug-in: its name ends in .vst3, .vst or .so");
         }
         return locator;
     }
@@ -177,7 +178,7 @@ Catalogue::Descriptor FilterSelector::FindByPath(const std::string& path, const 
     const PluginLocator locator = BundleLocator(path);
     if (locator.GetTechnologyType() == zebaudiofilterhost::kTechnologyNone)
     {
-        throw Failure(ExitCode::NotFound, path + " is no plug-in bundle: its name has to end in .vst3");
+        throw Failure(ExitCode::NotFound, path + " is no plug-in: its name has to end in .vst3, .vst or .so");
     }
     if (mCatalogue.IsBlocked(locator))
     {
@@ -222,7 +223,7 @@ Catalogue::Descriptor FilterSelector::FindByName(const std::string& name) const
     {
         throw Failure(ExitCode::NotFound,
                       "there is no filter named " + name +
-                          ", for the catalogue is empty: run 'zebhost scan', or give a bundle's path");
+                          ", for the catalogue is empty: run 'zebhost scan', or give a plug-in's path");
     }
     const Descriptors fitting = Fitting(all, name);
     if (fitting.size() == 1)

@@ -8,7 +8,8 @@ namespace zebhost
 {
 
 // Finds the one filter that a FILTER operand means: a filter ID, a name that fits one entry of the catalogue, a
-// bundle's path, or path#class name. A bundle that is not in the catalogue is scanned into memory, and not saved.
+// plug-in's path, or path#name of the effect. A plug-in that is not in the catalogue is scanned into memory, and not
+// saved.
 class FilterSelector
 {
 public:
@@ -18,7 +19,7 @@ public:
     // none. Blocked plug-ins are refused.
     Catalogue::Descriptor Select(const std::string& text) const;
 
-    // The bundle that a PLUGIN operand means: a path, or a filter as above. Blocked ones are not refused.
+    // The plug-in that a PLUGIN operand means: a path, or a filter as above. Blocked ones are not refused.
     zebaudiofilterhost::PluginLocator SelectPlugin(const std::string& text) const;
 
 private:

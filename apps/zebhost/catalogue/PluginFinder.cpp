@@ -5,6 +5,7 @@
 #include <foundation/zebcore/NativePath.h>
 #include <host/PluginModuleInfoManager.h>
 #include <host/TechnologyType.h>
+#include <host/VST/VSTTechnology.h>
 
 #include <algorithm>
 #include <array>
@@ -25,8 +26,13 @@ using zebcore::filesupport::ToNativePath;
 namespace
 {
 
-constexpr std::array<std::pair<const char*, TechnologyType>, 1> kExtensions = {
-    {{".vst3", zebaudiofilterhost::kTechnologyVST3}}};
+constexpr std::array<std::pair<const char*, TechnologyType>, 3> kExtensions = {
+    {{".vst3", zebaudiofilterhost::kTechnologyVST3},
+     {".vst", zebaudiofilterhost::kTechnologyVST},
+     {".so", zebaudiofilterhost::kTechnologyVST}}};
+
+// Bundles of other standards. Their binaries may export a VST 2 entry point too.
+constexpr std::array<const char*, 2> kForeignExtensions = {".lv2", ".clap"};
 
 TechnologyType TechnologyOf(const fs::path& path)
 {
@@ -47,6 +53,18 @@ fs::path Normal(const fs::path& path)
     return normal.has_filename() ? normal : normal.parent_path();
 }
 
+// Folders to search, bundles, and the plug-ins that are plain files, of which a name alone tells nothing.
+bool IsWorthVisiting(const fs::directory_entry& entry)
+{
+    std::error_code ignored;
+    if (entry.is_directory(ignored))
+    {
+        return std::find(kForeignExtensions.begin(), kForeignExtensions.end(), entry.path().extension()) ==
+               kForeignExtensions.end();
+    }
+    return zebaudiofilterhost::vst::IsVSTPlugin(FromNativePath(entry.path().string()));
+}
+
 // A link back to a folder above would never end, so each real folder is searched once.
 void SearchFolder(const fs::path& folder, std::set<fs::path>& seen, std::vector<PluginLocator>& found)
 {
@@ -59,8 +77,7 @@ void SearchFolder(const fs::path& folder, std::set<fs::path>& seen, std::vector<
     for (const fs::directory_entry& entry :
          fs::directory_iterator(folder, fs::directory_options::skip_permission_denied, error))
     {
-        std::error_code ignored;
-        if (entry.is_directory(ignored))
+        if (IsWorthVisiting(entry))
         {
             children.push_back(entry.path());
         }
@@ -112,13 +129,18 @@ std::vector<PluginLocator> FindPlugins(const fs::path& path)
     {
         throw Failure(ExitCode::NotFound,
                       path.string() +
-                          " is no plug-in bundle: give a folder whose name ends in .vst3, or one that holds "
-                          "such folders");
+                          " is no plug-in: give a bundle or file whose name ends in .vst3, .vst or .so, or a "
+                          "folder that holds such");
     }
     std::vector<PluginLocator> found;
     std::set<fs::path> seen;
     SearchFolder(Normal(path), seen, found);
     return found;
+}
+
+void UseStandardPlaces()
+{
+    PluginModuleInfoManager::GetInstance().ResetToDefaultFolders();
 }
 
 std::vector<PluginLocator> WithoutDoubles(const std::vector<PluginLocator>& locators)

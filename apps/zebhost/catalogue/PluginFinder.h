@@ -9,16 +9,21 @@
 namespace zebhost
 {
 
-// Whether the path is named like a plug-in bundle of a technology that the library knows; nothing is opened.
+// Whether the path is named like a plug-in, bundle or file, of a technology that the library knows; nothing is
+// opened.
 bool IsBundlePath(const std::filesystem::path& path);
 
-// The locator of a bundle: an absolute path without dots in it. Type 0 if IsBundlePath is false.
+// The locator of a plug-in: an absolute path without dots in it. Type 0 if IsBundlePath is false.
 zebaudiofilterhost::PluginLocator BundleLocator(const std::filesystem::path& path);
 
 std::string PathOf(const zebaudiofilterhost::PluginLocator& locator);
 
-// The bundle itself, or all bundles below a folder, in the order of their names; the inside of a bundle is not
-// searched. Throws a Failure if there is nothing at the path.
+// Has a scan without paths search what the environment says now, and not the folders that the settings file holds:
+// they were those of an environment gone by.
+void UseStandardPlaces();
+
+// The plug-in itself, or all plug-ins below a folder, in the order of their names; the inside of a bundle is not
+// searched, and a plain file is looked into without loading it. Throws a Failure if there is nothing at the path.
 std::vector<zebaudiofilterhost::PluginLocator> FindPlugins(const std::filesystem::path& path);
 
 // Without those that a symbolic link leads to a second time; the first of each stays.

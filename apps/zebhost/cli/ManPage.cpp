@@ -99,7 +99,9 @@ std::string Files()
 
 std::string Environment()
 {
-    return Entry("VST3_PATH", "folders to search instead of the standard ones, separated by colons") +
+    return Entry("VST3_PATH",
+                 "folders to search for VST 3 plug-ins instead of the standard ones, separated by colons") +
+           Entry("VST_PATH", "the same for VST 2 plug-ins") +
            Entry("NO_COLOR", "when set and not empty, output has no colours") +
            Entry("DISPLAY", "the X11 display that edit opens its window on");
 }

@@ -46,7 +46,7 @@ CommandSpec ListSpec()
         "preset list",
         "list stored presets, and those that a plug-in brings along",
         "Without FILTER all stored presets of all filters.",
-        {{"FILTER", "a filter ID, a name that fits one filter, a bundle's path, or path#class name", Values::Filter,
+        {{"FILTER", "a filter ID, a name that fits one filter, a plug-in's path, or path#name", Values::Filter,
           false}},
         {},
         {{"zebhost preset list", "all stored presets"},

@@ -8,7 +8,7 @@ namespace
 
 OperandSpec PluginOperand()
 {
-    return {"PLUGIN", "a bundle's path, or a filter of the catalogue by name or ID", Values::Plugin};
+    return {"PLUGIN", "a plug-in's path, or a filter of the catalogue by name or ID", Values::Plugin};
 }
 
 } // namespace
