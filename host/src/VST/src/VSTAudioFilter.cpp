@@ -63,7 +63,6 @@ VSTAudioFilter::VSTAudioFilter(const UTF16String& filterID, const UTF16String& p
     SetDisplayName(ChooseDisplayName(path, useFileTitle));
     BuildParameterInfos();
     BuildIOConfiguration();
-    PreparePins();
 }
 
 VSTAudioFilter::~VSTAudioFilter()
