@@ -69,7 +69,9 @@ float ProcessNoise(AudioFilter& filter)
 {
     std::minstd_rand random;
     std::uniform_real_distribution<float> noise(-0.5F, 0.5F);
-    std::vector<float> input(kBlock), left(kBlock), right(kBlock);
+    std::vector<float> input(kBlock);
+    std::vector<float> left(kBlock);
+    std::vector<float> right(kBlock);
     float* in[] = {input.data(), input.data()};
     float* out[] = {left.data(), right.data()};
     float peak = 0.0F;
