@@ -188,24 +188,14 @@ private:
 
     void Handle(const XEvent& event)
     {
-        // NOLINTNEXTLINE(bugprone-branch-clone)
-        if (event.type == ClientMessage && static_cast<Atom>(event.xclient.data.l[0]) == mCloseRequest)
-        {
+        const bool asked = event.type == ClientMessage && static_cast<Atom>(event.xclient.data.l[0]) == mCloseRequest;
+        if (asked || (event.type == DestroyNotify && event.xdestroywindow.window == mWindow))
             mClosed = true;
-        }
         // Whatever a plug-in's window says of itself, it is to be seen.
         else if (event.type == CreateNotify && event.xcreatewindow.parent == mWindow)
-        {
             XMapWindow(mDisplay, event.xcreatewindow.window);
-        }
         else if (event.type == ReparentNotify && event.xreparent.parent == mWindow)
-        {
             XMapWindow(mDisplay, event.xreparent.window);
-        }
-        else if (event.type == DestroyNotify && event.xdestroywindow.window == mWindow)
-        {
-            mClosed = true;
-        }
     }
 
     Display* mDisplay;
