@@ -4,6 +4,7 @@
 #include "commands/Commands.h"
 #include "filter/CrashGuard.h"
 #include "output/Tracing.h"
+#include "scan/ScanWorker.h"
 
 #include <module/Module.h>
 
@@ -125,6 +126,10 @@ ExitCode Guarded(int argc, const char* const* argv, Console& console)
 
 int main(int argc, char** argv)
 {
+    if (zebhost::IsWorkerCommandLine(argc, argv))
+    {
+        zebhost::RunScanWorker(argc, argv);
+    }
     zebhost::Console console;
     zebhost::ExitCode code = zebhost::Guarded(argc, argv, console);
     if (!console.Flush() && code == zebhost::ExitCode::Done)

@@ -1,17 +1,7 @@
 #include "catalogue/BlockReasons.h"
 
-#include "catalogue/SettingsFolder.h"
-#include "output/JsonDocument.h"
-#include "output/PrintableText.h"
-
-#include <foundation/zebcore/FileUtils.h>
-#include <foundation/zebcore/NativePath.h>
-#include <foundation/zebcore/SafeSave.h>
-#include <foundation/zebcore/XmlUtils.h>
-
 #include <array>
 #include <ctime>
-#include <fstream>
 
 namespace zebhost
 {
@@ -21,15 +11,18 @@ using zebaudiofilterhost::PluginLocator;
 namespace
 {
 
-constexpr int kVersion = 1;
+constexpr const char* kReason = "reason";
+constexpr const char* kSince = "since";
+constexpr const char* kBinary = "binary";
+constexpr const char* kAtHand = "atHand";
+constexpr const char* kKnown = "known";
 
-std::string Key(const PluginLocator& locator)
+bool FlagIn(const Json& entry, const char* name)
 {
-    // Bytes that are no UTF-8 can't stand in JSON; escaped they can.
-    zebcore::UTF16String key;
-    zebcore::xml::utils::EncodeReservedCharacters(locator.ToString(), key);
-    return ToUTF8(key);
+    return entry.value(name, Json()) == true;
 }
+
+} // namespace
 
 std::string TimeOfNow()
 {
@@ -41,66 +34,34 @@ std::string TimeOfNow()
     return text.data();
 }
 
-std::string TextOf(const Json& entry, const char* key)
-{
-    const auto found = entry.find(key);
-    return found != entry.end() && found->is_string() ? found->get<std::string>() : std::string();
-}
-
-} // namespace
-
-BlockReasons::BlockReasons(std::filesystem::path file) : mFile(std::move(file))
+BlockReasons::BlockReasons(const std::filesystem::path& file) : mTable(file, "blocked")
 {
 }
 
-void BlockReasons::Load()
+void BlockReasons::Set(const PluginLocator& locator, const BlockReason& reason)
 {
-    mReasons.clear();
-    std::ifstream stream(mFile, std::ios::binary);
-    const Json document = Json::parse(stream, nullptr, false);
-    if (!document.is_object() || document.value("version", Json()) != kVersion || !document.contains("blocked") ||
-        !document["blocked"].is_object())
+    Json entry{{kReason, reason.reason}, {kSince, reason.since}};
+    if (!reason.binary.IsEmpty())
     {
-        return;
+        entry[kBinary] = ToJson(reason.binary);
     }
-    for (const auto& [key, entry] : document["blocked"].items())
+    if (reason.isAtHand)
     {
-        if (entry.is_object())
-        {
-            mReasons[key] = {TextOf(entry, "reason"), TextOf(entry, "since")};
-        }
+        entry[kAtHand] = true;
+        entry[kKnown] = reason.wasKnown;
     }
-}
-
-void BlockReasons::Save() const
-{
-    Json blocked = Json::object();
-    for (const auto& [key, reason] : mReasons)
-    {
-        blocked[key] = Json{{"reason", reason.reason}, {"since", reason.since}};
-    }
-    const std::string text = ToText(Json{{"version", kVersion}, {"blocked", blocked}});
-    std::filesystem::create_directories(mFile.parent_path());
-    zebcore::filesupport::File target = ToFile(mFile);
-    zebcore::filesupport::SafeSave save(target);
-    zebcore::utility::FileUtils::SimpleWriteStringToFile(save.GetTempFile().FullPath(), {text.begin(), text.end()});
-    save.Commit();
-}
-
-void BlockReasons::Set(const PluginLocator& locator, const std::string& reason)
-{
-    mReasons[Key(locator)] = {reason, TimeOfNow()};
-}
-
-void BlockReasons::Remove(const PluginLocator& locator)
-{
-    mReasons.erase(Key(locator));
+    mTable.Set(locator, std::move(entry));
 }
 
 BlockReason BlockReasons::Get(const PluginLocator& locator) const
 {
-    const auto found = mReasons.find(Key(locator));
-    return found == mReasons.end() ? BlockReason() : found->second;
+    const Json* const entry = mTable.Find(locator);
+    if (entry == nullptr)
+    {
+        return {};
+    }
+    return {TextIn(*entry, kReason), TextIn(*entry, kSince), StampIn(*entry), FlagIn(*entry, kAtHand),
+            FlagIn(*entry, kKnown)};
 }
 
 } // namespace zebhost

@@ -1,9 +1,9 @@
 #pragma once
 
-#include <host/PluginLocator.h>
+#include "catalogue/BinaryStamp.h"
+#include "catalogue/LocatorTable.h"
 
 #include <filesystem>
-#include <map>
 #include <string>
 
 namespace zebhost
@@ -13,28 +13,34 @@ struct BlockReason
 {
     std::string reason;
     std::string since; // UTC, as 2024-05-31T12:00:00Z
+    // Of the binary that a scan blocked; another one is given a chance. Empty for a block made by hand, which holds
+    // until it is lifted by hand.
+    BinaryStamp binary;
+    // Of a scan that has not ended, or was killed.
+    bool isAtHand = false;
+    bool wasKnown = false; // while at hand: the catalogue has a record of an earlier scan
 };
 
-// Why plug-ins are blocked, in a file of its own beside the block list. Losing it loses nothing but the reasons, so a
-// damaged file counts as empty.
+// The time of now, as it stands in `since`.
+std::string TimeOfNow();
+
+// Why plug-ins are blocked, in a file of its own beside the block list. Losing it loses nothing but the reasons.
 class BlockReasons
 {
 public:
-    explicit BlockReasons(std::filesystem::path file);
+    explicit BlockReasons(const std::filesystem::path& file);
 
-    void Load();
-    // Throws zebcore's file_exception.
-    void Save() const;
+    void Load() { mTable.Load(); }
+    // Throws zebcore's file_exception, or filesystem_error.
+    void Save(LocatorTable::Saving saving) const { mTable.Save(saving); }
 
-    // With the time of now.
-    void Set(const zebaudiofilterhost::PluginLocator& locator, const std::string& reason);
-    void Remove(const zebaudiofilterhost::PluginLocator& locator);
-    // Both texts empty if nothing is known.
+    void Set(const zebaudiofilterhost::PluginLocator& locator, const BlockReason& reason);
+    void Remove(const zebaudiofilterhost::PluginLocator& locator) { mTable.Remove(locator); }
+    // All empty if nothing is known.
     BlockReason Get(const zebaudiofilterhost::PluginLocator& locator) const;
 
 private:
-    std::filesystem::path mFile;
-    std::map<std::string, BlockReason> mReasons; // by the locator's text
+    LocatorTable mTable;
 };
 
 } // namespace zebhost

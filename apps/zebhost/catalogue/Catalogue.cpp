@@ -11,6 +11,7 @@
 #include <host/PluginModuleInfoManager.h>
 
 #include <algorithm>
+#include <cerrno>
 #include <iterator>
 
 namespace zebhost
@@ -29,6 +30,13 @@ namespace
 constexpr unsigned int kSettingsVersion = 2;
 constexpr unsigned int kBlockListVersion = 1;
 
+std::string Remedy(int error)
+{
+    const bool isFull = error == ENOSPC || error == EDQUOT || error == EFBIG;
+    return (isFull ? std::string(": make room") : ": make it readable and writable") +
+           ", or name another folder with --settings";
+}
+
 // Runs a step on files of the settings folder; their trouble is the user's to mend.
 template <typename Step>
 void WithFiles(const Step& step)
@@ -39,13 +47,11 @@ void WithFiles(const Step& step)
     }
     catch (const file_exception& error)
     {
-        throw Failure(ExitCode::FileTrouble, std::string(error.what()) +
-                                                 ": make it readable and writable, or name another folder with "
-                                                 "--settings");
+        throw Failure(ExitCode::FileTrouble, error.what() + Remedy(error.Error()));
     }
     catch (const std::filesystem::filesystem_error& error)
     {
-        throw Failure(ExitCode::FileTrouble, std::string(error.what()) + ": name another folder with --settings");
+        throw Failure(ExitCode::FileTrouble, error.what() + Remedy(error.code().value()));
     }
 }
 
@@ -79,7 +85,7 @@ bool IsOnPermanentList(const PluginLocator& locator)
 } // namespace
 
 Catalogue::Catalogue(const SettingsFolder& folder, Console& console)
-    : mFolder(folder), mConsole(console), mReasons(folder.BlockReasons())
+    : mFolder(folder), mConsole(console), mReasons(folder.BlockReasons()), mStamps(folder.BinaryStamps())
 {
 }
 
@@ -96,7 +102,27 @@ void Catalogue::Load()
             {
                 NoteDamaged(mFolder.Catalogue());
             }
+            mStamps.Load();
         });
+    LiftFinishedBlocks();
+}
+
+// A scan that was killed after it had saved a plug-in's record, and before it took the plug-in off the list, had
+// nothing against it.
+void Catalogue::LiftFinishedBlocks()
+{
+    BannedPluginManager& blocks = BannedPluginManager::GetInstance();
+    const std::vector<PluginLocator> blocked(blocks.BannedBegin(), blocks.BannedEnd());
+    for (const PluginLocator& locator : blocked)
+    {
+        const BlockReason why = mReasons.Get(locator);
+        if (why.isAtHand && !why.wasKnown &&
+            PluginModuleInfoManager::GetInstance().FindPluginInfo(locator) != nullptr)
+        {
+            blocks.RemoveBannedPlugin(locator);
+            mReasons.Remove(locator);
+        }
+    }
 }
 
 void Catalogue::LoadBlocks()
@@ -155,22 +181,25 @@ void Catalogue::Save()
         {
             std::filesystem::create_directories(mFolder.Path());
             SetAsideIfDamaged(mFolder.Catalogue());
+            // Not SaveConfiguration, which keeps silent when the system refuses to give up the old file.
+            zebcore::proplist::PropList list;
+            PluginModuleInfoManager::GetInstance().BuildConfigurationPropList(list, true);
             File file = ToFile(mFolder.Catalogue());
-            PluginModuleInfoManager::GetInstance().SaveConfiguration(file, true);
+            zebcore::proplist::utils::SavePropList(file, list);
         });
 }
 
-void Catalogue::SaveBlocks()
+void Catalogue::SaveBlockList()
 {
-    WithFiles(
-        [this]
-        {
-            std::filesystem::create_directories(mFolder.Path());
-            SetAsideIfDamaged(mFolder.Blocks());
-            File file = ToFile(mFolder.Blocks());
-            BannedPluginManager::GetInstance().SaveConfiguration(file);
-            mReasons.Save();
-        });
+    std::filesystem::create_directories(mFolder.Path());
+    SetAsideIfDamaged(mFolder.Blocks());
+    File file = ToFile(mFolder.Blocks());
+    BannedPluginManager::GetInstance().SaveConfiguration(file);
+}
+
+void Catalogue::SaveStamps(LocatorTable::Saving saving)
+{
+    WithFiles([this, saving] { mStamps.Save(saving); });
 }
 
 std::vector<Catalogue::Descriptor> Catalogue::Effects() const
@@ -209,18 +238,28 @@ std::string Catalogue::BlockedBecause(const PluginLocator& locator) const
            "' lets it be used again";
 }
 
-void Catalogue::Block(const PluginLocator& locator, const std::string& reason)
+void Catalogue::Block(const PluginLocator& locator, const BlockReason& reason, LocatorTable::Saving saving)
 {
     BannedPluginManager::GetInstance().AddBannedPlugin(locator);
     mReasons.Set(locator, reason);
-    SaveBlocks();
+    WithFiles(
+        [this, saving]
+        {
+            mReasons.Save(saving);
+            SaveBlockList();
+        });
 }
 
 void Catalogue::Unblock(const PluginLocator& locator)
 {
     BannedPluginManager::GetInstance().RemoveBannedPlugin(locator);
     mReasons.Remove(locator);
-    SaveBlocks();
+    WithFiles(
+        [this]
+        {
+            SaveBlockList();
+            mReasons.Save(LocatorTable::Saving::Quick);
+        });
 }
 
 } // namespace zebhost

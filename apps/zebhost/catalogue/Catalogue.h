@@ -1,5 +1,6 @@
 #pragma once
 
+#include "catalogue/BinaryStamps.h"
 #include "catalogue/BlockReasons.h"
 #include "catalogue/SettingsFolder.h"
 #include "output/Console.h"
@@ -33,16 +34,22 @@ public:
     bool IsBlocked(const zebaudiofilterhost::PluginLocator& locator) const;
     // "it was blocked on ... because ...".
     std::string BlockedBecause(const zebaudiofilterhost::PluginLocator& locator) const;
-    // Both are saved at once.
-    void Block(const zebaudiofilterhost::PluginLocator& locator, const std::string& reason);
+    // Both are saved at once, in such an order that no plug-in is ever blocked without a reason.
+    void Block(const zebaudiofilterhost::PluginLocator& locator, const BlockReason& reason,
+               LocatorTable::Saving saving = LocatorTable::Saving::Flushed);
     void Unblock(const zebaudiofilterhost::PluginLocator& locator);
-
     const BlockReasons& Reasons() const { return mReasons; }
+
+    BinaryStamps& Stamps() { return mStamps; }
+    const BinaryStamps& Stamps() const { return mStamps; }
+    void SaveStamps(LocatorTable::Saving saving);
+
     const SettingsFolder& Folder() const { return mFolder; }
 
 private:
     void LoadBlocks();
-    void SaveBlocks();
+    void LiftFinishedBlocks();
+    void SaveBlockList();
     bool IsSound(const std::filesystem::path& path, unsigned int version) const;
     void NoteDamaged(const std::filesystem::path& path);
     void SetAsideIfDamaged(const std::filesystem::path& path);
@@ -50,6 +57,7 @@ private:
     const SettingsFolder& mFolder;
     Console& mConsole;
     BlockReasons mReasons;
+    BinaryStamps mStamps;
     std::set<std::filesystem::path> mDamaged;
 };
 

@@ -16,18 +16,31 @@ struct ScanPlan
     struct Item
     {
         zebaudiofilterhost::PluginLocator locator;
-        std::string why; // "new", "asked for", "full scan", "gone", "blocked"
+        // "new", "changed", "asked for", "full scan", "failed before", "was blocked", "was blocked, and has changed";
+        // of what is dropped "gone", "blocked"; of what is skipped why it was blocked or
+        // could not be loaded
+        std::string why;
     };
 
-    std::vector<Item> toScan;
-    std::vector<Item> toDrop;  // records of the catalogue
-    std::vector<Item> skipped; // found, and blocked
+    std::vector<Item> toScan; // one technology after the other
+    std::vector<Item> toDrop; // records of the catalogue
+    std::vector<Item> blocked;
+    std::vector<Item> failed; // could not be loaded the last time, and is still the same
+    // Records from a time when nothing was known of their binaries: those that are there now are taken to be the
+    // same.
+    std::vector<zebaudiofilterhost::PluginLocator> unstamped;
+};
+
+struct ScanWishes
+{
+    bool full = false;         // what is in the catalogue as well
+    bool retryBlocked = false; // what is blocked as well, and what could not be loaded
 };
 
 // Of the standard places. Records of plug-ins elsewhere stay for as long as the plug-in is there.
-ScanPlan PlanStandardScan(const Catalogue& catalogue, bool full);
+ScanPlan PlanStandardScan(const Catalogue& catalogue, const ScanWishes& wishes);
 
 // Of bundles and folders. Throws a Failure if nothing is at a path, or if a bundle that was named is blocked.
-ScanPlan PlanPathScan(const Catalogue& catalogue, const std::vector<std::string>& paths);
+ScanPlan PlanPathScan(const Catalogue& catalogue, const std::vector<std::string>& paths, const ScanWishes& wishes);
 
 } // namespace zebhost

@@ -28,6 +28,11 @@ std::filesystem::path SettingsFolder::Catalogue() const
     return mPath / ToNativePath(PluginModuleInfoManager::GetInstance().GetSettingsFileName());
 }
 
+std::filesystem::path SettingsFolder::BinaryStamps() const
+{
+    return Catalogue().replace_extension(".binaries.json");
+}
+
 std::filesystem::path SettingsFolder::Blocks() const
 {
     return mPath / ToNativePath(BannedPluginManager::GetInstance().GetSettingsFileName());

@@ -29,20 +29,28 @@ CommandSpec ScanSpec()
         "scan",
         "find plug-ins and put their effects into the catalogue",
         "Without a PATH the standard places are searched ($VST3_PATH, or else ~/.vst3, /usr/local/lib/vst3 and "
-        "/usr/lib/vst3); plug-ins that are in the catalogue already are not loaded again, and those that have gone "
-        "are dropped. A PATH is a bundle or a folder to search; what is found there is always scanned anew. The "
-        "catalogue is saved after each plug-in. A plug-in that crashes the scan, or does not answer in time, is "
-        "blocked: run the scan again, and it goes on behind it.",
+        "/usr/lib/vst3); plug-ins that are in the catalogue already are loaded again only if their binary has "
+        "changed, and those that have gone are dropped. A PATH is a bundle or a folder to search; what is found "
+        "there "
+        "is always scanned anew. Plug-ins are loaded in a process of their own, and the catalogue is saved after "
+        "each. One that crashes, or does not answer in time, is blocked, and the scan goes on; it is tried again "
+        "when "
+        "its binary has changed. Ctrl-C ends the scan with everything saved and nothing blocked.",
         {{"PATH", "a plug-in bundle or a folder to search", Values::Folder, false, true}},
         {
-            {"full", "", "scan plug-ins again that are in the catalogue already"},
+            {"full", "", "scan plug-ins again that are in the catalogue already, or could not be loaded"},
+            {"retry-blocked", "", "scan blocked plug-ins again, and those that could not be loaded"},
             {"dry-run", "", "print what would be scanned, and why; load nothing and save nothing"},
             {"skip-category", "", "do not ask plug-ins for their category"},
             {"timeout", "SECONDS", "give up on a plug-in after SECONDS, and block it; 0 waits for ever (default 30)",
              Values::Number},
+            {"verbose", "", "show what plug-ins print"},
+            {"in-process", "", "load plug-ins in this process, for debugging: a crash ends the scan"},
         },
         {{"zebhost scan", "scan what is new in the standard places"},
-         {"zebhost scan ~/build/MyEffect.vst3", "scan one bundle, wherever it lies"}},
+         {"zebhost scan ~/build/MyEffect.vst3", "scan one bundle, wherever it lies"},
+         {"zebhost scan --dry-run", "what would be scanned, and why"},
+         {"zebhost scan --retry-blocked --verbose", "give blocked plug-ins another chance, and see what they say"}},
     };
 }
 

@@ -68,7 +68,10 @@ void Tell(const CommandContext& context, const PluginLocator& locator, const std
 ExitCode RunBlock(CommandContext& context)
 {
     const PluginLocator locator = FilterSelector(context.catalogue).SelectPlugin(context.arguments.Text("PLUGIN"));
-    context.catalogue.Block(locator, context.arguments.Text("reason", "blocked by hand"));
+    BlockReason why;
+    why.reason = context.arguments.Text("reason", "blocked by hand");
+    why.since = TimeOfNow();
+    context.catalogue.Block(locator, why);
     Tell(context, locator, " is blocked; 'zebhost unblock' lets it be used again");
     return ExitCode::Done;
 }

@@ -1,230 +1,154 @@
-#include "catalogue/PluginFinder.h"
 #include "catalogue/ScanPlan.h"
 #include "catalogue/ScanSession.h"
 #include "cli/Failure.h"
 #include "commands/Commands.h"
+#include "commands/ScanReport.h"
 #include "filter/Interrupt.h"
-#include "output/ProgressBar.h"
 #include "output/Strings.h"
-#include "output/TextTable.h"
+#include "scan/ScanSupervisor.h"
 
 #include <host/PluginModuleInfoManager.h>
 
-#include <algorithm>
+#include <cmath>
+#include <csignal>
 #include <optional>
 
 namespace zebhost
 {
 
 using zebaudiofilterhost::PluginLocator;
+using zebaudiofilterhost::PluginModuleInfoManager;
 
 namespace
 {
 
-struct Result
-{
-    std::string path;
-    std::string state; // "scanned", "failed", "dropped", "blocked"; with --dry-run what would become of it
-    std::string detail;
-    std::size_t effects = 0;
-};
-
-// Shows progress, and keeps what became of each plug-in.
-class Reporter : public IScanObserver
+// A reader of standard error that goes away must not end a scan between two saves, nor a worker's end do so.
+class PipesMayBreak
 {
 public:
-    explicit Reporter(Console& console) : mConsole(console) {}
-
-    void Stepping(const PluginLocator& locator, const std::string& detail, std::size_t current,
-                  std::size_t total) override
-    {
-        const std::string name =
-            std::filesystem::path(PathOf(locator)).stem().string() + (detail.empty() ? "" : " ") + detail;
-        if (mConsole.IsErrorTerminal())
-        {
-            mConsole.ShowProgress(ProgressBar(static_cast<long long>(current), static_cast<long long>(total), name));
-        }
-        else
-        {
-            mConsole.Remark(std::to_string(current) + "/" + std::to_string(total) + " " + name);
-        }
-    }
-
-    void Finished(const PluginLocator& locator, const Outcome& outcome) override
-    {
-        mResults.push_back(
-            {PathOf(locator), outcome.loaded ? "scanned" : "failed", outcome.problem, outcome.effects});
-        mFailures += outcome.loaded ? 0 : 1;
-        mEffects += outcome.effects;
-    }
-
-    bool ShallStop() const override { return interrupt::IsRequested(); }
-
-    std::vector<Result> mResults;
-    std::size_t mFailures = 0;
-    std::size_t mEffects = 0;
+    PipesMayBreak() : mBefore(std::signal(SIGPIPE, SIG_IGN)) {}
+    ~PipesMayBreak() { std::signal(SIGPIPE, mBefore); }
+    PipesMayBreak(const PipesMayBreak&) = delete;
+    PipesMayBreak& operator=(const PipesMayBreak&) = delete;
 
 private:
-    Console& mConsole;
+    void (*mBefore)(int);
 };
 
-std::string Detail(const Result& result)
+std::vector<PluginLocator> LocatorsOf(const std::vector<ScanPlan::Item>& items)
 {
-    if (result.state != "scanned")
-    {
-        return result.detail;
-    }
-    return result.effects == 0 ? "no effect in it" : Counted(result.effects, "effect");
-}
-
-void PrintResults(const CommandContext& context, const std::vector<Result>& results,
-                  const std::optional<Failure>& trouble)
-{
-    if (context.WantsJson())
-    {
-        Json document = trouble ? FailureDocument(context.arguments.command, *trouble) : context.NewDocument();
-        document["plugins"] = Json::array();
-        for (const Result& result : results)
-        {
-            document["plugins"].push_back(Json{{"path", result.path},
-                                               {"state", result.state},
-                                               {"effects", result.effects},
-                                               {"reason", result.detail}});
-        }
-        context.Print(document);
-        return;
-    }
-    TextTable table({"STATE", "PATH", "RESULT"});
-    for (const Result& result : results)
-    {
-        table.AddRow({result.state, result.path, Detail(result)});
-    }
-    if (!table.IsEmpty())
-    {
-        context.console.Print(table.Text(context.console.HasOutputColour()));
-    }
-}
-
-void AddPlanned(std::vector<Result>& results, const std::vector<ScanPlan::Item>& items, const std::string& state)
-{
+    std::vector<PluginLocator> locators;
     for (const ScanPlan::Item& item : items)
-    {
-        results.push_back({PathOf(item.locator), state, item.why, 0});
-    }
-}
-
-ExitCode DryRun(const CommandContext& context, const ScanPlan& plan)
-{
-    std::vector<Result> results;
-    AddPlanned(results, plan.toDrop, "would-drop");
-    AddPlanned(results, plan.toScan, "would-scan");
-    AddPlanned(results, plan.skipped, "blocked");
-    PrintResults(context, results, std::nullopt);
-    context.console.Remark("zebhost: " + Counted(plan.toScan.size(), "plug-in") + " would be scanned, " +
-                           std::to_string(plan.toDrop.size()) + " dropped; nothing was done");
-    return ExitCode::Done;
-}
-
-void Drop(const CommandContext& context, const ScanPlan& plan)
-{
-    if (plan.toDrop.empty())
-    {
-        return;
-    }
-    std::vector<PluginLocator> locators;
-    for (const ScanPlan::Item& item : plan.toDrop)
-    {
-        locators.push_back(item.locator);
-    }
-    zebaudiofilterhost::PluginModuleInfoManager::GetInstance().RemovePluginLocators(locators);
-    context.catalogue.Save();
-}
-
-std::vector<PluginLocator> LocatorsOf(const ScanPlan& plan)
-{
-    std::vector<PluginLocator> locators;
-    for (const ScanPlan::Item& item : plan.toScan)
     {
         locators.push_back(item.locator);
     }
     return locators;
 }
 
-// A bundle that was asked for by its own path has to load; of a folder, whatever does.
-const Result* NamedFailure(const std::vector<std::string>& paths, const std::vector<Result>& results)
+ScanPlan MakePlan(const CommandContext& context)
 {
-    const auto named = [&paths](const Result& result)
-    {
-        return std::any_of(paths.begin(), paths.end(),
-                           [&result](const std::string& path)
-                           { return IsBundlePath(path) && PathOf(BundleLocator(path)) == result.path; });
-    };
-    const auto found =
-        std::find_if(results.begin(), results.end(),
-                     [&named](const Result& result) { return result.state == "failed" && named(result); });
-    return found == results.end() ? nullptr : &*found;
+    const std::vector<std::string> paths = context.arguments.All("PATH");
+    const ScanWishes wishes{context.arguments.Has("full"), context.arguments.Has("retry-blocked")};
+    return paths.empty() ? PlanStandardScan(context.catalogue, wishes)
+                         : PlanPathScan(context.catalogue, paths, wishes);
 }
 
-std::optional<Failure> TroubleOf(const CommandContext& context, const ScanPlan& plan, const Reporter& reporter)
+// What needs no plug-in to be loaded.
+void PutInOrder(const CommandContext& context, const ScanPlan& plan)
 {
-    const std::size_t scanned = reporter.mResults.size();
-    if (scanned < plan.toScan.size())
+    if (!plan.toDrop.empty())
     {
-        return Failure(ExitCode::JobFailed, "the scan was interrupted after " + std::to_string(scanned) + " of " +
-                                                Counted(plan.toScan.size(), "plug-in") +
-                                                ", which are saved: run it again to go on");
+        PluginModuleInfoManager::GetInstance().RemovePluginLocators(LocatorsOf(plan.toDrop));
+        context.catalogue.Save();
     }
-    if (const Result* failed = NamedFailure(context.arguments.All("PATH"), reporter.mResults))
+    for (const ScanPlan::Item& item : plan.toDrop)
     {
-        return Failure(ExitCode::NotLoaded, failed->detail);
+        context.catalogue.Stamps().Remove(item.locator);
     }
-    return std::nullopt;
+    for (const PluginLocator& locator : plan.unstamped)
+    {
+        context.catalogue.Stamps().Set(locator, {StampOf(locator), {}});
+    }
+    if (!plan.toDrop.empty() || !plan.unstamped.empty())
+    {
+        context.catalogue.SaveStamps(LocatorTable::Saving::Flushed);
+    }
 }
 
-std::string Summary(const ScanPlan& plan, const Reporter& reporter)
+// Returns how many worker processes were lost.
+std::size_t ScanInWorkers(const CommandContext& context, const ScanPlan& plan, double timeout, ScanReport& report)
 {
-    const auto part = [](std::size_t count, const std::string& what)
+    interrupt::Watch(interrupt::Second::Ignored);
+    const PipesMayBreak mayBreak;
+    ScanSupervisor::Options options;
+    options.skipCategory = context.arguments.Has("skip-category");
+    options.timeoutSeconds = timeout;
+    options.traces = context.arguments.All("trace");
+    options.showOutput = context.arguments.Has("verbose") || !options.traces.empty();
+    ScanSupervisor supervisor(context.catalogue, context.console, report, options);
+    supervisor.Run(LocatorsOf(plan.toScan));
+    return supervisor.Restarts();
+}
+
+void ScanHere(const CommandContext& context, const ScanPlan& plan, double timeout, ScanReport& report)
+{
+    interrupt::Watch();
+    ScanSession::Options options;
+    options.skipCategory = context.arguments.Has("skip-category");
+    options.timeoutSeconds = static_cast<unsigned int>(std::ceil(timeout));
+    ScanSession(&context.catalogue, report, options).Run(LocatorsOf(plan.toScan));
+}
+
+std::optional<Failure> TroubleOf(const CommandContext& context, const ScanPlan& plan, const ScanReport& report)
+{
+    if (report.CountFinished() < plan.toScan.size())
     {
-        return count == 0 ? std::string() : ", " + std::to_string(count) + " " + what;
-    };
-    const std::string rest = part(reporter.mFailures, "could not be loaded") + part(plan.toDrop.size(), "dropped") +
-                             part(plan.skipped.size(), "blocked");
-    if (plan.toScan.empty())
-    {
-        return "zebhost: nothing to scan" + rest + "; --full scans again what is in the catalogue";
+        return Failure(ExitCode::JobFailed,
+                       "the scan was interrupted after " + std::to_string(report.CountFinished()) + " of " +
+                           Counted(plan.toScan.size(), "plug-in") + ", which are saved: run it again to go on");
     }
-    return "zebhost: " + Counted(reporter.mResults.size(), "plug-in") + " scanned, " +
-           Counted(reporter.mEffects, "effect") + " found" + rest;
+    return report.FailureOf(context.arguments.All("PATH"));
 }
 
 } // namespace
 
 ExitCode RunScan(CommandContext& context)
 {
-    const std::vector<std::string> paths = context.arguments.All("PATH");
-    const ScanPlan plan = paths.empty() ? PlanStandardScan(context.catalogue, context.arguments.Has("full"))
-                                        : PlanPathScan(context.catalogue, paths);
+    constexpr double kLongestTimeout = 86400;
+    const double timeout = context.arguments.Number("timeout", 30, 0, kLongestTimeout);
+    const ScanPlan plan = MakePlan(context);
+    ScanReport report(context, plan);
     if (context.arguments.Has("dry-run"))
     {
-        return DryRun(context, plan);
+        report.PrintPlan();
+        context.console.Remark(report.PlanSummary());
+        return ExitCode::Done;
     }
-    ScanSession::Options options;
-    options.skipCategory = context.arguments.Has("skip-category");
-    options.timeoutSeconds = static_cast<unsigned int>(context.arguments.Count("timeout", 30, 0, 86400));
-    interrupt::Watch();
-    Drop(context, plan);
-    Reporter reporter(context.console);
-    ScanSession(&context.catalogue, reporter, options).Run(LocatorsOf(plan));
-    std::vector<Result> results = reporter.mResults;
-    AddPlanned(results, plan.toDrop, "dropped");
-    AddPlanned(results, plan.skipped, "blocked");
-    const std::optional<Failure> trouble = TroubleOf(context, plan, reporter);
-    PrintResults(context, results, trouble);
+    std::size_t restarts = 0;
+    std::optional<Failure> trouble;
+    try
+    {
+        PutInOrder(context, plan);
+        if (context.arguments.Has("in-process"))
+        {
+            ScanHere(context, plan, timeout, report);
+        }
+        else if (!plan.toScan.empty())
+        {
+            restarts = ScanInWorkers(context, plan, timeout, report);
+        }
+        trouble = TroubleOf(context, plan, report);
+    }
+    catch (const Failure& failure)
+    {
+        trouble = failure;
+    }
+    report.Print(trouble, restarts);
     if (trouble)
     {
         throw Failure(*trouble);
     }
-    context.console.Remark(Summary(plan, reporter));
+    context.console.Remark(report.Summary());
     return ExitCode::Done;
 }
 

@@ -18,13 +18,13 @@ void OnSignal(int)
 
 } // namespace
 
-void Watch()
+void Watch(Second second)
 {
     struct sigaction action
     {
     };
     action.sa_handler = OnSignal;
-    action.sa_flags = static_cast<int>(SA_RESETHAND);
+    action.sa_flags = second == Second::Ignored ? 0 : static_cast<int>(SA_RESETHAND);
     sigemptyset(&action.sa_mask);
     for (const int signal : {SIGINT, SIGTERM, SIGHUP})
     {

@@ -3,9 +3,15 @@
 namespace zebhost::interrupt
 {
 
+enum class Second
+{
+    EndsAtOnce,
+    Ignored // for work that answers to the first within a moment, and has something to put in order by then
+};
+
 // From now on the first Ctrl-C, hang-up or termination request is only noted, so that work can end cleanly between
-// two steps. The second ends the process at once.
-void Watch();
+// two steps.
+void Watch(Second second = Second::EndsAtOnce);
 
 bool IsRequested();
 

@@ -106,7 +106,10 @@ ZebhostTest::ZebhostTest()
 {
     std::string name = (fs::temp_directory_path() / "zebhost-test-XXXXXX").string();
     mFolder = mkdtemp(name.data());
-    mVariables = {{"HOME", mFolder.string()}, {"XDG_CONFIG_HOME", ""}, {"NO_COLOR", "1"}};
+    mVariables = {{"HOME", mFolder.string()},
+                  {"XDG_CONFIG_HOME", ""},
+                  {"NO_COLOR", "1"},
+                  {"VST_PATH", (mFolder / "none").string()}};
     SearchIn(EffectFolder());
 }
 

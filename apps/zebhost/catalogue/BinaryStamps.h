@@ -1,0 +1,35 @@
+#pragma once
+
+#include "catalogue/BinaryStamp.h"
+#include "catalogue/LocatorTable.h"
+
+#include <optional>
+
+namespace zebhost
+{
+
+// Which binaries were scanned, in a file of its own beside the settings file: a binary that is not the one that was
+// scanned is scanned again, and one that could not be loaded is left alone for as long as it is the same.
+class BinaryStamps
+{
+public:
+    explicit BinaryStamps(const std::filesystem::path& file);
+
+    void Load() { mTable.Load(); }
+    // Throws zebcore's file_exception, or filesystem_error.
+    void Save(LocatorTable::Saving saving) const { mTable.Save(saving); }
+
+    struct Entry
+    {
+        BinaryStamp binary;
+        std::string problem; // why it could not be loaded; empty if it could
+    };
+    std::optional<Entry> Find(const zebaudiofilterhost::PluginLocator& locator) const;
+    void Set(const zebaudiofilterhost::PluginLocator& locator, const Entry& entry);
+    void Remove(const zebaudiofilterhost::PluginLocator& locator) { mTable.Remove(locator); }
+
+private:
+    LocatorTable mTable;
+};
+
+} // namespace zebhost

@@ -1,0 +1,15 @@
+#pragma once
+
+#include "catalogue/IScanObserver.h"
+
+#include <functional>
+
+namespace zebhost
+{
+
+// Scans one plug-in in this process, into the library's catalogue, which loses what it knew of it. `beforeStep` is
+// told which of its filters is next. What the plug-in throws becomes the outcome's problem. [main]
+IScanObserver::Outcome ScanPlugin(const zebaudiofilterhost::PluginLocator& locator, bool skipCategory,
+                                  const std::function<void(const std::string& detail)>& beforeStep);
+
+} // namespace zebhost

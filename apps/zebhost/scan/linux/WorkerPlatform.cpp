@@ -1,0 +1,23 @@
+#include "scan/WorkerPlatform.h"
+
+#include <csignal>
+
+#include <sys/prctl.h>
+#include <unistd.h>
+
+namespace zebhost::platform
+{
+
+std::string OwnProgram()
+{
+    return "/proc/self/exe";
+}
+
+bool DieWith(pid_t parent)
+{
+    prctl(PR_SET_PDEATHSIG, SIGKILL);
+    // It may have died before.
+    return getppid() == parent;
+}
+
+} // namespace zebhost::platform
