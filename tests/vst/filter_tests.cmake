@@ -7,3 +7,8 @@ set(ZEB_VST_FILTER_TESTS
     VSTHostCallbackTest.cpp
     VSTProcessingTest.cpp
     VSTTimeInfoTest.cpp)
+
+# Real plug-ins under the guard of the process thread.
+zeb_add_test(vst_process_path_test UP_TO zeb_vst
+    SOURCES VSTProcessPathTest.cpp LIBRARIES zeb_realtime_guard)
+zeb_use_vst2_fixtures(vst_process_path_test)
