@@ -2,7 +2,7 @@
 #include "cli/Failure.h"
 #include "filter/Quantity.h"
 
-#include <audiofilter/AudioFilterParameterInfo.h>
+#include <audiofilter/AudioFilter.h>
 #include <boost/smart_ptr/intrusive_ptr.hpp>
 #include <gmock/gmock.h>
 
@@ -166,6 +166,97 @@ TEST(ValueFinderTest, SaysSoWhenItCannot)
     EXPECT_THROW(Find(word, "no"), Failure);
     EXPECT_THROW(Find(range, "10.2"), Failure);
     EXPECT_NEAR(Find(liar, "0.5"), 0.5F, 0.01F);
+}
+
+// A filter of one parameter, whose plug-in only displays its current value.
+class CurrentTextFilter : public zebaudiofilterhost::AudioFilter
+{
+public:
+    class Info : public TestParameter
+    {
+    public:
+        Info(CurrentTextFilter& filter, int steps, float range)
+            : TestParameter({}, u"", steps), mFilter(filter), mRange(range)
+        {
+        }
+        bool SupportsStringForArbitraryValues() const override { return false; }
+        float FromNormalized(float normalised) const override { return normalised * mRange; }
+        zebaudiofilterhost::UTF16String GetParameterString(float) const override
+        {
+            const std::string text = mFilter.text(static_cast<double>(mFilter.value));
+            return {text.begin(), text.end()};
+        }
+
+    private:
+        CurrentTextFilter& mFilter;
+        float mRange;
+    };
+
+    explicit CurrentTextFilter(TextFunction display, int steps = 0, float range = 1)
+        : AudioFilter(u"id", u"name"), text(std::move(display)), info(new Info(*this, steps, range))
+    {
+    }
+
+    void SetParameter(int, float newValue) override
+    {
+        value = newValue;
+        ++changes;
+    }
+    float GetParameter(int) const override { return value; }
+
+    ValueFinder::Found Find(const std::string& wanted) { return ValueFinder(*this, 0, *info).Find(wanted); }
+
+    TextFunction text;
+    boost::intrusive_ptr<Info> info;
+    float value = 0.125F;
+    int changes = 0;
+};
+
+TEST(ValueFinderTest, PluginThatOnlyKnowsItsCurrentTextIsSetAndSetBack)
+{
+    const auto display = [](double value)
+    {
+        return value == 0 ? "off" : Decimal(value * 60 - 60, 2) + " dB";
+    };
+    const boost::intrusive_ptr<CurrentTextFilter> filter(new CurrentTextFilter(display));
+    EXPECT_NEAR(filter->Find("-6 dB").value, 0.9F, 1e-4F);
+    EXPECT_EQ(filter->value, 0.125F);
+    EXPECT_EQ(filter->Find("off").value, 0.0F);
+    EXPECT_THROW(filter->Find("10 dB"), Failure);
+    EXPECT_EQ(filter->value, 0.125F) << "also behind a failure";
+
+    filter->changes = 0;
+    EXPECT_EQ(ValueFinder(*filter, 0, *filter->info).Shown(0.125F), "-52.50 dB");
+    EXPECT_EQ(filter->changes, 0) << "the current text is there to be read";
+    filter->text = [](double)
+    {
+        return std::string();
+    };
+    EXPECT_EQ(ValueFinder(*filter, 0, *filter->info).Text(0.5F), "0.5") << "the number where there is no text";
+}
+
+TEST(ValueFinderTest, WidthOfAStepGivesTheNumberOfSteps)
+{
+    struct Case
+    {
+        int told;
+        float range;
+        int steps;
+    };
+    for (const Case& each : {Case{0, 10, 0}, Case{1, 1, 1}, Case{1, 10, 10}, Case{5, 10, 2}, Case{1, -10, 10},
+                             Case{4, 1, 4}, Case{1, 1e9F, 0}, Case{-1, 10, 0}})
+    {
+        const auto display = [&each](double value)
+        {
+            return Decimal(value * static_cast<double>(each.range), 0);
+        };
+        const boost::intrusive_ptr<CurrentTextFilter> filter(new CurrentTextFilter(display, each.told, each.range));
+        EXPECT_EQ(ValueFinder(*filter, 0, *filter->info).StepCount(), each.steps) << each.told << " " << each.range;
+    }
+    const boost::intrusive_ptr<CurrentTextFilter> tens(
+        new CurrentTextFilter([](double value) { return Decimal(value * 10, 0); }, 1, 10));
+    EXPECT_NEAR(tens->Find("7").value, 0.7F, 1e-6F);
+    EXPECT_THROW(tens->Find("11"), Failure);
 }
 
 } // namespace

@@ -35,7 +35,7 @@ std::vector<float> Values(const AudioFilter& filter)
     return values;
 }
 
-std::string Changes(const AudioFilter& filter, const std::vector<float>& before)
+std::string Changes(AudioFilter& filter, const std::vector<float>& before)
 {
     std::vector<std::string> changes;
     for (int index = 0; index < std::min(filter.GetParameterCount(), static_cast<int>(before.size())); ++index)
@@ -44,7 +44,7 @@ std::string Changes(const AudioFilter& filter, const std::vector<float>& before)
         if (info != nullptr && filter.GetParameter(index) != before[static_cast<std::size_t>(index)])
         {
             changes.push_back(ParameterName(filter, index) + " to " +
-                              ValueFinder(*info).Shown(filter.GetParameter(index)));
+                              ValueFinder(filter, index, *info).Shown(filter.GetParameter(index)));
         }
     }
     return Joined(changes, ", ");

@@ -18,26 +18,52 @@ namespace
 
 constexpr int kMostChoices = 256;
 
-Json ParameterJson(const AudioFilter& filter, int index, const AudioFilterParameterInfo& info)
+struct Entry
 {
-    const ValueFinder finder(info);
-    return Json{{"index", index + 1},
+    int index = 0;
+    boost::intrusive_ptr<AudioFilterParameterInfo> info;
+    float value = 0;
+    std::string text;
+    std::string shown;
+};
+
+// All that holds now, before anything is asked that may set a parameter.
+std::vector<Entry> Collect(AudioFilter& filter)
+{
+    std::vector<Entry> entries;
+    for (int index = 0; index < filter.GetParameterCount(); ++index)
+    {
+        if (const auto info = filter.GetParameterInfo(index))
+        {
+            const ValueFinder finder(filter, index, *info);
+            const float value = filter.GetParameter(index);
+            entries.push_back({index, info, value, finder.Text(value), finder.Shown(value)});
+        }
+    }
+    return entries;
+}
+
+Json ParameterJson(AudioFilter& filter, const Entry& entry)
+{
+    const AudioFilterParameterInfo& info = *entry.info;
+    const ValueFinder finder(filter, entry.index, info);
+    return Json{{"index", entry.index + 1},
                 {"name", Printable(info.GetName())},
                 {"unit", Printable(info.GetLabel())},
-                {"text", Printable(filter.GetParameterString(index))},
-                {"value", filter.GetParameter(index)},
-                {"steps", info.GetStepCount()},
+                {"text", entry.text},
+                {"value", entry.value},
+                {"steps", finder.StepCount()},
                 {"choices", finder.StepTexts(kMostChoices)},
                 {"automatable", info.CanBeAutomated()},
                 {"hidden", !info.IsExposed()}};
 }
 
-std::string Remarks(const AudioFilterParameterInfo& info)
+std::string Remarks(const AudioFilterParameterInfo& info, const ValueFinder& finder)
 {
     std::vector<std::string> remarks;
-    if (info.GetStepCount() > 0)
+    if (finder.StepCount() > 0)
     {
-        remarks.push_back(Counted(static_cast<std::size_t>(info.GetStepCount()) + 1, "choice"));
+        remarks.push_back(Counted(static_cast<std::size_t>(finder.StepCount()) + 1, "choice"));
     }
     if (!info.CanBeAutomated())
     {
@@ -46,35 +72,32 @@ std::string Remarks(const AudioFilterParameterInfo& info)
     return Joined(remarks, ", ");
 }
 
-std::string Range(const AudioFilterParameterInfo& info, bool withChoices)
+std::string Range(const ValueFinder& finder, bool withChoices)
 {
-    const ValueFinder finder(info);
     const std::vector<std::string> choices = finder.StepTexts(withChoices ? kMostChoices : 4);
-    if (!choices.empty() && (withChoices || static_cast<int>(choices.size()) == info.GetStepCount() + 1))
+    if (!choices.empty() && (withChoices || static_cast<int>(choices.size()) == finder.StepCount() + 1))
     {
         return Joined(choices, ", ");
     }
     return finder.Shown(0) + " to " + finder.Shown(1);
 }
 
-std::string Table(const CommandContext& context, const AudioFilter& filter, bool withChoices)
+std::string Table(const CommandContext& context, AudioFilter& filter, bool withChoices)
 {
     TextTable table({"#", "NAME", "VALUE", "NORMALISED", "RANGE", ""});
-    for (int index = 0; index < filter.GetParameterCount(); ++index)
+    for (const Entry& entry : Collect(filter))
     {
-        if (const auto info = filter.GetParameterInfo(index))
-        {
-            const float value = filter.GetParameter(index);
-            table.AddRow({std::to_string(index + 1), Printable(info->GetName()), ValueFinder(*info).Shown(value),
-                          FixedNumber(static_cast<double>(value), 6), Range(*info, withChoices), Remarks(*info)});
-        }
+        const ValueFinder finder(filter, entry.index, *entry.info);
+        table.AddRow({std::to_string(entry.index + 1), Printable(entry.info->GetName()), entry.shown,
+                      FixedNumber(static_cast<double>(entry.value), 6), Range(finder, withChoices),
+                      Remarks(*entry.info, finder)});
     }
     return table.IsEmpty() ? std::string() : table.Text(context.console.HasOutputColour());
 }
 
 } // namespace
 
-void PrintParameters(const CommandContext& context, const AudioFilter& filter, Json document, bool withChoices)
+void PrintParameters(const CommandContext& context, AudioFilter& filter, Json document, bool withChoices)
 {
     if (!context.WantsJson())
     {
@@ -82,12 +105,9 @@ void PrintParameters(const CommandContext& context, const AudioFilter& filter, J
         return;
     }
     document["parameters"] = Json::array();
-    for (int index = 0; index < filter.GetParameterCount(); ++index)
+    for (const Entry& entry : Collect(filter))
     {
-        if (const auto info = filter.GetParameterInfo(index))
-        {
-            document["parameters"].push_back(ParameterJson(filter, index, *info));
-        }
+        document["parameters"].push_back(ParameterJson(filter, entry));
     }
     context.Print(document);
 }

@@ -34,7 +34,7 @@ void SetByText(const CommandContext& context, AudioFilter& filter, const std::st
     {
         throw Failure(ExitCode::Usage, assignment + ": the plug-in does not describe this parameter; use --norm");
     }
-    const ValueFinder::Found found = ValueFinder(*info).Find(text);
+    const ValueFinder::Found found = ValueFinder(filter, index, *info).Find(text);
     if (!found.exact)
     {
         context.console.Remark("zebhost: the nearest to " + assignment + " is " + found.shown);

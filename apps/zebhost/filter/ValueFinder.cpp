@@ -35,6 +35,22 @@ ValueFinder::ValueFinder(const zebaudiofilterhost::AudioFilterParameterInfo& inf
 {
 }
 
+ValueFinder::ValueFinder(zebaudiofilterhost::AudioFilter& filter, int index,
+                         const zebaudiofilterhost::AudioFilterParameterInfo& info)
+    : ValueFinder(info)
+{
+    mFilter = info.SupportsStringForArbitraryValues() ? nullptr : &filter;
+    mIndex = index;
+}
+
+ValueFinder::~ValueFinder()
+{
+    if (mValueBefore)
+    {
+        mFilter->SetParameter(mIndex, *mValueBefore);
+    }
+}
+
 ValueFinder::Found ValueFinder::Find(const std::string& wanted) const
 {
     return StepCount() > 0 ? FindStep(wanted) : FindContinuous(wanted);
@@ -42,7 +58,19 @@ ValueFinder::Found ValueFinder::Find(const std::string& wanted) const
 
 std::string ValueFinder::Text(float value) const
 {
-    return Printable(mInfo.GetParameterString(value));
+    return mFilter == nullptr ? Printable(mInfo.GetParameterString(value)) : CurrentTextAt(value);
+}
+
+std::string ValueFinder::CurrentTextAt(float value) const
+{
+    const float current = mFilter->GetParameter(mIndex);
+    if (current != value)
+    {
+        mValueBefore = mValueBefore.value_or(current);
+        mFilter->SetParameter(mIndex, value);
+    }
+    const zebaudiofilterhost::UTF16String text = mInfo.GetParameterString(value);
+    return Printable(text.empty() ? mFilter->GetParameterString(mIndex) : text);
 }
 
 std::string ValueFinder::Shown(float value) const
@@ -64,8 +92,16 @@ std::vector<std::string> ValueFinder::StepTexts(int limit) const
 
 int ValueFinder::StepCount() const
 {
-    const int count = mInfo.GetStepCount();
-    return count < kMostSteps ? std::max(count, 0) : 0;
+    const int told = mInfo.GetStepCount();
+    if (told <= 0 || told >= kMostSteps)
+    {
+        return 0;
+    }
+    // Plug-ins that only know their current text tell the width of a step where others tell the number of steps.
+    const float range = std::abs(mInfo.FromNormalized(1) - mInfo.FromNormalized(0));
+    const bool isWidth = !mInfo.SupportsStringForArbitraryValues() && range > static_cast<float>(told);
+    const float count = isWidth ? std::round(range / static_cast<float>(told)) : static_cast<float>(told);
+    return count < kMostSteps ? static_cast<int>(count) : 0;
 }
 
 float ValueFinder::StepValue(int step) const

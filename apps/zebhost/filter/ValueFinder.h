@@ -1,7 +1,8 @@
 #pragma once
 
-#include <audiofilter/AudioFilterParameterInfo.h>
+#include <audiofilter/AudioFilter.h>
 
+#include <optional>
 #include <string>
 
 namespace zebhost
@@ -22,19 +23,32 @@ public:
 
     explicit ValueFinder(const zebaudiofilterhost::AudioFilterParameterInfo& info);
 
+    // `info` is that of the filter's parameter at `index`. A plug-in that only knows the text of the current value is
+    // set to other values for a moment, and back when this goes: no audio may run meanwhile.
+    ValueFinder(zebaudiofilterhost::AudioFilter& filter, int index,
+                const zebaudiofilterhost::AudioFilterParameterInfo& info);
+    ~ValueFinder();
+    ValueFinder(const ValueFinder&) = delete;
+    ValueFinder& operator=(const ValueFinder&) = delete;
+
     // Throws a usage Failure that tells what the parameter can be, if nothing fits.
     Found Find(const std::string& wanted) const;
 
-    // The text of a value, with the unit if the plug-in leaves it out.
+    // What the plug-in displays for a value.
+    std::string Text(float value) const;
+
+    // The same, with the unit if the plug-in leaves it out.
     std::string Shown(float value) const;
 
     // All texts of a stepped parameter, at most `limit`; empty for a continuous one.
     std::vector<std::string> StepTexts(int limit) const;
 
-private:
+    // 0 for a continuous parameter.
     int StepCount() const;
+
+private:
     float StepValue(int step) const;
-    std::string Text(float value) const;
+    std::string CurrentTextAt(float value) const;
     bool IsText(const std::string& text, const std::string& wanted) const;
 
     Found FindStep(const std::string& wanted) const;
@@ -46,6 +60,9 @@ private:
     [[noreturn]] void Refuse(const std::string& wanted, const std::string& possible) const;
 
     const zebaudiofilterhost::AudioFilterParameterInfo& mInfo;
+    zebaudiofilterhost::AudioFilter* mFilter = nullptr; // null if the info has all texts
+    int mIndex = 0;
+    mutable std::optional<float> mValueBefore; // of the filter's parameter, once it has been changed
     std::string mName;
     std::string mLabel;
 };

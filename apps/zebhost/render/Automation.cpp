@@ -41,7 +41,7 @@ std::int64_t FrameOf(const std::string& text, int sampleRate)
     return std::llround(inFrames ? *number : *number * sampleRate);
 }
 
-float ValueOf(const AudioFilter& filter, int parameter, const std::string& text)
+float ValueOf(AudioFilter& filter, int parameter, const std::string& text)
 {
     constexpr std::string_view kNormalised = "norm:";
     if (StartsWithIgnoringCase(text, kNormalised))
@@ -54,10 +54,10 @@ float ValueOf(const AudioFilter& filter, int parameter, const std::string& text)
         throw Failure(ExitCode::Usage,
                       "the plug-in does not describe this parameter; write norm: and a value from 0 to 1");
     }
-    return ValueFinder(*info).Find(text).value;
+    return ValueFinder(filter, parameter, *info).Find(text).value;
 }
 
-AutomationEvent ParseLine(const AudioFilter& filter, const std::string& line, int sampleRate)
+AutomationEvent ParseLine(AudioFilter& filter, const std::string& line, int sampleRate)
 {
     const std::vector<std::string> fields = SplitSeparatedLine(line);
     if (fields.size() != 3)
@@ -70,7 +70,7 @@ AutomationEvent ParseLine(const AudioFilter& filter, const std::string& line, in
 
 } // namespace
 
-std::vector<AutomationEvent> ReadAutomation(const std::string& path, const AudioFilter& filter, int sampleRate)
+std::vector<AutomationEvent> ReadAutomation(const std::string& path, AudioFilter& filter, int sampleRate)
 {
     std::ifstream stream(path, std::ios::binary);
     if (!stream)

@@ -74,6 +74,7 @@ struct SideChainPlace
     int channels = 0;
 };
 
+// Some plug-ins have no bus for it: their inputs go on behind those that belong to the outputs.
 SideChainPlace FindSideChain(const AudioFilter& filter)
 {
     SideChainPlace place;
@@ -85,6 +86,12 @@ SideChainPlace FindSideChain(const AudioFilter& filter)
             return place;
         }
         place.firstPluginChannel += place.channels;
+    }
+    const int outputs = filter.GetNumberOfOutputChannels();
+    const int beyond = filter.GetNumberOfInputChannels() - outputs;
+    if (filter.GetInputBuses().size() == 1 && beyond > 0 && filter.CanUseSideChaining())
+    {
+        return {outputs, beyond};
     }
     throw Failure(ExitCode::JobFailed, Printable(filter.GetDisplayName()) +
                                            " has no side-chain input: render without --side-chain, or choose another "
@@ -105,6 +112,16 @@ void Connect(ChannelMap& map, int pluginChannel, int slot)
 {
     map.SetChannelLayout(slot, {static_cast<AudioChannelLabel>(pluginChannel)});
     map.SetChannel(slot, slot);
+}
+
+void Disconnect(ChannelMap& map, int pluginChannel)
+{
+    const int slot = map.GetSourceChannelIndexForChannelLabel(static_cast<AudioChannelLabel>(pluginChannel));
+    if (slot >= 0)
+    {
+        map.SetChannelLayout(slot, {});
+        map.SetChannel(slot, -1);
+    }
 }
 
 // The plug-in's first bus on the row, in whichever way was asked for.
@@ -156,6 +173,7 @@ void ConnectSideChain(const AudioFilter& filter, Routing& routing)
         {
             routing.inputMap.AddChannel({}, -1);
         }
+        Disconnect(routing.inputMap, place.firstPluginChannel + channel);
         Connect(routing.inputMap, place.firstPluginChannel + channel, slot);
     }
 }
