@@ -8,6 +8,7 @@
 
 #include <array>
 #include <functional>
+#include <thread>
 #include <unistd.h>
 
 using namespace fakeplugin;
@@ -241,6 +242,38 @@ TEST_F(RunLoopOfHost, NonsenseIsRefused)
     EXPECT_EQ(ofContext->unregisterTimer(nullptr), kInvalidArgument);
     EXPECT_EQ(ofContext->unregisterEventHandler(&handler), kResultFalse);
     EXPECT_EQ(handler.references, 1U);
+}
+
+TEST_F(RunLoopOfHost, ForeignThreadsAreRefused)
+{
+    Pipe pipe;
+    EventHandler event;
+    TimerHandler timer;
+    TimerHandler stranger;
+    ASSERT_EQ(ofContext->registerEventHandler(&event, pipe.ReadEnd()), kResultOk);
+    ASSERT_EQ(ofContext->registerTimer(&timer, 1), kResultOk);
+    std::thread(
+        [&]
+        {
+            for (IRunLoop* const loop : {ofContext.Get(), ofFrame.Get()})
+            {
+                EXPECT_EQ(loop->registerEventHandler(&event, pipe.ReadEnd()), kResultFalse);
+                EXPECT_EQ(loop->registerTimer(&stranger, 1), kResultFalse);
+                EXPECT_EQ(loop->unregisterEventHandler(&event), kResultFalse);
+                EXPECT_EQ(loop->unregisterTimer(&timer), kResultFalse);
+                EXPECT_EQ(loop->registerTimer(nullptr, 1), kInvalidArgument);
+            }
+        })
+        .join();
+    EXPECT_EQ(event.references, 2U);
+    EXPECT_EQ(stranger.references, 1U);
+    pipe.Fill();
+    Pass(1);
+    EXPECT_EQ(event.calls, 1);
+    EXPECT_EQ(timer.calls, 1) << "what was registered before goes on";
+    EXPECT_EQ(stranger.calls, 0);
+    EXPECT_EQ(ofContext->unregisterEventHandler(&event), kResultOk);
+    EXPECT_EQ(ofContext->unregisterTimer(&timer), kResultOk);
 }
 
 TEST_F(RunLoopOfHost, ClosedViewKeepsOnlyWhatItHadBefore)

@@ -1,5 +1,7 @@
 #include "host/src/VST3/src/linux/RunLoop.h"
 
+#include "utility/ThreadUtils.h"
+
 #include <algorithm>
 #include <iterator>
 #include <limits>
@@ -112,7 +114,7 @@ tresult PLUGIN_API RunLoop::registerEventHandler(IEventHandler* handler, Steinbe
 {
     if (!handler || fd < 0)
         return kInvalidArgument;
-    if (mClosed)
+    if (mClosed || !CurrentThreadIDIsMainThreadID())
         return kResultFalse;
     const auto registration = std::make_shared<Registration>();
     registration->mNumber = mNextNumber;
@@ -133,6 +135,8 @@ tresult PLUGIN_API RunLoop::unregisterEventHandler(IEventHandler* handler)
 {
     if (!handler)
         return kInvalidArgument;
+    if (!CurrentThreadIDIsMainThreadID())
+        return kResultFalse;
     const bool found = Forget([handler](const Registration& entry) { return entry.mEventHandler.Get() == handler; });
     return found ? kResultOk : kResultFalse;
 }
@@ -141,7 +145,7 @@ tresult PLUGIN_API RunLoop::registerTimer(ITimerHandler* handler, Steinberg::Lin
 {
     if (!handler)
         return kInvalidArgument;
-    if (mClosed)
+    if (mClosed || !CurrentThreadIDIsMainThreadID())
         return kResultFalse;
     const auto registration = std::make_shared<Registration>();
     registration->mNumber = mNextNumber;
@@ -160,6 +164,8 @@ tresult PLUGIN_API RunLoop::unregisterTimer(ITimerHandler* handler)
 {
     if (!handler)
         return kInvalidArgument;
+    if (!CurrentThreadIDIsMainThreadID())
+        return kResultFalse;
     const bool found = Forget([handler](const Registration& entry) { return entry.mTimerHandler.Get() == handler; });
     return found ? kResultOk : kResultFalse;
 }

@@ -14,7 +14,8 @@ namespace zebaudiofilterhost::vst3
 
 /// The event loop that plug-ins get on Linux, served by the main-thread loop: descriptors wake their handlers when
 /// they are readable, in error or hung up, timers repeat. Any number of handlers may share a descriptor, and one
-/// handler may be there several times; a handler is kept alive while it is registered. Counted from 1. [main]
+/// handler may be there several times; a handler is kept alive while it is registered. A plug-in's other threads are
+/// refused with kResultFalse: registrations and the loop have no lock. Counted from 1, on any thread. [main]
 class RunLoop final : public Steinberg::Linux::IRunLoop
 {
 public:
