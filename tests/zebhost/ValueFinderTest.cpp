@@ -175,8 +175,8 @@ public:
     class Info : public TestParameter
     {
     public:
-        Info(CurrentTextFilter& filter, int steps, float range)
-            : TestParameter({}, u"", steps), mFilter(filter), mRange(range)
+        Info(CurrentTextFilter& filter, int steps, float range, const std::u16string& unit = u"")
+            : TestParameter({}, unit, steps), mFilter(filter), mRange(range)
         {
         }
         bool SupportsStringForArbitraryValues() const override { return false; }
@@ -257,6 +257,26 @@ TEST(ValueFinderTest, WidthOfAStepGivesTheNumberOfSteps)
         new CurrentTextFilter([](double value) { return Decimal(value * 10, 0); }, 1, 10));
     EXPECT_NEAR(tens->Find("7").value, 0.7F, 1e-6F);
     EXPECT_THROW(tens->Find("11"), Failure);
+}
+
+TEST(ValueFinderTest, LabelThatIsNoUnitIsALongName)
+{
+    struct Case
+    {
+        const char16_t* label;
+        const char* shown;
+        const char* longName;
+    };
+    for (const Case& each : {Case{u"dB", "1 dB", ""}, Case{u"Input gain", "1", "Input gain"}, Case{u"test", "1", ""}})
+    {
+        const boost::intrusive_ptr<CurrentTextFilter> filter(
+            new CurrentTextFilter([](double) { return std::string("1"); }));
+        filter->info = new CurrentTextFilter::Info(*filter, 0, 1, each.label);
+        const ValueFinder finder(*filter, 0, *filter->info);
+        EXPECT_EQ(finder.Shown(0), each.shown);
+        EXPECT_EQ(finder.LongName(), each.longName);
+    }
+    EXPECT_EQ(ValueFinder(*Make([](double) { return std::string("1"); }, u"semitones")).Shown(0), "1 semitones");
 }
 
 } // namespace

@@ -49,7 +49,7 @@ Json ParameterJson(AudioFilter& filter, const Entry& entry)
     const ValueFinder finder(filter, entry.index, info);
     return Json{{"index", entry.index + 1},
                 {"name", Printable(info.GetName())},
-                {"unit", Printable(info.GetLabel())},
+                {"unit", finder.Unit()},
                 {"text", entry.text},
                 {"value", entry.value},
                 {"steps", finder.StepCount()},
@@ -61,6 +61,10 @@ Json ParameterJson(AudioFilter& filter, const Entry& entry)
 std::string Remarks(const AudioFilterParameterInfo& info, const ValueFinder& finder)
 {
     std::vector<std::string> remarks;
+    if (!finder.LongName().empty())
+    {
+        remarks.push_back(finder.LongName());
+    }
     if (finder.StepCount() > 0)
     {
         remarks.push_back(Counted(static_cast<std::size_t>(finder.StepCount()) + 1, "choice"));

@@ -31,8 +31,14 @@ bool FitsUnit(const Quantity& shown, const Quantity& wanted)
 } // namespace
 
 ValueFinder::ValueFinder(const zebaudiofilterhost::AudioFilterParameterInfo& info)
-    : mInfo(info), mName(Printable(info.GetName())), mLabel(Printable(info.GetLabel()))
+    : mInfo(info), mName(Printable(info.GetName())), mUnit(Printable(info.GetLabel()))
 {
+    constexpr std::size_t kLongestUnit = 8;
+    if (!info.SupportsStringForArbitraryValues() && (mUnit.size() > kLongestUnit || EqualIgnoringCase(mUnit, mName)))
+    {
+        mLongName = EqualIgnoringCase(mUnit, mName) ? std::string() : mUnit;
+        mUnit.clear();
+    }
 }
 
 ValueFinder::ValueFinder(zebaudiofilterhost::AudioFilter& filter, int index,
@@ -76,8 +82,8 @@ std::string ValueFinder::CurrentTextAt(float value) const
 std::string ValueFinder::Shown(float value) const
 {
     const std::string text = Text(value);
-    const bool addLabel = !mLabel.empty() && !text.empty() && !ContainsIgnoringCase(text, mLabel);
-    return addLabel ? text + " " + mLabel : text;
+    const bool addUnit = !mUnit.empty() && !text.empty() && !ContainsIgnoringCase(text, mUnit);
+    return addUnit ? text + " " + mUnit : text;
 }
 
 std::vector<std::string> ValueFinder::StepTexts(int limit) const
@@ -111,8 +117,8 @@ float ValueFinder::StepValue(int step) const
 
 bool ValueFinder::IsText(const std::string& text, const std::string& wanted) const
 {
-    return EqualIgnoringCase(text, wanted) || EqualIgnoringCase(text + " " + mLabel, wanted) ||
-           EqualIgnoringCase(text + mLabel, wanted);
+    return EqualIgnoringCase(text, wanted) || EqualIgnoringCase(text + " " + mUnit, wanted) ||
+           EqualIgnoringCase(text + mUnit, wanted);
 }
 
 ValueFinder::Found ValueFinder::FindStep(const std::string& wanted) const
@@ -147,10 +153,10 @@ int ValueFinder::StepByText(const std::string& wanted) const
 
 int ValueFinder::StepByNumber(const std::string& wanted) const
 {
-    const std::optional<Quantity> number = ParseQuantity(wanted, mLabel);
+    const std::optional<Quantity> number = ParseQuantity(wanted, mUnit);
     for (int step = 0; number && step <= StepCount(); ++step)
     {
-        const std::optional<Quantity> shown = ParseQuantity(Text(StepValue(step)), mLabel);
+        const std::optional<Quantity> shown = ParseQuantity(Text(StepValue(step)), mUnit);
         if (shown && FitsUnit(*shown, *number) && std::abs(shown->value - number->value) <= 1e-9)
         {
             return step;
@@ -179,7 +185,7 @@ int ValueFinder::StepByBeginning(const std::string& wanted) const
 ValueFinder::Found ValueFinder::FindContinuous(const std::string& wanted) const
 {
     constexpr int kSamples = 1000;
-    const std::optional<Quantity> number = ParseQuantity(wanted, mLabel);
+    const std::optional<Quantity> number = ParseQuantity(wanted, mUnit);
     if (!number || std::isinf(number->value))
     {
         for (int sample = 0; sample <= kSamples; ++sample)
@@ -194,18 +200,18 @@ ValueFinder::Found ValueFinder::FindContinuous(const std::string& wanted) const
     }
     const std::optional<Quantity> typed = ParseQuantity(wanted, {});
     const float direct = mInfo.ToNormalized(static_cast<float>(typed->value));
-    const std::optional<Quantity> directShown = ParseQuantity(Text(direct), mLabel);
+    const std::optional<Quantity> directShown = ParseQuantity(Text(direct), mUnit);
     if (direct >= 0 && direct <= 1 && directShown && IsNumber(*directShown, *number))
     {
         return {direct, Shown(direct), true};
     }
-    const NumericRange range([this](double value) { return ParseQuantity(Text(static_cast<float>(value)), mLabel); });
+    const NumericRange range([this](double value) { return ParseQuantity(Text(static_cast<float>(value)), mUnit); });
     if (!range.IsMonotone())
     {
         Refuse(wanted, "what it displays cannot be searched for that; --norm takes a value from 0 to 1");
     }
     const auto located = static_cast<float>(range.Locate(number->value));
-    const std::optional<Quantity> shown = ParseQuantity(Text(located), mLabel);
+    const std::optional<Quantity> shown = ParseQuantity(Text(located), mUnit);
     const bool exact = shown && IsNumber(*shown, *number);
     if (!exact && (number->value < range.Lowest() || number->value > range.Highest()))
     {

@@ -46,6 +46,11 @@ public:
     // 0 for a continuous parameter.
     int StepCount() const;
 
+    // The unit of the parameter, and what else its label says of it; one of them is empty. Where plug-ins only know
+    // their current text, a label that is too long for a unit is the parameter's long name.
+    const std::string& Unit() const { return mUnit; }
+    const std::string& LongName() const { return mLongName; }
+
 private:
     float StepValue(int step) const;
     std::string CurrentTextAt(float value) const;
@@ -64,7 +69,8 @@ private:
     int mIndex = 0;
     mutable std::optional<float> mValueBefore; // of the filter's parameter, once it has been changed
     std::string mName;
-    std::string mLabel;
+    std::string mUnit;
+    std::string mLongName;
 };
 
 } // namespace zebhost
