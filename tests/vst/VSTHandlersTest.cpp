@@ -115,11 +115,3 @@ TEST_F(Handlers, MayChangeTheListFromInside)
     filter->RemoveAudioMasterHandler(&owners[0]);
     EXPECT_EQ(state.use_count(), 1) << "the removed handler was not freed";
 }
-
-TEST_F(Handlers, BelongToOneFilter)
-{
-    FakeEffect other;
-    const auto otherFilter = MakeFilter(other);
-    Add(0, 6);
-    EXPECT_EQ(other.CallHost(audioMasterIdle), 0);
-}

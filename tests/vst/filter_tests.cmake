@@ -12,3 +12,8 @@ set(ZEB_VST_FILTER_TESTS
 zeb_add_test(vst_process_path_test UP_TO zeb_vst
     SOURCES VSTProcessPathTest.cpp LIBRARIES zeb_realtime_guard)
 zeb_use_vst2_fixtures(vst_process_path_test)
+
+# The fixtures' binaries as filters.
+zeb_add_test(vst_filter_fixtures_test UP_TO zeb_vst
+    SOURCES VSTFilterFixturesTest.cpp)
+zeb_use_vst2_fixtures(vst_filter_fixtures_test)
