@@ -4,13 +4,13 @@
 #include "host/BannedPluginManager.h"
 #include "host/VST3/VST3Technology.h"
 #include "host/src/VST3/src/VST3Places.h"
+#include "tests/support/VariableGuard.h"
 
 #include <gtest/gtest.h>
 
 #include <cstdlib>
 #include <filesystem>
 #include <fstream>
-#include <optional>
 #include <string>
 #include <vector>
 
@@ -22,30 +22,7 @@ namespace
 
 namespace fs = std::filesystem;
 
-// An environment variable that comes back as it was.
-class VariableGuard
-{
-public:
-    VariableGuard(const char* name, const std::string& value) : mName(name)
-    {
-        if (const char* old = std::getenv(name))
-            mOld = old;
-        setenv(name, value.c_str(), 1);
-    }
-    ~VariableGuard()
-    {
-        if (mOld)
-            setenv(mName, mOld->c_str(), 1);
-        else
-            unsetenv(mName);
-    }
-    VariableGuard(const VariableGuard&) = delete;
-    VariableGuard& operator=(const VariableGuard&) = delete;
-
-private:
-    const char* mName;
-    std::optional<std::string> mOld;
-};
+using zebtest::VariableGuard;
 
 class VST3PluginSearchTest : public testing::Test
 {

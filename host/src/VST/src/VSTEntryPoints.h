@@ -1,11 +1,15 @@
 #pragma once
 
-#include <array>
+#include <span>
 
 namespace zebaudiofilterhost::vst
 {
 
-/// The names of the function that makes a plug-in; the first that a binary exports counts.
-inline constexpr std::array<const char*, 2> kEntryPoints = {"VSTPluginMain", "main_macho"};
+/// The names of the function that makes a plug-in, as this system's binaries export it; the first that is there
+/// counts. [any]
+std::span<const char* const> GetVSTEntryPoints();
+
+inline constexpr const char16_t* kNoEntryPoint =
+    u" is not a VST 2 plug-in: it exports no entry point such as VSTPluginMain.";
 
 } // namespace zebaudiofilterhost::vst

@@ -46,7 +46,7 @@ bool VSTPluginModule::Load()
     if (FindEntryPoint())
         return true;
     PluginModule::Unload();
-    SetProblem(u" is not a VST 2 plug-in: it exports neither VSTPluginMain nor main_macho.");
+    SetProblem(kNoEntryPoint);
     return false;
 }
 
@@ -57,7 +57,7 @@ void VSTPluginModule::SetProblem(const UTF16String& ending) const
 
 bool VSTPluginModule::FindEntryPoint()
 {
-    for (const char* name : kEntryPoints)
+    for (const char* name : GetVSTEntryPoints())
     {
         const auto entryPoint = reinterpret_cast<VSTPluginMainProc>(
             zebcore::utility::GetFunctionPointerFromModuleImpl(GetOSModule(), name));

@@ -36,9 +36,10 @@ const char16_t* FindFileProblem(const fs::path& path)
         return u" is not a shared library.";
     if (exports.GetKind() == ElfKind::kOtherMachine)
         return u" is a binary for another kind of machine.";
-    const bool hasEntry = std::any_of(kEntryPoints.begin(), kEntryPoints.end(),
-                                      [&exports](const char* name) { return exports.HasFunction(name); });
-    return hasEntry ? nullptr : u" is not a VST 2 plug-in: it exports neither VSTPluginMain nor main_macho.";
+    const std::span<const char* const> names = GetVSTEntryPoints();
+    const bool hasEntry =
+        std::any_of(names.begin(), names.end(), [&exports](const char* name) { return exports.HasFunction(name); });
+    return hasEntry ? nullptr : kNoEntryPoint;
 }
 
 bool IsPlugin(const fs::path& path)
