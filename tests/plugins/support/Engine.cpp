@@ -52,6 +52,17 @@ void RecordBlock(const ProcessData& data)
            "points=" + (points.empty() ? "-" : points));
 }
 
+// For tests in which nothing may be recorded.
+void CountPoints(const ProcessData& data)
+{
+    VisitPoints(data,
+                [](ParamID id, int32, ParamValue)
+                {
+                    Set(Knob::kPointSeenLast, id);
+                    Set(Knob::kPointsSeen, Get(Knob::kPointsSeen) + 1);
+                });
+}
+
 void RecordContext(const ProcessData& data)
 {
     if (!IsOn(Knob::kRecordContext))
@@ -113,6 +124,7 @@ void WriteEvents(ProcessData& data)
 tresult Engine::Process(ProcessData& data)
 {
     RecordBlock(data);
+    CountPoints(data);
     RecordContext(data);
     CallHost();
     if (GetInt(Knob::kProcessThrows) == 1)

@@ -49,6 +49,8 @@ constexpr Row kRows[] = {
     {Knob::kThreadEdits, "threadEdits", 0},
     {Knob::kThreadRestarts, "threadRestarts", 0},
     {Knob::kRecordContext, "recordContext", 0},
+    {Knob::kPointsSeen, "pointsSeen", 0},
+    {Knob::kPointSeenLast, "pointSeenLast", 0},
     {Knob::kControllerInitializeResult, "controllerInitializeResult", 0},
     {Knob::kParameterCount, "parameterCount", kReal},
     {Knob::kParameterInfoResult, "parameterInfoResult", 0},

@@ -47,6 +47,8 @@ enum class Knob
     kThreadEdits,      // 1: while processing, a thread of the plug-in's own calls performEdit
     kThreadRestarts,   // flags of restartComponent calls by such a thread, 0 for none
     kRecordContext,    // 1: records the process context with every block
+    kPointsSeen,       // counts the points that process has got, without recording them
+    kPointSeenLast,    // ID of the newest of them
                        // controller
     kControllerInitializeResult,
     kParameterCount, // what getParameterCount says; kReal
