@@ -1,0 +1,132 @@
+#include "host/src/XAU/linux/src/ComponentBundle.h"
+
+#include "foundation/zebcore/File.h"
+#include "foundation/zebcore/FileExceptions.h"
+#include "foundation/zebcore/FileUtils.h"
+#include "host/src/XAU/linux/src/CFStringObject.h"
+#include "host/src/linux/SearchPath.h"
+
+#include <algorithm>
+#include <memory>
+#include <optional>
+#include <set>
+
+namespace zebaudiofilterhost::xau
+{
+
+namespace
+{
+
+struct ReleaseObject
+{
+    void operator()(const void* object) const { CFRelease(object); }
+};
+
+using ObjectPtr = std::unique_ptr<const void, ReleaseObject>;
+
+constexpr std::u16string_view kBundleExtension = u".component";
+
+ObjectPtr ReadInfo(const UTF16String& bundle)
+{
+    UTF8String text;
+    try
+    {
+        text = zebcore::utility::FileUtils::SimpleReadStringFromFile(bundle + u"/Contents/Info.plist");
+    }
+    catch (const zebcore::filesupport::file_exception&)
+    {
+        return nullptr;
+    }
+    const ObjectPtr data(
+        CFDataCreate(nullptr, reinterpret_cast<const UInt8*>(text.data()), static_cast<CFIndex>(text.size())));
+    const auto* bytes = static_cast<CFDataRef>(data.get());
+    return ObjectPtr(CFPropertyListCreateWithData(nullptr, bytes, kCFPropertyListImmutable, nullptr, nullptr));
+}
+
+/// Null unless there is a value of that type.
+template <typename T>
+const T* Find(const CFOpaqueDictionary& dictionary, const char* key, CFTypeID type)
+{
+    const ObjectPtr name(CFStringCreateWithCString(nullptr, key, kCFStringEncodingUTF8));
+    const void* value = CFDictionaryGetValue(&dictionary, name.get());
+    return value && CFGetTypeID(value) == type ? static_cast<const T*>(value) : nullptr;
+}
+
+std::optional<OSType> FindCode(const CFOpaqueDictionary& dictionary, const char* key)
+{
+    constexpr std::size_t kCodeLength = 4;
+    constexpr unsigned int kByte = 8;
+    const CFStringRef text = Find<CFOpaqueString>(dictionary, key, CFStringGetTypeID());
+    std::string bytes;
+    if (!text || !cf::Encode(text->mText, kCFStringEncodingISOLatin1, bytes) || bytes.size() != kCodeLength)
+        return std::nullopt;
+    OSType code = 0;
+    for (const char byte : bytes)
+        code = (code << kByte) | static_cast<unsigned char>(byte);
+    return code;
+}
+
+std::optional<ComponentListing> ReadListing(const CFOpaqueDictionary& entry, const UTF16String& bundle)
+{
+    const auto type = FindCode(entry, "type");
+    const auto subType = FindCode(entry, "subtype");
+    const auto manufacturer = FindCode(entry, "manufacturer");
+    const CFStringRef name = Find<CFOpaqueString>(entry, "name", CFStringGetTypeID());
+    const CFStringRef factory = Find<CFOpaqueString>(entry, "factoryFunction", CFStringGetTypeID());
+    if (!type || !subType || !manufacturer || !name || !factory || factory->mText.empty())
+        return std::nullopt;
+    UInt32 version = 0;
+    if (const CFNumberRef number = Find<CFOpaqueNumber>(entry, "version", CFNumberGetTypeID()))
+        CFNumberGetValue(number, kCFNumberSInt32Type, &version);
+    return ComponentListing{
+        {*type, *subType, *manufacturer, 0, 0}, name->mText, version, bundle, cf::ToUTF8(factory)};
+}
+
+void WalkForBundles(const Dir& folder, std::set<UTF16String>& walked, std::vector<UTF16String>& bundles)
+{
+    if (!walked.insert(folder.FullPath()).second)
+        return;
+    const auto end = folder.EndSubdirs();
+    for (auto item = folder.BeginSubdirs(false, nullptr, nullptr); item != end; ++item)
+    {
+        const Dir subFolder = *item;
+        if (subFolder.FullPath().ends_with(kBundleExtension))
+            bundles.push_back(subFolder.FullPath());
+        else
+            WalkForBundles(subFolder, walked, bundles);
+    }
+}
+
+} // namespace
+
+std::vector<ComponentListing> ReadComponentBundle(const UTF16String& path)
+{
+    const ObjectPtr info = ReadInfo(path);
+    std::vector<ComponentListing> listings;
+    if (!info || CFGetTypeID(info.get()) != CFDictionaryGetTypeID())
+        return listings;
+    const auto* components =
+        Find<CFOpaqueArray>(*static_cast<CFDictionaryRef>(info.get()), "AudioComponents", CFArrayGetTypeID());
+    for (CFIndex index = 0; components && index < CFArrayGetCount(components); ++index)
+    {
+        const void* entry = CFArrayGetValueAtIndex(components, index);
+        if (CFGetTypeID(entry) != CFDictionaryGetTypeID())
+            continue;
+        if (auto listing = ReadListing(*static_cast<CFDictionaryRef>(entry), path))
+            listings.push_back(std::move(*listing));
+    }
+    return listings;
+}
+
+std::vector<UTF16String> FindComponentBundles()
+{
+    std::vector<UTF16String> bundles;
+    std::set<UTF16String> walked;
+    const auto folders =
+        GetSearchPath("AUDIO_COMPONENT_PATH", {"~/.components", "/usr/local/lib/components", "/usr/lib/components"});
+    for (const Dir& folder : folders)
+        WalkForBundles(folder, walked, bundles);
+    return bundles;
+}
+
+} // namespace zebaudiofilterhost::xau

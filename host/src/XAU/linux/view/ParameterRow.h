@@ -1,0 +1,74 @@
+#pragma once
+
+#include "foundation/zebcore/StringTypes.h"
+
+#include <AudioToolbox/AudioToolbox.h>
+
+#include <string>
+#include <vector>
+
+namespace zebaudiofilterhost::xau
+{
+
+/// A parameter of a unit as a view shows it: a name, a control that fits it, its value as text. [main]
+class ParameterRow
+{
+public:
+    enum class Control
+    {
+        Slider,
+        Steps, // one of a few values, named by the unit
+        Switch
+    };
+
+    ParameterRow(AudioUnit unit, AudioUnitScope scope, AudioUnitParameterID id);
+
+    const std::string& GetName() const { return mName; }
+    Control GetControl() const { return mControl; }
+    bool IsWritable() const { return mIsWritable; }
+    /// Names of the steps; their number where the unit has no names.
+    const std::vector<std::string>& GetStepNames() const { return mStepNames; }
+
+    /// The unit's present value, from 0 to 1 of the range.
+    double GetPosition() const { return mPosition; }
+    /// The step of the present value, from 0.
+    std::size_t GetStep() const;
+    /// The unit's text for the present value, with the unit of measure.
+    const std::string& GetText() const { return mText; }
+
+    /// Reads value and text. Returns whether something has changed.
+    bool Refresh();
+
+    /// Sets the unit's value, rounded to a step where there are any, and tells listeners.
+    void SetPosition(double position);
+    /// To the value that the unit calls its own.
+    void SetDefault();
+    void Notify(AudioUnitEventType gesture) const;
+
+    AudioUnitParameter GetParameter() const { return {mUnit, mID, mScope, 0}; }
+
+private:
+    void ReadInfo(AudioUnitParameterInfo& info) const;
+    void ReadSteps();
+    std::string ReadText(AudioUnitParameterValue value) const;
+    void SetValue(double value);
+
+    AudioUnit mUnit;
+    AudioUnitScope mScope;
+    AudioUnitParameterID mID;
+    std::string mName;
+    std::string mLabel;
+    Control mControl = Control::Slider;
+    std::vector<std::string> mStepNames;
+    bool mIsWritable = true;
+    double mMinimum = 0.0;
+    double mMaximum = 1.0;
+    double mDefault = 0.0;
+    double mPosition = 0.0;
+    std::string mText;
+};
+
+/// The rows of all parameters that are global and meant to be shown, in the unit's order. [main]
+std::vector<ParameterRow> ReadParameterRows(AudioUnit unit);
+
+} // namespace zebaudiofilterhost::xau

@@ -1,0 +1,150 @@
+#include "host/src/XAU/src/XAUParameterInfo.h"
+
+#include "foundation/zebcore/StringStreams.h"
+#include "host/src/XAU/src/CFOwner.h"
+
+#include <algorithm>
+#include <array>
+#include <cmath>
+#include <limits>
+#include <map>
+
+namespace zebaudiofilterhost::xau
+{
+
+namespace
+{
+
+// Labels of the units that have one. The rate, for instance, has none.
+const UTF16String& LabelOf(AudioUnitParameterUnit unit)
+{
+    static const std::map<AudioUnitParameterUnit, UTF16String> sUnitMap = {
+        {kAudioUnitParameterUnit_Percent, u"%"},
+        {kAudioUnitParameterUnit_Seconds, u"s"},
+        {kAudioUnitParameterUnit_SampleFrames, u"Samples"},
+        {kAudioUnitParameterUnit_Phase, u"o"},
+        {kAudioUnitParameterUnit_Hertz, u"Hz"},
+        {kAudioUnitParameterUnit_Cents, u"Cents"},
+        {kAudioUnitParameterUnit_RelativeSemiTones, u"S-T"},
+        {kAudioUnitParameterUnit_Decibels, u"dB"},
+        {kAudioUnitParameterUnit_Degrees, u"o"},
+        {kAudioUnitParameterUnit_Meters, u"m"},
+        {kAudioUnitParameterUnit_AbsoluteCents, u"Cents"},
+        {kAudioUnitParameterUnit_Octaves, u"Oct"},
+        {kAudioUnitParameterUnit_BPM, u"BPM"},
+        {kAudioUnitParameterUnit_Milliseconds, u"ms"},
+    };
+    static const UTF16String sNone;
+    const auto found = sUnitMap.find(unit);
+    return found == sUnitMap.end() ? sNone : found->second;
+}
+
+// The 8-bit name of a unit that has no other: ASCII, and not always with a zero at its end.
+UTF16String FromAscii(const char* text, std::size_t size)
+{
+    constexpr unsigned char kFirstNonAscii = 0x80;
+    UTF16String units;
+    for (std::size_t index = 0; index < size && text[index] != '\0'; ++index)
+    {
+        const auto byte = static_cast<unsigned char>(text[index]);
+        units.push_back(byte < kFirstNonAscii ? static_cast<char16_t>(byte) : u'?');
+    }
+    return units;
+}
+
+int CountSteps(float minimum, float maximum)
+{
+    const float range = std::trunc(maximum - minimum);
+    constexpr auto kMost = static_cast<float>(std::numeric_limits<std::int16_t>::max());
+    return std::isnan(range) ? 0 : static_cast<int>(std::clamp(range, -kMost, kMost));
+}
+
+} // namespace
+
+XAUParameterInfo::XAUParameterInfo(AudioUnit instance, AudioUnitScope scope, AudioUnitParameterID id)
+    : mInstance(instance), mScope(scope), mParameterID(id)
+{
+    ReadInfo();
+    SetExposed((mFlags & kAudioUnitParameterFlag_NonRealTime) == 0); // what can't be automated is not shown
+}
+
+void XAUParameterInfo::ReadInfo()
+{
+    AudioUnitParameterInfo info = {};
+    UInt32 size = sizeof(info);
+    if (AudioUnitGetProperty(mInstance, kAudioUnitProperty_ParameterInfo, mScope, mParameterID, &info, &size) !=
+        noErr)
+        return;
+    mMinimum = info.minValue;
+    mMaximum = info.maxValue;
+    ReadTexts(info);
+    mCanRamp = (info.flags & kAudioUnitParameterFlag_CanRamp) != 0;
+    if (info.unit == kAudioUnitParameterUnit_Indexed)
+        mStepCount = CountSteps(mMinimum, mMaximum);
+    else if (info.unit == kAudioUnitParameterUnit_Boolean)
+        mStepCount = 1;
+    mFlags = info.flags;
+}
+
+// Strings that the unit has made for the reader alone are released here.
+void XAUParameterInfo::ReadTexts(const AudioUnitParameterInfo& info)
+{
+    const bool releases = (info.flags & kAudioUnitParameterFlag_CFNameRelease) != 0;
+    const bool hasName = (info.flags & kAudioUnitParameterFlag_HasCFNameString) != 0;
+    const bool hasUnitName = info.unit == kAudioUnitParameterUnit_CustomUnit;
+    const CFOwner name(releases && hasName ? info.cfNameString : nullptr);
+    const CFOwner unitName(releases && hasUnitName ? info.unitName : nullptr);
+    SetName(hasName ? MACtoZEB(info.cfNameString) : FromAscii(std::data(info.name), std::size(info.name)));
+    SetLabel(hasUnitName ? MACtoZEB(info.unitName) : LabelOf(info.unit));
+}
+
+float XAUParameterInfo::GetRange() const
+{
+    const float range = mMaximum - mMinimum;
+    return range > 0.0F ? range : 1.0F;
+}
+
+float XAUParameterInfo::ToNormalized(float value) const
+{
+    return (value - mMinimum) / GetRange();
+}
+
+float XAUParameterInfo::FromNormalized(float normalized) const
+{
+    return GetRange() * normalized + mMinimum;
+}
+
+bool XAUParameterInfo::CanRamp() const
+{
+    return mCanRamp;
+}
+
+bool XAUParameterInfo::CanBeAutomated() const
+{
+    return (mFlags & kAudioUnitParameterFlag_NonRealTime) == 0;
+}
+
+int XAUParameterInfo::GetStepCount() const
+{
+    return mStepCount;
+}
+
+// The unit's text is deliberately not released: units differ in whether they keep it, and one that does would be left
+// with a dead string.
+UTF16String XAUParameterInfo::GetParameterString(float normalized) const
+{
+    const AudioUnitParameterValue value = FromNormalized(normalized);
+    AudioUnitParameterStringFromValue text = {};
+    text.inParamID = mParameterID;
+    text.inValue = &value;
+    UInt32 size = sizeof(text);
+    const OSStatus result =
+        AudioUnitGetProperty(mInstance, kAudioUnitProperty_ParameterStringFromValue, mScope, 0, &text, &size);
+    if (result == noErr)
+        return MACtoZEB(text.outString);
+    zebcore::utility::oUTF16StringStream stream;
+    stream << value;
+    return stream.str();
+}
+
+} // namespace zebaudiofilterhost::xau
