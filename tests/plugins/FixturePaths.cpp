@@ -85,7 +85,11 @@ std::filesystem::path BinaryOf(const std::filesystem::path& bundle)
 {
     if (!std::filesystem::is_directory(bundle))
         return bundle;
-    return bundle / "Contents" / ZEB_BINARY_FOLDER / (bundle.stem().string() + ".so");
+    const std::string title = bundle.stem().string();
+    for (const std::string& name : {title + ".so", title + "-vst.so"})
+        if (std::filesystem::exists(bundle / name))
+            return bundle / name;
+    return bundle / "Contents" / ZEB_BINARY_FOLDER / (title + ".so");
 }
 
 } // namespace zebtest

@@ -28,7 +28,7 @@ std::filesystem::path VST2Fixture(std::string_view name);
 std::filesystem::path VST2Hazard(std::string_view name);
 std::filesystem::path VST2Effect(std::string_view name);
 
-// The binary inside a bundle; a plain file is its own.
+// The binary inside a bundle, also of the older forms that VST 2 has; a plain file is its own.
 std::filesystem::path BinaryOf(const std::filesystem::path& bundle);
 
 } // namespace zebtest

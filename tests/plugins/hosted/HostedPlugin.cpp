@@ -2,6 +2,7 @@
 
 #include "foundation/zebcore/NativePath.h"
 #include "host/AudioFilterDescriptorManager.h"
+#include "host/PluginModuleInfoManager.h"
 #include "host/PluginModuleScanner.h"
 #include "utility/EffectUtils.h"
 
@@ -14,7 +15,9 @@ using namespace zebaudiofilterhost;
 
 std::vector<DescriptorPtr> Scan(const std::filesystem::path& bundle)
 {
-    const PluginLocator locator(kTechnologyVST3, zebcore::filesupport::FromNativePath(bundle.string()));
+    const TechnologyType technology = bundle.extension() == ".vst3" ? kTechnologyVST3 : kTechnologyVST;
+    const PluginLocator locator(technology, zebcore::filesupport::FromNativePath(bundle.string()));
+    PluginModuleInfoManager::GetInstance().RemovePluginLocators({locator}); // what an earlier scan found
     const boost::intrusive_ptr<PluginModuleScanner> scanner(new PluginModuleScanner({locator}, false));
     scanner->BeginScan();
     while (scanner->ContinueScan())

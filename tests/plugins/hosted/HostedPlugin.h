@@ -14,7 +14,7 @@ namespace zebtest
 using FilterPtr = boost::intrusive_ptr<zebaudiofilterhost::AudioFilter>;
 using DescriptorPtr = boost::intrusive_ptr<zebaudiofilterhost::AudioFilterDescriptor>;
 
-// Scans one bundle as an application does. What it holds, in its order.
+// Scans one bundle, or one VST 2 file, as an application does. What it holds, in its order.
 std::vector<DescriptorPtr> Scan(const std::filesystem::path& bundle);
 
 // The filter of the bundle's first descriptor, made through the catalogue; null if there is none.

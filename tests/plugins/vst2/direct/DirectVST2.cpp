@@ -17,9 +17,7 @@ std::int32_t sWantedMember = 0;
 
 VSTPluginMainProc EntryOf(const std::filesystem::path& path)
 {
-    const std::filesystem::path binary = path.stem() == "Suffixed" ? path / "Suffixed-vst.so"
-                                         : path.stem() == "Flat"   ? path / "Flat.so"
-                                                                   : BinaryOf(path);
+    const std::filesystem::path binary = BinaryOf(path);
     void* handle = dlopen(binary.c_str(), RTLD_LAZY | RTLD_LOCAL);
     if (handle == nullptr)
         throw std::runtime_error(dlerror());
