@@ -38,7 +38,7 @@ using ::testing::Each;
 constexpr std::size_t kBlocks = 96;
 constexpr std::size_t kSilentFrom = 64;    // the input's last third
 constexpr unsigned long long kFront = 0x3; // L and R
-const std::vector<std::u16string> kNames = {u"Zeb Gain", u"Zeb Delay", u"Zeb Compressor"};
+const std::vector<std::u16string> kNames = {u"Zeb Gain", u"Zeb Delay", u"Zeb Compressor", u"ZebGain2"};
 
 Channels Noise()
 {
@@ -102,7 +102,7 @@ Channels ReadSound(const fs::path& file)
     return sound;
 }
 
-// A machine of the test's own, with three plug-ins, on which an application is started again and again.
+// A machine of the test's own, with four plug-ins, on which an application is started again and again.
 class ChainTest : public ::testing::Test
 {
 protected:
@@ -111,9 +111,10 @@ protected:
         std::string pattern = (fs::temp_directory_path() / "zeb-chain-XXXXXX").string();
         mFolder = mkdtemp(pattern.data());
         fs::create_directories(mFolder / "plug-ins");
-        for (const char* const name : {"ZebGain", "ZebDelay", "ZebCompressor"})
+        const fs::path vst2 = zebtest::EffectFolder().parent_path() / "vst2";
+        for (const fs::path& bundle : {zebtest::EffectBundle("ZebGain"), zebtest::EffectBundle("ZebDelay"),
+                                       zebtest::EffectBundle("ZebCompressor"), vst2 / "ZebGain2.vst"})
         {
-            const fs::path bundle = zebtest::EffectBundle(name);
             fs::copy(bundle, mFolder / "plug-ins" / bundle.filename(), fs::copy_options::recursive);
         }
         for (const char* const variable : {"VST3_PATH", "VST_PATH"})
@@ -157,8 +158,21 @@ protected:
         scanner->EndScan();
     }
 
-    void RemoveDelay() const { fs::rename(mFolder / "plug-ins" / "ZebDelay.vst3", mFolder / "ZebDelay.vst3"); }
-    void BringDelayBack() const { fs::rename(mFolder / "ZebDelay.vst3", mFolder / "plug-ins" / "ZebDelay.vst3"); }
+    // One of each technology.
+    void RemovePlugins() const
+    {
+        for (const char* const name : {"ZebDelay.vst3", "ZebGain2.vst"})
+        {
+            fs::rename(mFolder / "plug-ins" / name, mFolder / name);
+        }
+    }
+    void BringThemBack() const
+    {
+        for (const char* const name : {"ZebDelay.vst3", "ZebGain2.vst"})
+        {
+            fs::rename(mFolder / name, mFolder / "plug-ins" / name);
+        }
+    }
 
     fs::path Path(const char* name) const { return mFolder / name; }
 
@@ -166,12 +180,13 @@ protected:
     static EffectChain SetUpChain(float feedback = 0.5F)
     {
         EffectChain chain(kNames);
-        const std::vector<std::vector<float>> values = {{0.7F}, {0.05F, feedback, 0.6F, 0.25F}, {0.3F, 0.8F, 0.1F}};
+        const std::vector<std::vector<float>> values = {
+            {0.7F}, {0.05F, feedback, 0.6F, 0.25F}, {0.3F, 0.8F, 0.1F}, {0.6F}};
         for (std::size_t index = 0; index < chain.Count(); ++index)
         {
             AudioFilter& filter = *chain[index];
             FitIn(filter);
-            // The last effect is on the surround channels; the other channels pass it by.
+            // The compressor is on the surround channels; the other channels pass it by.
             const int first = index == 2 ? 4 : 0;
             for (const auto direction : {AudioFilter::kDirection_Input, AudioFilter::kDirection_Output})
             {
@@ -225,7 +240,7 @@ TEST_F(ChainTest, SoundsAsBeforeWhenAMissingPluginIsBack)
         [this]
         {
             EffectChain chain = SetUpChain();
-            ASSERT_TRUE(chain[0] && chain[1] && chain[2]);
+            EXPECT_TRUE(chain[1]->DoPresetsUseChunkData() && !chain[3]->DoPresetsUseChunkData());
             const Rendered before = chain.Render(Noise());
             EXPECT_FALSE(IsSilent(before.sound[0]));
             EXPECT_FALSE(IsSameSound(before.sound, SetUpChain(0.9F).Render(Noise()).sound)) << "settings are heard";
@@ -233,13 +248,15 @@ TEST_F(ChainTest, SoundsAsBeforeWhenAMissingPluginIsBack)
             chain.Save(Path("chain.xml"));
         });
 
-    RemoveDelay();
+    RemovePlugins();
     Start(
         [this]
         {
             EffectChain chain = EffectChain::Load(Path("chain.xml"));
-            ASSERT_EQ(chain.Count(), 3U);
+            ASSERT_EQ(chain.Count(), 4U);
             EXPECT_FALSE(chain[0]->IsProxy() || chain[2]->IsProxy());
+            EXPECT_TRUE(chain[3]->IsProxy());
+            EXPECT_FALSE(chain[3]->DoPresetsUseChunkData());
             const auto proxy = boost::dynamic_pointer_cast<AudioFilterProxy>(chain[1]);
             ASSERT_TRUE(proxy);
             EXPECT_FALSE(proxy->CreateAudioFilterFromZombieState());
@@ -250,6 +267,7 @@ TEST_F(ChainTest, SoundsAsBeforeWhenAMissingPluginIsBack)
             const Rendered rendered = chain.Render(input);
             // Nothing comes out of the proxy's channels, and what passes it by has no latency to wait for.
             EXPECT_THAT(rendered.silent[1], Each(kFront));
+            EXPECT_THAT(rendered.silent[3], Each(kFront));
             EXPECT_TRUE(IsSilent(rendered.sound[0]) && IsSilent(rendered.sound[1]));
             for (const std::size_t channel : {2U, 3U})
             {
@@ -264,13 +282,13 @@ TEST_F(ChainTest, SoundsAsBeforeWhenAMissingPluginIsBack)
         });
     EXPECT_EQ(Read(Path("saved with the proxy.xml")), Read(Path("chain.xml")));
 
-    BringDelayBack();
+    BringThemBack();
     Start(
         [this]
         {
             EffectChain chain = EffectChain::Load(Path("saved with the proxy.xml"));
-            ASSERT_EQ(chain.Count(), 3U);
-            EXPECT_FALSE(chain[1]->IsProxy());
+            ASSERT_EQ(chain.Count(), 4U);
+            EXPECT_FALSE(chain[1]->IsProxy() || chain[3]->IsProxy());
             EXPECT_TRUE(IsSameSound(chain.Render(Noise()).sound, ReadSound(Path("before"))));
             chain.Save(Path("saved with the plug-in.xml"));
         });
@@ -286,19 +304,19 @@ TEST_F(ChainTest, ProxyWakesWhenThePluginComesBackWhileTheApplicationRuns)
             WriteSound(Path("before"), chain.Render(Noise()).sound);
             chain.Save(Path("chain.xml"));
         });
-    RemoveDelay();
+    RemovePlugins();
     Start(
         [this]
         {
             EffectChain chain = EffectChain::Load(Path("chain.xml"));
             chain.WakeProxies();
-            EXPECT_TRUE(chain[1]->IsProxy()) << "still missing";
+            EXPECT_TRUE(chain[1]->IsProxy() && chain[3]->IsProxy()) << "still missing";
             chain.Render(Noise());
 
-            BringDelayBack();
+            BringThemBack();
             Rescan();
             chain.WakeProxies();
-            EXPECT_FALSE(chain[1]->IsProxy());
+            EXPECT_FALSE(chain[1]->IsProxy() || chain[3]->IsProxy());
             EXPECT_TRUE(chain[1]->GetPresetNameAndDirtyState() ==
                         std::make_pair(UTF16String(u"Canyon & <echo>"), true));
             EXPECT_TRUE(IsSameSound(chain.Render(Noise()).sound, ReadSound(Path("before"))));

@@ -10,6 +10,7 @@
 #include "utility/EffectUtils.h"
 
 #include <algorithm>
+#include <stdexcept>
 
 namespace chain
 {
@@ -138,7 +139,16 @@ FilterPtr Find(const UTF16String& name)
     const auto found =
         std::find_if(catalogue.InfoBegin(), catalogue.InfoEnd(),
                      [&name](const auto& each) { return (*each).GetName().substr(0, name.size()) == name; });
-    return found == catalogue.InfoEnd() ? nullptr : utility::CreateAudioFilter((*found)->GetUniqueID());
+    FilterPtr filter;
+    if (found != catalogue.InfoEnd())
+    {
+        filter = utility::CreateAudioFilter((*found)->GetUniqueID());
+    }
+    if (!filter)
+    {
+        throw std::runtime_error("no filter " + zebcore::utility::NarrowFromUTF16(name));
+    }
+    return filter;
 }
 
 // What passes a filter by waits for the latency of the last time that it ran, so one that has loaded settings runs

@@ -28,7 +28,7 @@ struct Rendered
 class EffectChain
 {
 public:
-    // From the catalogue. A filter that is not there is a null pointer.
+    // From the catalogue. Throws std::runtime_error for a filter that is not there.
     explicit EffectChain(const std::vector<std::u16string>& names);
 
     // A proxy stands in for each filter that can't be made.
