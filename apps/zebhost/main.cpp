@@ -1,3 +1,4 @@
+#include "catalogue/PluginFinder.h"
 #include "cli/ArgumentParser.h"
 #include "cli/Failure.h"
 #include "cli/HelpText.h"
@@ -49,6 +50,7 @@ ExitCode RunWithLibrary(const Arguments& arguments, Console& console)
     const SettingsFolder folder(arguments.Text("settings"));
     Catalogue catalogue(folder, console);
     catalogue.Load();
+    UseStandardPlaces();
     CommandContext context{arguments, console, catalogue};
     const ExitCode code = command->second(context);
     zebaudiofilterhost::Terminate();

@@ -5,8 +5,7 @@ namespace zebhost
 
 OperandSpec FilterOperand()
 {
-    return {"FILTER", "a filter ID, a name that fits one filter, a bundle's path, or path#class name",
-            Values::Filter};
+    return {"FILTER", "a filter ID, a name that fits one filter, a plug-in's path, or path#name", Values::Filter};
 }
 
 std::vector<OptionSpec> ParameterOptions()
@@ -28,15 +27,15 @@ CommandSpec ScanSpec()
     return {
         "scan",
         "find plug-ins and put their effects into the catalogue",
-        "Without a PATH the standard places are searched ($VST3_PATH, or else ~/.vst3, /usr/local/lib/vst3 and "
-        "/usr/lib/vst3); plug-ins that are in the catalogue already are loaded again only if their binary has "
-        "changed, and those that have gone are dropped. A PATH is a bundle or a folder to search; what is found "
-        "there "
-        "is always scanned anew. Plug-ins are loaded in a process of their own, and the catalogue is saved after "
-        "each. One that crashes, or does not answer in time, is blocked, and the scan goes on; it is tried again "
-        "when "
-        "its binary has changed. Ctrl-C ends the scan with everything saved and nothing blocked.",
-        {{"PATH", "a plug-in bundle or a folder to search", Values::Folder, false, true}},
+        "Without a PATH the standard places are searched: for VST 3 $VST3_PATH, or else ~/.vst3, "
+        "/usr/local/lib/vst3 and /usr/lib/vst3; for VST 2 $VST_PATH, or else /usr/lib/vst, /usr/lib/lxvst, "
+        "/usr/local/lib/vst, ~/.vst and ~/.lxvst. Plug-ins that are in the catalogue already are loaded again only "
+        "if their binary has changed, and those that have gone are dropped. A PATH is a plug-in (a .vst3 or .vst "
+        "bundle, or a .so file) or a folder to search; what is found there is always scanned anew. Plug-ins are "
+        "loaded in a process of their own, and the catalogue is saved after each. One that crashes, or does not "
+        "answer in time, is blocked, and the scan goes on; it is tried again when its binary has changed. Ctrl-C "
+        "ends the scan with everything saved and nothing blocked.",
+        {{"PATH", "a plug-in or a folder to search", Values::File, false, true}},
         {
             {"full", "", "scan plug-ins again that are in the catalogue already, or could not be loaded"},
             {"retry-blocked", "", "scan blocked plug-ins again, and those that could not be loaded"},
@@ -48,7 +47,7 @@ CommandSpec ScanSpec()
             {"in-process", "", "load plug-ins in this process, for debugging: a crash ends the scan"},
         },
         {{"zebhost scan", "scan what is new in the standard places"},
-         {"zebhost scan ~/build/MyEffect.vst3", "scan one bundle, wherever it lies"},
+         {"zebhost scan ~/build/MyEffect.vst3", "scan one plug-in, wherever it lies"},
          {"zebhost scan --dry-run", "what would be scanned, and why"},
          {"zebhost scan --retry-blocked --verbose", "give blocked plug-ins another chance, and see what they say"}},
     };
