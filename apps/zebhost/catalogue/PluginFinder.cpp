@@ -114,6 +114,18 @@ std::string PathOf(const PluginLocator& locator)
     return ToNativePath(locator.GetPath());
 }
 
+bool IsInstalled(const PluginLocator& locator)
+{
+    const auto technology = PluginModuleInfoManager::GetInstance().GetPluginTechnology(locator.GetTechnologyType());
+    if (technology != nullptr && !technology->HasDirectories())
+    {
+        const std::vector<PluginLocator> found = technology->CollectPlugins();
+        return std::find(found.begin(), found.end(), locator) != found.end();
+    }
+    std::error_code error;
+    return fs::exists(PathOf(locator), error);
+}
+
 std::vector<PluginLocator> FindPlugins(const fs::path& path)
 {
     std::error_code error;

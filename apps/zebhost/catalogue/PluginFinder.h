@@ -18,6 +18,9 @@ zebaudiofilterhost::PluginLocator BundleLocator(const std::filesystem::path& pat
 
 std::string PathOf(const zebaudiofilterhost::PluginLocator& locator);
 
+// Whether the plug-in's file or bundle is there; for one that is no file, whether its technology still finds it.
+bool IsInstalled(const zebaudiofilterhost::PluginLocator& locator);
+
 // Has a scan without paths search what the environment says now, and not the folders that the settings file holds:
 // they were those of an environment gone by.
 void UseStandardPlaces();

@@ -37,11 +37,10 @@ void CheckUsable(const Catalogue::Descriptor& descriptor)
         throw Failure(ExitCode::Blocked, Title(descriptor) + " is disabled in the catalogue: 'zebhost scan " +
                                              PathOf(descriptor->GetLocator()) + "' enables it");
     }
-    std::error_code error;
-    if (!std::filesystem::exists(PathOf(descriptor->GetLocator()), error))
+    if (!IsInstalled(descriptor->GetLocator()))
     {
         throw Failure(ExitCode::NotLoaded,
-                      Title(descriptor) + " is gone from the disk: put it back, or run 'zebhost scan' to drop it "
+                      Title(descriptor) + " is gone: put it back, or run 'zebhost scan' to drop it "
                                           "from the catalogue");
     }
 }
