@@ -63,7 +63,8 @@ float Process(AudioFilter& filter)
     filter.SetSampleRate(kSampleRate);
     filter.SetBlockSize(kBlock);
     filter.Resume();
-    std::vector<float> left(kBlock), right(kBlock);
+    std::vector<float> left(kBlock);
+    std::vector<float> right(kBlock);
     float* channels[] = {left.data(), right.data()};
     float peak = 0.0F;
     for (int frame = 0; frame < static_cast<int>(kSampleRate); frame += kBlock)
@@ -79,12 +80,8 @@ float Process(AudioFilter& filter)
     return peak;
 }
 
-} // namespace
-
-int main(int argc, char** argv)
+int Run(int argc, char** argv)
 {
-    Initialize();
-    LoadCatalogue();
     if (argc < 2)
     {
         PrintCatalogue();
@@ -97,5 +94,16 @@ int main(int argc, char** argv)
         return 1;
     }
     std::cout << argv[1] << ": peak " << Process(*filter) << '\n';
+    return 0;
+}
+
+} // namespace
+
+int main(int argc, char** argv)
+{
+    Initialize();
+    LoadCatalogue();
+    const int result = Run(argc, argv);
     Terminate();
+    return result;
 }
