@@ -3,7 +3,9 @@
 #include "foundation/zebcore/NativePath.h"
 
 #include <cstdlib>
+#include <filesystem>
 #include <string>
+#include <system_error>
 
 namespace zebaudiofilterhost
 {
@@ -13,9 +15,12 @@ namespace
 
 constexpr std::string_view kHomePrefix = "~/";
 
+// Absolute, since what is found goes into a catalogue that outlives this process.
 Dir MakeDir(std::string_view path)
 {
-    return Dir(zebcore::filesupport::FromNativePath(path));
+    std::error_code error;
+    const std::filesystem::path absolute = std::filesystem::absolute(path, error);
+    return Dir(zebcore::filesupport::FromNativePath(error ? std::string(path) : absolute.native()));
 }
 
 // Empty if the variable is not set.

@@ -68,8 +68,10 @@ TEST_F(VSTPluginFilesTest, PlacesOfTheMachineFirst)
         const VariableGuard noHome("HOME", "");
         EXPECT_EQ(GetDefaultVSTPluginDirectories().size(), 3U);
     }
-    const VariableGuard path("VST_PATH", "/b::/a/x y:");
-    EXPECT_TRUE(GetDefaultVSTPluginDirectories() == (std::vector<UTF16String>{u"/b", u"/a/x y"}));
+    const VariableGuard path("VST_PATH", "/b::/a/x y:here");
+    const UTF16String here =
+        zebcore::filesupport::FromNativePath((std::filesystem::current_path() / "here").native());
+    EXPECT_TRUE(GetDefaultVSTPluginDirectories() == (std::vector<UTF16String>{u"/b", u"/a/x y", here}));
 }
 
 } // namespace
