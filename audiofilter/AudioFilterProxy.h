@@ -46,7 +46,9 @@ public:
     void SetParameterDisplayName(int index, const UTF16String& name);
 
     /// The real filter, suspended, with this proxy's buses, settings and maps; null while the plug-in is missing.
-    /// Host, target buses and display name are the application's to set. The proxy stays as it is. [main]
+    /// Host, target buses and display name are the application's to set. The proxy stays as it is. Some plug-ins know
+    /// their latency only when they run, and it may come with the settings: to align what passes the filter by, call
+    /// Resume, Suspend, and Resume again. [main]
     boost::intrusive_ptr<AudioFilter> CreateAudioFilterFromZombieState() const;
 
 private:
