@@ -1,5 +1,6 @@
-// Finds the VST 3 effects of this machine and sends a second of noise through one of them.
-//   zeb_minimal [NAME]     the first effect that is found, or the one of that name; VST3_PATH may name another folder
+// Finds the effects of this machine and sends a second of noise through one of them.
+//   zeb_minimal [NAME]     the first effect that is found, or the one of that name; VST3_PATH and VST_PATH
+//                          may name other folders
 #include "audiofilter/AudioFilter.h"
 #include "foundation/zebcore/MainThreadLoop.h"
 #include "foundation/zebcore/StringConversion.h"
@@ -26,6 +27,7 @@ constexpr float kSampleRate = 48000.0F;
 void Scan()
 {
     std::vector<PluginLocator> gone;
+    PluginModuleInfoManager::GetInstance().ResetToDefaultFolders();
     const auto found = PluginModuleInfoManager::GetInstance().CollectPotentialPlugins(true, gone);
     const boost::intrusive_ptr<PluginModuleScanner> scanner(new PluginModuleScanner(found, false));
     scanner->BeginScan();
