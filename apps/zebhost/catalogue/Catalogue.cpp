@@ -120,7 +120,7 @@ void Catalogue::LiftFinishedBlocks()
             PluginModuleInfoManager::GetInstance().FindPluginInfo(locator) != nullptr)
         {
             blocks.RemoveBannedPlugin(locator);
-            mReasons.Remove(locator);
+            mLifted.push_back(locator);
         }
     }
 }
@@ -195,6 +195,11 @@ void Catalogue::SaveBlockList()
     SetAsideIfDamaged(mFolder.Blocks());
     File file = ToFile(mFolder.Blocks());
     BannedPluginManager::GetInstance().SaveConfiguration(file);
+    for (const PluginLocator& locator : mLifted)
+    {
+        mReasons.Remove(locator);
+    }
+    mLifted.clear();
 }
 
 void Catalogue::SaveStamps(LocatorTable::Saving saving)
@@ -241,6 +246,7 @@ std::string Catalogue::BlockedBecause(const PluginLocator& locator) const
 void Catalogue::Block(const PluginLocator& locator, const BlockReason& reason, LocatorTable::Saving saving)
 {
     BannedPluginManager::GetInstance().AddBannedPlugin(locator);
+    std::erase(mLifted, locator);
     mReasons.Set(locator, reason);
     WithFiles(
         [this, saving]
@@ -253,7 +259,7 @@ void Catalogue::Block(const PluginLocator& locator, const BlockReason& reason, L
 void Catalogue::Unblock(const PluginLocator& locator)
 {
     BannedPluginManager::GetInstance().RemoveBannedPlugin(locator);
-    mReasons.Remove(locator);
+    mLifted.push_back(locator);
     WithFiles(
         [this]
         {

@@ -57,6 +57,7 @@ private:
     const SettingsFolder& mFolder;
     Console& mConsole;
     BlockReasons mReasons;
+    std::vector<zebaudiofilterhost::PluginLocator> mLifted; // whose reasons go when the list is saved without them
     BinaryStamps mStamps;
     std::set<std::filesystem::path> mDamaged;
 };

@@ -3,6 +3,7 @@
 #include "catalogue/SettingsFolder.h"
 #include "output/PrintableText.h"
 
+#include <foundation/zebcore/FileExceptions.h>
 #include <foundation/zebcore/FileUtils.h>
 #include <foundation/zebcore/SafeSave.h>
 #include <foundation/zebcore/XmlUtils.h>
@@ -82,7 +83,12 @@ void LocatorTable::SaveQuickly(const std::string& text) const
     try
     {
         FileUtils::SimpleWriteStringToFile(ToFile(fresh).FullPath(), {text.begin(), text.end()});
-        std::filesystem::rename(fresh, mFile);
+        std::error_code error;
+        std::filesystem::rename(fresh, mFile, error);
+        if (error)
+        {
+            throw zebcore::filesupport::file_exception("cannot replace", ToFile(mFile).FullPath(), error.value());
+        }
     }
     catch (...)
     {

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <cstdlib>
 
+#include <fcntl.h>
 #include <sys/ioctl.h>
 #include <unistd.h>
 
@@ -32,10 +33,10 @@ std::size_t Width(int descriptor)
     return kDefaultWidth;
 }
 
-// A copy of standard output for the data, while descriptor 1 becomes standard error.
+// A copy of standard output for the data, which no other program inherits, while descriptor 1 becomes standard error.
 std::FILE* TakeOutput()
 {
-    const int data = dup(STDOUT_FILENO);
+    const int data = fcntl(STDOUT_FILENO, F_DUPFD_CLOEXEC, STDERR_FILENO + 1);
     std::FILE* stream = data < 0 ? nullptr : fdopen(data, "w");
     if (stream == nullptr)
     {

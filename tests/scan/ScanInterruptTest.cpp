@@ -1,0 +1,150 @@
+#include "tests/scan/support/ScanFolder.h"
+#include "tests/scan/support/StartedProgram.h"
+
+#include <csignal>
+
+namespace zebtest
+{
+
+namespace
+{
+
+using testing::ElementsAre;
+using testing::HasSubstr;
+using testing::IsEmpty;
+using testing::Pair;
+
+// Scans that somebody ends from outside.
+class ScanInterruptTest : public ScanFolder
+{
+protected:
+    ScanInterruptTest()
+    {
+        AddBundle("a");
+        AddBundle("c");
+    }
+
+    // The worker that has loaded a plug-in of this name; 0 if none has within a minute.
+    pid_t WorkerThatLoads(const std::string& name) const
+    {
+        pid_t worker = 0;
+        Eventually(
+            [this, &name, &worker]
+            {
+                for (const Load& load : Loads())
+                {
+                    worker = load.name == name ? load.process : worker;
+                }
+                return worker != 0;
+            });
+        return worker;
+    }
+
+    StartedProgram Start(const std::vector<std::string>& arguments) const
+    {
+        return {CommandLine(arguments), mVariables, mFolder};
+    }
+};
+
+TEST_F(ScanInterruptTest, CtrlCKeepsWhatIsDoneAndBlocksNothing)
+{
+    AddBundle("b-hang");
+    for (const int signal : {SIGINT, SIGTERM, SIGHUP})
+    {
+        StartedProgram scan = Start({"scan", "--json"});
+        const pid_t worker = WorkerThatLoads("b-hang");
+        // A second one changes nothing.
+        scan.SignalGroup(signal);
+        scan.SignalGroup(signal);
+        EXPECT_EQ(scan.Wait(), 1);
+        EXPECT_THAT(scan.Err(), HasSubstr("the scan was interrupted after"));
+        EXPECT_THAT(scan.Err(), HasSubstr("run it again to go on"));
+        EXPECT_EQ(nlohmann::json::parse(scan.Out()).at("error").at("kind"), "job-failed");
+        EXPECT_THAT(Blocks(), IsEmpty());
+        EXPECT_THAT(Records(), ElementsAre("a"));
+        EXPECT_FALSE(IsAlive(worker));
+        ForgetLoads();
+    }
+}
+
+TEST_F(ScanInterruptTest, AnInterruptedRetryLeavesThePluginBlockedAsItWas)
+{
+    AddBundle("b-hang");
+    Succeed({"scan", "--timeout", "1"});
+    const auto before = Blocks();
+    EXPECT_THAT(before, ElementsAre(Pair("b-hang", HasSubstr("did not answer"))));
+    ForgetLoads();
+    StartedProgram scan = Start({"scan", "--retry-blocked"});
+    WorkerThatLoads("b-hang");
+    scan.Signal(SIGINT);
+    EXPECT_EQ(scan.Wait(), 1);
+    EXPECT_EQ(Blocks(), before);
+}
+
+TEST_F(ScanInterruptTest, EndingAWorkerByHandSkipsThePluginAndBlocksNothing)
+{
+    AddBundle("b-hang");
+    StartedProgram scan = Start({"scan"});
+    kill(WorkerThatLoads("b-hang"), SIGTERM);
+    EXPECT_EQ(scan.Wait(), 0) << scan.Err();
+    EXPECT_THAT(scan.Err(), HasSubstr("1 interrupted"));
+    EXPECT_THAT(Blocks(), IsEmpty());
+    EXPECT_THAT(Records(), ElementsAre("a", "c"));
+}
+
+TEST_F(ScanInterruptTest, AKilledWorkerIsReplacedAndItsPluginBlocked)
+{
+    AddBundle("b-hang");
+    StartedProgram scan = Start({"scan"});
+    kill(WorkerThatLoads("b-hang"), SIGKILL);
+    EXPECT_EQ(scan.Wait(), 0) << scan.Err();
+    EXPECT_THAT(Blocks(), ElementsAre(Pair("b-hang", HasSubstr("SIGKILL"))));
+    EXPECT_THAT(Records(), ElementsAre("a", "c"));
+}
+
+TEST_F(ScanInterruptTest, AHangTakesItsChildrenAlong)
+{
+    AddBundle("b-spawn");
+    const RunResult result = Succeed({"scan", "--timeout", "1"});
+    EXPECT_THAT(Records(), ElementsAre("a", "c"));
+    pid_t child = 0;
+    for (const Load& load : Loads())
+    {
+        child = load.name == "child" ? load.process : child;
+    }
+    ASSERT_GT(child, 0);
+    EXPECT_TRUE(Eventually([child] { return !IsAlive(child); }));
+}
+
+TEST_F(ScanInterruptTest, AWorkerDiesWithItsParent)
+{
+    AddBundle("b-hang");
+    StartedProgram scan = Start({"scan"});
+    const pid_t worker = WorkerThatLoads("b-hang");
+    scan.Signal(SIGKILL);
+    EXPECT_EQ(scan.Wait(), -SIGKILL);
+    EXPECT_TRUE(Eventually([worker] { return !IsAlive(worker); }));
+    EXPECT_THAT(Blocks(), ElementsAre(Pair("b-hang", "at hand in a scan that did not end")));
+    Succeed({"scan"});
+    EXPECT_THAT(Records(), ElementsAre("a", "c"));
+    EXPECT_EQ(CountLoads().at("b-hang"), 1);
+}
+
+// Ctrl-Z and a lid that is closed must not count as a plug-in's silence.
+TEST_F(ScanInterruptTest, AStoppedScanBlamesNobody)
+{
+    AddBundle("b-hang");
+    StartedProgram scan = Start({"scan", "--timeout", "2"});
+    WorkerThatLoads("b-hang");
+    scan.Signal(SIGSTOP);
+    const auto longer = std::chrono::steady_clock::now() + std::chrono::milliseconds(2500);
+    Eventually([longer] { return std::chrono::steady_clock::now() > longer; });
+    scan.Signal(SIGCONT);
+    scan.Signal(SIGINT);
+    EXPECT_EQ(scan.Wait(), 1);
+    EXPECT_THAT(Blocks(), IsEmpty());
+}
+
+} // namespace
+
+} // namespace zebtest
