@@ -193,6 +193,17 @@ void Silence(const Block& block, ChannelFlags flags)
     }
 }
 
+// Of the application's channels.
+unsigned long long BitsOf(ChannelFlags flags)
+{
+    unsigned long long bits = 0;
+    for (unsigned int channel = 0; channel < kChannels; ++channel)
+    {
+        bits |= flags.IsSet(ChannelBit(channel)) ? ChannelBit(channel) : 0;
+    }
+    return bits;
+}
+
 } // namespace
 
 EffectChain::EffectChain(const std::vector<std::u16string>& names)
@@ -248,33 +259,34 @@ Rendered EffectChain::Render(const Channels& input)
     }
     for (std::size_t first = 0; first < input.front().size(); first += kFrames)
     {
-        Block in = At(rendered.sound, first);
-        Block out = At(other, first);
-        ChannelFlags silent = SilentChannels(in);
-        for (std::size_t index = 0; index < Count(); ++index)
-        {
-            ChannelFlags flags;
-            mFilters[index]->ProcessWithMapping(in.data(), out.data(), kFrames, silent, flags);
-            silent = flags;
-            Silence(out, silent);
-            unsigned long long bits = 0;
-            for (unsigned int channel = 0; channel < out.size(); ++channel)
-            {
-                bits |= silent.IsSet(ChannelBit(channel)) ? ChannelBit(channel) : 0;
-            }
-            rendered.silent[index].push_back(bits);
-            in.swap(out);
-        }
-        for (std::size_t channel = 0; channel < in.size(); ++channel)
-        {
-            std::copy_n(in[channel], kFrames, rendered.sound[channel].data() + first);
-        }
+        RenderBlock(rendered, other, first);
     }
     for (const FilterPtr& filter : mFilters)
     {
         filter->Suspend();
     }
     return rendered;
+}
+
+// From one buffer into the other and back, filter by filter.
+void EffectChain::RenderBlock(Rendered& rendered, Channels& other, std::size_t first)
+{
+    Block in = At(rendered.sound, first);
+    Block out = At(other, first);
+    ChannelFlags silent = SilentChannels(in);
+    for (std::size_t index = 0; index < Count(); ++index)
+    {
+        ChannelFlags flags;
+        mFilters[index]->ProcessWithMapping(in.data(), out.data(), kFrames, silent, flags);
+        silent = flags;
+        Silence(out, silent);
+        rendered.silent[index].push_back(BitsOf(silent));
+        in.swap(out);
+    }
+    for (std::size_t channel = 0; channel < in.size(); ++channel)
+    {
+        std::copy_n(in[channel], kFrames, rendered.sound[channel].data() + first);
+    }
 }
 
 void FitIn(AudioFilter& filter)

@@ -47,6 +47,8 @@ public:
 private:
     EffectChain() = default;
 
+    void RenderBlock(Rendered& rendered, Channels& other, std::size_t first);
+
     std::vector<FilterPtr> mFilters;
 };
 
