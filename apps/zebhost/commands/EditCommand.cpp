@@ -93,13 +93,18 @@ ExitCode RunEdit(CommandContext& context)
         pictureFile.emplace(arguments.Text("screenshot"), arguments.Has("overwrite"));
     }
     const std::vector<float> before = Values(*filter);
-    const Picture picture = RunEditor(*filter, filter.Name(), milliseconds, pictureFile.has_value());
+    const EditorOutcome outcome = RunEditor(*filter, filter.Name(), milliseconds, pictureFile.has_value());
+    if (!outcome.trouble.empty())
+    {
+        context.console.Warn("zebhost: " + filter.Name() + " threw an exception while its editor was open, \"" +
+                             outcome.trouble + "\": what it showed may be wrong; ask its maker");
+    }
     Settle(kDefaultSettleMs);
     const std::string changes = Changes(*filter, before);
     context.console.Remark("zebhost: " + (changes.empty() ? "nothing was changed" : "set " + changes));
     if (pictureFile)
     {
-        SavePicture(context, filter, picture, *pictureFile);
+        SavePicture(context, filter, outcome.picture, *pictureFile);
     }
     if (arguments.Has("save"))
     {

@@ -6,6 +6,8 @@
 
 #include <foundation/zebcore/MainThreadLoop.h>
 
+#include <exception>
+
 namespace zebhost
 {
 
@@ -63,6 +65,7 @@ public:
 
     bool IsDone() const { return mWindow.IsClosed() || interrupt::IsRequested(); }
     Picture TakePicture() const { return mWindow.TakePicture(); }
+    const std::string& Trouble() const { return mTrouble; }
 
 private:
     // The plug-in may ask for a new size from inside Open.
@@ -75,18 +78,39 @@ private:
     void Tick()
     {
         mWindow.Update();
-        mEditor->Idle();
+        try
+        {
+            mEditor->Idle();
+        }
+        catch (const std::exception& error)
+        {
+            NoteTrouble(error.what());
+        }
+        catch (...)
+        {
+            NoteTrouble("something that tells nothing");
+        }
+    }
+
+    // What the user has set must not be lost for it, so the editor stays open.
+    void NoteTrouble(const std::string& trouble)
+    {
+        if (mTrouble.empty())
+        {
+            mTrouble = trouble;
+        }
     }
 
     boost::intrusive_ptr<AudioFilterEditor> mEditor;
     EditorWindow mWindow;
     boost::signals2::connection mSizeConnection;
     zebcore::threads::WatchID mTimer = zebcore::threads::kNoWatch;
+    std::string mTrouble;
 };
 
 } // namespace
 
-Picture RunEditor(AudioFilter& filter, const std::string& title, unsigned int milliseconds, bool wantPicture)
+EditorOutcome RunEditor(AudioFilter& filter, const std::string& title, unsigned int milliseconds, bool wantPicture)
 {
     constexpr unsigned int kSliceMs = 3600000;
     interrupt::Watch();
@@ -105,7 +129,7 @@ Picture RunEditor(AudioFilter& filter, const std::string& title, unsigned int mi
         {
         }
     }
-    return wantPicture ? editor.TakePicture() : Picture();
+    return {wantPicture ? editor.TakePicture() : Picture(), editor.Trouble()};
 }
 
 } // namespace zebhost
