@@ -99,6 +99,33 @@ TEST_F(EditTest, OddEditorsDoNotEndTheProcess)
     EXPECT_EQ(Edit(FixtureBundle("NoView"), {}).code, 1);
 }
 
+TEST_F(EditTest, OddVST2EditorsGetAWindowOfTheSizeTheyMean)
+{
+    if (!HasScreen())
+    {
+        GTEST_SKIP() << "xvfb-run is not installed: no editor was opened";
+    }
+    struct Case
+    {
+        const char* name;
+        unsigned int width;
+        unsigned int height;
+        const char* remark;
+    };
+    for (const Case& each :
+         {Case{"Normal", 400, 300, ""}, Case{"NullRect", 480, 320, ""}, Case{"SizesInOpen", 640, 320, ""},
+          Case{"ThrowsInDispatcher", 480, 320, "threw an exception while its editor was open"}})
+    {
+        const RunResult result = Edit(VST2Fixture(each.name), {"--screenshot", Path("odd.png"), "--overwrite"});
+        EXPECT_EQ(result.code, 0) << each.name;
+        EXPECT_THAT(result.err, HasSubstr(each.remark)) << each.name;
+        const std::string png = ReadText(Path("odd.png"));
+        EXPECT_EQ(BigEndian(png, 16), each.width) << each.name;
+        EXPECT_EQ(BigEndian(png, 20), each.height) << each.name;
+    }
+    EXPECT_EQ(Edit(VST2Fixture("NoEditor"), {}).code, 1);
+}
+
 } // namespace
 
 } // namespace zebtest
