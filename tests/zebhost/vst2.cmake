@@ -1,0 +1,10 @@
+# The same program with VST 2 plug-ins.
+add_executable(zebhost_vst2_test VST2Test.cpp support/Sound.cpp support/Zebhost.cpp)
+target_link_libraries(zebhost_vst2_test PRIVATE zebhost_parts zeb_options GTest::gtest_main GTest::gmock)
+target_include_directories(zebhost_vst2_test PRIVATE ${PROJECT_SOURCE_DIR})
+target_compile_definitions(zebhost_vst2_test PRIVATE ZEBHOST_PROGRAM="$<TARGET_FILE:zebhost>")
+add_dependencies(zebhost_vst2_test zebhost)
+zeb_use_fixtures(zebhost_vst2_test)
+zeb_use_vst2_fixtures(zebhost_vst2_test)
+add_test(NAME zebhost_vst2_test COMMAND zebhost_vst2_test)
+set_tests_properties(zebhost_vst2_test PROPERTIES RESOURCE_LOCK display)
