@@ -167,9 +167,9 @@ long long Echo::Answer(const Call& call)
     }
 }
 
-Effect* MakeEffect(audioMasterCallback host)
+std::unique_ptr<Effect> MakeEffect(audioMasterCallback host)
 {
-    return new Echo(host);
+    return std::make_unique<Echo>(host);
 }
 
 } // namespace effects::vst2

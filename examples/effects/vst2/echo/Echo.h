@@ -9,7 +9,7 @@ namespace effects::vst2
 {
 
 // An echo of up to a second, with programs, that keeps its state in chunks.
-class Echo : public Effect
+class Echo final : public Effect
 {
 public:
     explicit Echo(audioMasterCallback host);

@@ -104,12 +104,11 @@ long long Gain::Answer(const Call& call)
 {
     if (call.opcode == effSetSpeakerArrangement)
         // A pointer travels in the value.
-        return Arrange(
-            reinterpret_cast<const VstSpeakerArrangement*>(call.value), // NOLINT(performance-no-int-to-ptr)
-            static_cast<const VstSpeakerArrangement*>(call.ptr));
+        return Arrange(reinterpret_cast<const VstSpeakerArrangement*>(call.value),
+                       static_cast<const VstSpeakerArrangement*>(call.ptr));
     if (call.opcode == effGetSpeakerArrangement && mArrangements[0].numChannels > 0)
     {
-        *reinterpret_cast<VstSpeakerArrangement**>(call.value) = &mArrangements[0];
+        *reinterpret_cast<VstSpeakerArrangement**>(call.value) = mArrangements.data();
         *static_cast<VstSpeakerArrangement**>(call.ptr) = &mArrangements[1];
         return 1;
     }
@@ -127,9 +126,9 @@ long long Gain::Arrange(const VstSpeakerArrangement* input, const VstSpeakerArra
 
 } // namespace
 
-Effect* MakeEffect(audioMasterCallback host)
+std::unique_ptr<Effect> MakeEffect(audioMasterCallback host)
 {
-    return new Gain(host);
+    return std::make_unique<Gain>(host);
 }
 
 } // namespace effects::vst2

@@ -98,9 +98,9 @@ long long Panel::Answer(const Call& call)
     }
 }
 
-Effect* MakeEffect(audioMasterCallback host)
+std::unique_ptr<Effect> MakeEffect(audioMasterCallback host)
 {
-    return new Panel(host);
+    return std::make_unique<Panel>(host);
 }
 
 } // namespace effects::vst2

@@ -104,14 +104,14 @@ private:
 
 } // namespace
 
-Effect* MakeEffect(audioMasterCallback host)
+std::unique_ptr<Effect> MakeEffect(audioMasterCallback host)
 {
     const long long wanted = host(nullptr, audioMasterCurrentId, 0, 0, nullptr, 0.0F);
     if (wanted == 0)
-        return new ShellEffect(host);
+        return std::make_unique<ShellEffect>(host);
     const auto* const member = std::find_if(kMembers.begin(), kMembers.end(),
                                             [wanted](const Member& each) { return each.uniqueID == wanted; });
-    return member != kMembers.end() ? new MemberEffect(host, *member) : nullptr;
+    return member != kMembers.end() ? std::make_unique<MemberEffect>(host, *member) : nullptr;
 }
 
 } // namespace effects::vst2

@@ -73,7 +73,8 @@ long long Effect::Dispatch(AEffect* effect, std::int32_t opcode, std::int32_t in
     switch (opcode)
     {
     case effClose:
-        delete &self;
+        // The host has owned it since the entry call.
+        std::default_delete<Effect>()(&self);
         return 1;
     case effGetEffectName:
     case effGetVendorString:
@@ -91,7 +92,7 @@ long long Effect::Dispatch(AEffect* effect, std::int32_t opcode, std::int32_t in
     }
 }
 
-long long Effect::AnswerText(const Call& call)
+long long Effect::AnswerText(const Call& call) const
 {
     if (call.opcode == effGetEffectName)
         CopyText(call.ptr, mDescription.name, kNameLength);

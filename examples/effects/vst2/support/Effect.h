@@ -4,6 +4,7 @@
 
 #include <atomic>
 #include <cstdint>
+#include <memory>
 #include <optional>
 #include <string>
 #include <vector>
@@ -84,7 +85,7 @@ private:
     static float GetParameterProc(AEffect* effect, std::int32_t index);
     static Effect& Of(AEffect* effect) { return *static_cast<Effect*>(effect->object); }
 
-    long long AnswerText(const Call& call);
+    long long AnswerText(const Call& call) const;
     long long AnswerParameter(const Call& call);
     long long AnswerUsual(const Call& call);
     long long Describe(std::int32_t index, VstParameterProperties& properties) const;
@@ -98,6 +99,6 @@ private:
 };
 
 // Written by each plug-in: a new instance, or null if there is none.
-Effect* MakeEffect(audioMasterCallback host);
+std::unique_ptr<Effect> MakeEffect(audioMasterCallback host);
 
 } // namespace effects::vst2

@@ -3,6 +3,6 @@
 extern "C" __attribute__((visibility("default"))) zebaudiofilterhost::vst::AEffect*
 VSTPluginMain(zebaudiofilterhost::vst::audioMasterCallback host)
 {
-    effects::vst2::Effect* effect = effects::vst2::MakeEffect(host);
-    return effect != nullptr ? effect->Binary() : nullptr;
+    auto effect = effects::vst2::MakeEffect(host);
+    return effect != nullptr ? effect.release()->Binary() : nullptr; // the host's until effClose
 }
