@@ -70,7 +70,7 @@ TEST_F(ScanInterruptTest, CtrlCKeepsWhatIsDoneAndBlocksNothing)
 TEST_F(ScanInterruptTest, AnInterruptedRetryLeavesThePluginBlockedAsItWas)
 {
     AddBundle("b-hang");
-    Succeed({"scan", "--timeout", "1"});
+    Succeed({"scan", "--timeout", Seconds(1)});
     const auto before = Blocks();
     EXPECT_THAT(before, ElementsAre(Pair("b-hang", HasSubstr("did not answer"))));
     ForgetLoads();
@@ -105,7 +105,7 @@ TEST_F(ScanInterruptTest, AKilledWorkerIsReplacedAndItsPluginBlocked)
 TEST_F(ScanInterruptTest, AHangTakesItsChildrenAlong)
 {
     AddBundle("b-spawn");
-    const RunResult result = Succeed({"scan", "--timeout", "1"});
+    const RunResult result = Succeed({"scan", "--timeout", Seconds(1)});
     EXPECT_THAT(Records(), ElementsAre("a", "c"));
     pid_t child = 0;
     for (const Load& load : Loads())
@@ -130,14 +130,34 @@ TEST_F(ScanInterruptTest, AWorkerDiesWithItsParent)
     EXPECT_EQ(CountLoads().at("b-hang"), 1);
 }
 
+TEST_F(ScanInterruptTest, NobodyElseChangesTheSettingsMeanwhile)
+{
+    AddBundle("b-hang");
+    StartedProgram scan = Start({"scan"});
+    WorkerThatLoads("b-hang");
+    const std::vector<std::string> commands[] = {
+        {"scan"}, {"block", Bundle("c").string()}, {"unblock", Bundle("b-hang").string()}};
+    for (const std::vector<std::string>& command : commands)
+    {
+        const RunResult result = Run(command);
+        EXPECT_EQ(result.code, 1) << command.front();
+        EXPECT_THAT(result.LastLine(), HasSubstr("another scan is at work in " + Settings().string()));
+    }
+    EXPECT_THAT(Succeed({"list", "--names"}).out, "a\n");
+    Succeed({"scan", "--dry-run"});
+    scan.Signal(SIGINT);
+    EXPECT_EQ(scan.Wait(), 1);
+    Succeed({"block", Bundle("c").string()});
+}
+
 // Ctrl-Z and a lid that is closed must not count as a plug-in's silence.
 TEST_F(ScanInterruptTest, AStoppedScanBlamesNobody)
 {
     AddBundle("b-hang");
-    StartedProgram scan = Start({"scan", "--timeout", "2"});
+    StartedProgram scan = Start({"scan", "--timeout", Seconds(2)});
     WorkerThatLoads("b-hang");
     scan.Signal(SIGSTOP);
-    const auto longer = std::chrono::steady_clock::now() + std::chrono::milliseconds(2500);
+    const auto longer = std::chrono::steady_clock::now() + std::chrono::duration<double>(2.5 * Slowness());
     Eventually([longer] { return std::chrono::steady_clock::now() > longer; });
     scan.Signal(SIGCONT);
     scan.Signal(SIGINT);

@@ -14,13 +14,6 @@ using testing::HasSubstr;
 using testing::Not;
 using testing::Pair;
 
-std::string Seconds(double seconds)
-{
-    std::ostringstream text;
-    text << seconds * Slowness();
-    return text.str();
-}
-
 struct Fault
 {
     const char* word;

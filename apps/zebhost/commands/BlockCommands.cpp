@@ -1,11 +1,13 @@
 #include "catalogue/FilterSelector.h"
 #include "catalogue/PluginFinder.h"
+#include "catalogue/SettingsLock.h"
 #include "cli/Failure.h"
 #include "commands/Commands.h"
 #include "output/TextTable.h"
 
 #include <host/BannedPluginManager.h>
 
+#include <optional>
 #include <vector>
 
 namespace zebhost
@@ -63,6 +65,17 @@ void Tell(const CommandContext& context, const PluginLocator& locator, const std
     context.console.Remark("zebhost: " + PathOf(locator) + what);
 }
 
+// So that the next scan tries it.
+void ForgetProblem(Catalogue& catalogue, const PluginLocator& locator)
+{
+    const std::optional<BinaryStamps::Entry> last = catalogue.Stamps().Find(locator);
+    if (last && !last->problem.empty())
+    {
+        catalogue.Stamps().Remove(locator);
+        catalogue.SaveStamps(LocatorTable::Saving::Flushed);
+    }
+}
+
 } // namespace
 
 ExitCode RunBlock(CommandContext& context)
@@ -71,6 +84,7 @@ ExitCode RunBlock(CommandContext& context)
     BlockReason why;
     why.reason = context.arguments.Text("reason", "blocked by hand");
     why.since = TimeOfNow();
+    const SettingsLock lock(context.catalogue.Folder().Path());
     context.catalogue.Block(locator, why);
     Tell(context, locator, " is blocked; 'zebhost unblock' lets it be used again");
     return ExitCode::Done;
@@ -79,7 +93,9 @@ ExitCode RunBlock(CommandContext& context)
 ExitCode RunUnblock(CommandContext& context)
 {
     const PluginLocator locator = BlockedPlugin(context, context.arguments.Text("PLUGIN"));
+    const SettingsLock lock(context.catalogue.Folder().Path());
     context.catalogue.Unblock(locator);
+    ForgetProblem(context.catalogue, locator);
     Tell(context, locator, " is not blocked any more; the next 'zebhost scan' tries it");
     return ExitCode::Done;
 }

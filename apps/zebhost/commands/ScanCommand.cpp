@@ -1,5 +1,6 @@
 #include "catalogue/ScanPlan.h"
 #include "catalogue/ScanSession.h"
+#include "catalogue/SettingsLock.h"
 #include "cli/Failure.h"
 #include "commands/Commands.h"
 #include "commands/ScanReport.h"
@@ -110,20 +111,28 @@ std::optional<Failure> TroubleOf(const CommandContext& context, const ScanPlan& 
     return report.FailureOf(context.arguments.All("PATH"));
 }
 
+ExitCode DryRun(const CommandContext& context)
+{
+    const ScanPlan plan = MakePlan(context);
+    ScanReport report(context, plan);
+    report.PrintPlan();
+    context.console.Remark(report.PlanSummary());
+    return ExitCode::Done;
+}
+
 } // namespace
 
 ExitCode RunScan(CommandContext& context)
 {
     constexpr double kLongestTimeout = 86400;
     const double timeout = context.arguments.Number("timeout", 30, 0, kLongestTimeout);
-    const ScanPlan plan = MakePlan(context);
-    ScanReport report(context, plan);
     if (context.arguments.Has("dry-run"))
     {
-        report.PrintPlan();
-        context.console.Remark(report.PlanSummary());
-        return ExitCode::Done;
+        return DryRun(context);
     }
+    const SettingsLock lock(context.catalogue.Folder().Path());
+    const ScanPlan plan = MakePlan(context);
+    ScanReport report(context, plan);
     std::size_t restarts = 0;
     std::optional<Failure> trouble;
     try

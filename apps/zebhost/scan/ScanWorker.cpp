@@ -12,11 +12,13 @@
 #include <host/PluginModuleInfoManager.h>
 #include <module/Module.h>
 
+#include <algorithm>
 #include <array>
 #include <cerrno>
 #include <charconv>
 #include <csignal>
 #include <cstdio>
+#include <cstdlib>
 #include <string_view>
 
 #include <fcntl.h>

@@ -1,16 +1,14 @@
 #include "scan/ScanWorkerProcess.h"
 
-#include "cli/Failure.h"
 #include "scan/SpawnWorker.h"
 
+#include <algorithm>
 #include <array>
 #include <cerrno>
 #include <chrono>
 #include <csignal>
-#include <cstring>
 #include <thread>
 
-#include <fcntl.h>
 #include <poll.h>
 #include <sys/socket.h>
 #include <sys/wait.h>

@@ -4,6 +4,7 @@
 
 #include <fstream>
 #include <regex>
+#include <sstream>
 
 namespace zebtest
 {
@@ -122,6 +123,13 @@ double Slowness()
 #else
     return 1;
 #endif
+}
+
+std::string Seconds(double seconds)
+{
+    std::ostringstream text;
+    text << seconds * Slowness();
+    return text.str();
 }
 
 } // namespace zebtest

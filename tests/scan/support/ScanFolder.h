@@ -45,5 +45,7 @@ protected:
 
 // How much longer things take in this build.
 double Slowness();
+// So many seconds, and longer where things take longer, as an option has them.
+std::string Seconds(double seconds);
 
 } // namespace zebtest
