@@ -5,9 +5,6 @@
 #include "filter/FactoryPresets.h"
 #include "filter/Parameters.h"
 #include "filter/ValueFinder.h"
-#include "output/Strings.h"
-
-#include <algorithm>
 
 namespace zebhost
 {
@@ -16,15 +13,6 @@ using zebaudiofilterhost::AudioFilter;
 
 namespace
 {
-
-// The first of an equal name; -1 if there is none.
-int FactoryPreset(const AudioFilter& filter, const std::string& name)
-{
-    const std::vector<std::string> names = FactoryPresetNames(filter);
-    const auto found = std::find_if(names.begin(), names.end(),
-                                    [&name](const std::string& each) { return EqualIgnoringCase(each, name); });
-    return found == names.end() ? -1 : static_cast<int>(found - names.begin());
-}
 
 void SetByText(const CommandContext& context, AudioFilter& filter, const std::string& assignment)
 {
@@ -47,7 +35,7 @@ void SetByText(const CommandContext& context, AudioFilter& filter, const std::st
 void ApplyPreset(const CommandContext& context, AudioFilter& filter, const std::string& preset, unsigned int settleMs)
 {
     const PresetStore store(context.catalogue.Folder().Presets());
-    const int factory = FactoryPreset(filter, preset);
+    const int factory = FindFactoryPreset(filter, preset);
     if (factory >= 0 && !store.Has(filter, preset))
     {
         filter.SetFactoryPreset(factory);
