@@ -48,15 +48,15 @@ public:
 
     void VisitSubList(const UTF8String& key, const PropList& subList) override
     {
-        const std::string content = ListText(subList);
-        Begin('l', key, content.size());
-        mText += content;
+        Begin('l', key, 0);
+        subList.Visit(*this);
+        mText += '}';
     }
 
     std::string mText;
 
 private:
-    // Lengths come first, so that no content can pass for the end of its entry.
+    // Lengths come first, so that no content can pass for the end of its entry or list.
     void Begin(char type, const UTF8String& key, std::size_t number)
     {
         mText += type + std::to_string(key.size()) + ':';
