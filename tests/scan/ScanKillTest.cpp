@@ -28,10 +28,18 @@ protected:
         }
     }
 
-    bool IsAllDone() const
+    // What the files hold.
+    struct Books
     {
-        std::set<std::string> done = Records();
-        for (const auto& [name, reason] : Blocks())
+        std::set<std::string> records;
+        std::map<std::string, std::string> blocks;
+    };
+    Books Read() const { return {Records(), Blocks()}; }
+
+    bool IsAllDone(const Books& books) const
+    {
+        std::set<std::string> done = books.records;
+        for (const auto& [name, reason] : books.blocks)
         {
             done.insert(name);
         }
@@ -39,9 +47,9 @@ protected:
     }
 
     // Something to do for the next scan: the rest, or all again in one of three ways.
-    std::vector<std::string> NextScan(unsigned int round) const
+    std::vector<std::string> NextScan(unsigned int round, Books& books) const
     {
-        if (!IsAllDone())
+        if (!IsAllDone(books))
         {
             return {"scan"};
         }
@@ -49,6 +57,7 @@ protected:
         {
         case 0:
             fs::remove_all(Settings());
+            books = {};
             return {"scan"};
         case 1:
             return {"scan", "--full"};
@@ -57,60 +66,81 @@ protected:
         }
     }
 
+    // The kill meets zebhost alone or its whole process group.
+    void RunAndKill(const std::vector<std::string>& arguments, std::chrono::microseconds delay, bool group) const
+    {
+        StartedProgram scan(CommandLine(arguments), mVariables, mFolder);
+        std::this_thread::sleep_for(delay);
+        group ? scan.SignalGroup(SIGKILL) : scan.Signal(SIGKILL);
+        scan.Wait();
+    }
+
+    // Returns how many plug-ins are blocked now that were not before.
+    static std::size_t CheckBooks(const Books& before, const Books& after)
+    {
+        EXPECT_TRUE(
+            std::includes(after.records.begin(), after.records.end(), before.records.begin(), before.records.end()))
+            << "lost a record: " << testing::PrintToString(before.records) << " became "
+            << testing::PrintToString(after.records);
+        std::size_t fresh = 0;
+        for (const auto& [name, reason] : after.blocks)
+        {
+            fresh += before.blocks.count(name) == 0 ? 1U : 0U;
+            EXPECT_THAT(reason, HasSubstr("at hand in a scan that did not end"));
+        }
+        EXPECT_LE(fresh, 1U);
+        return fresh;
+    }
+
+    void CheckThatNothingWasScannedTwice(const Books& before) const
+    {
+        for (const Load& load : Loads())
+        {
+            EXPECT_EQ(before.records.count(load.name), 0U) << "scanned twice: " << load.name;
+        }
+    }
+
     std::set<std::string> mAll;
 };
+
+unsigned int Seed()
+{
+    const char* const given = std::getenv("ZEB_SEED");
+    const unsigned int seed =
+        given != nullptr ? static_cast<unsigned int>(std::stoul(given)) : std::random_device()();
+    std::cout << "ZEB_SEED=" << seed << "\n";
+    return seed;
+}
 
 // The kill falls anywhere between the start of the program and a time at which some plug-ins are done.
 TEST_F(ScanKillTest, FiveHundredKillsLoseNothing)
 {
-    const unsigned int seed = std::getenv("ZEB_SEED") != nullptr
-                                  ? static_cast<unsigned int>(std::stoul(std::getenv("ZEB_SEED")))
-                                  : std::random_device()();
-    std::cout << "ZEB_SEED=" << seed << "\n";
     const unsigned int kills = Slowness() > 1 ? 60 : 500;
-    std::mt19937 random(seed);
+    std::mt19937 random(Seed());
     std::uniform_int_distribution<int> microseconds(0, static_cast<int>(60000 * Slowness()));
     std::size_t blocksMade = 0;
     std::size_t recordsMade = 0;
+    Books before = Read();
     for (unsigned int round = 0; round < kills && !HasFailure(); ++round)
     {
-        const std::vector<std::string> arguments = NextScan(round);
-        const std::set<std::string> recordsBefore = Records();
-        const std::map<std::string, std::string> blocksBefore = Blocks();
+        const std::vector<std::string> arguments = NextScan(round, before);
+        SCOPED_TRACE("round " + std::to_string(round) + " " + testing::PrintToString(arguments));
         ForgetLoads();
-        {
-            StartedProgram scan(CommandLine(arguments), mVariables, mFolder);
-            std::this_thread::sleep_for(std::chrono::microseconds(microseconds(random)));
-            round % 2 == 0 ? scan.SignalGroup(SIGKILL) : scan.Signal(SIGKILL);
-            scan.Wait();
-        }
-        const std::set<std::string> records = Records();
-        const std::map<std::string, std::string> blocks = Blocks();
-        const auto context = testing::Message() << "round " << round << testing::PrintToString(arguments);
-        EXPECT_TRUE(std::includes(records.begin(), records.end(), recordsBefore.begin(), recordsBefore.end()))
-            << context << " lost a record: " << testing::PrintToString(recordsBefore) << " became "
-            << testing::PrintToString(records);
-        std::size_t fresh = 0;
-        for (const auto& [name, reason] : blocks)
-        {
-            fresh += blocksBefore.count(name) == 0 ? 1U : 0U;
-            EXPECT_THAT(reason, HasSubstr("at hand in a scan that did not end")) << context;
-        }
-        EXPECT_LE(fresh, 1U) << context;
+        RunAndKill(arguments, std::chrono::microseconds(microseconds(random)), round % 2 == 0);
+        Books after = Read();
+        blocksMade += CheckBooks(before, after);
+        recordsMade += after.records.size() - std::min(after.records.size(), before.records.size());
         if (arguments.size() == 1)
         {
-            for (const Load& load : Loads())
-            {
-                EXPECT_EQ(recordsBefore.count(load.name), 0U) << context << " scanned twice: " << load.name;
-            }
+            CheckThatNothingWasScannedTwice(before);
         }
-        blocksMade += fresh;
-        recordsMade += records.size() - std::min(records.size(), recordsBefore.size());
         if (round % 20 == 19)
         {
             Succeed({"scan", "--quiet"});
-            EXPECT_TRUE(IsAllDone()) << context << ": the next scan has to go on to the end";
+            after = Read();
+            EXPECT_TRUE(IsAllDone(after)) << "the next scan has to go on to the end";
         }
+        before = std::move(after);
     }
     // Kills that met nothing would prove nothing.
     EXPECT_GT(blocksMade, kills / 40);
