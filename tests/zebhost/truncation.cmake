@@ -10,3 +10,4 @@ target_compile_definitions(zebhost_truncation_test PRIVATE ZEBHOST_PROGRAM="$<TA
 add_dependencies(zebhost_truncation_test zebhost)
 zeb_use_fixtures(zebhost_truncation_test)
 add_test(NAME zebhost_truncation_test COMMAND zebhost_truncation_test)
+set_tests_properties(zebhost_truncation_test PROPERTIES TIMEOUT 900)
