@@ -116,8 +116,9 @@ std::string PathOf(const PluginLocator& locator)
 
 bool IsInstalled(const PluginLocator& locator)
 {
-    const auto technology = PluginModuleInfoManager::GetInstance().GetPluginTechnology(locator.GetTechnologyType());
-    if (technology != nullptr && !technology->HasDirectories())
+    const TechnologyType type = locator.GetTechnologyType();
+    const auto technology = PluginModuleInfoManager::GetInstance().GetPluginTechnology(type);
+    if (technology != nullptr && type == zebaudiofilterhost::kTechnologyAudioUnit) // names in a registry
     {
         const std::vector<PluginLocator> found = technology->CollectPlugins();
         return std::find(found.begin(), found.end(), locator) != found.end();
