@@ -199,6 +199,8 @@ TEST_F(VST2Test, MembersOfAShellAreReachedByName)
     const Sound inverted = Rendered(shell + "#Zeb Invert");
     EXPECT_TRUE(inverted.channels[0] == Inverted(mInput.channels[0]));
     Succeed({"scan", "--quiet"});
+    // By the catalogue alone, in a process that has not scanned.
+    EXPECT_EQ(Succeed({"info", "Zeb Swap", "--json"}).Json().at("filter").at("name"), "Zeb Swap");
     const Sound swapped = Rendered("Zeb Swap");
     EXPECT_TRUE(swapped.channels[0] == mInput.channels[1] && swapped.channels[1] == mInput.channels[0]);
 }

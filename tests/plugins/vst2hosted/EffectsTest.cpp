@@ -118,4 +118,20 @@ TEST_F(HostedVST2, AFreshInstanceWithASavedStateGivesTheSameSamples)
     }
 }
 
+TEST_F(HostedVST2, ACloneIsTheSameMemberInTheSameState)
+{
+    for (const auto& [name, member] : {std::pair{"ZebShell2", 1U}, {"ZebEcho2", 0U}})
+    {
+        const auto descriptors = Scan(VST2Effect(name));
+        ASSERT_GT(descriptors.size(), member);
+        const FilterPtr filter = zebaudiofilterhost::utility::CreateAudioFilter(descriptors[member]->GetUniqueID());
+        filter->SetParameter(0, 0.3F);
+        const FilterPtr clone = AudioFilter::Clone(filter);
+        ASSERT_NE(clone, nullptr);
+        EXPECT_EQ(clone->GetID(), filter->GetID());
+        EXPECT_EQ(clone->GetDisplayName(), filter->GetDisplayName());
+        EXPECT_TRUE(Through(*clone) == Through(*filter)) << name;
+    }
+}
+
 } // namespace
