@@ -1,3 +1,4 @@
+#include "tests/plugins/FixturePaths.h"
 #include "tests/scan/support/ScanFolder.h"
 
 #include <iomanip>
@@ -139,6 +140,25 @@ TEST_F(ScanSurvivalTest, ThePluginAtHandIsNotBlamedForAWorkerThatNeverTurnedToIt
     EXPECT_EQ(document.at("restarts"), 1);
     EXPECT_TRUE(Blocks().empty());
     EXPECT_EQ(CountLoads().at("b"), 1);
+}
+
+// Where one technology's share of a scan ends, the step into the next must not hit a plug-in that nobody announced.
+TEST_F(ScanSurvivalTest, ACrashBehindTheLastOfATechnologyIsNotBlamedOnThat)
+{
+    const std::filesystem::path folder = mFolder / "vst2";
+    std::filesystem::create_directories(folder);
+    mVariables["VST_PATH"] = folder.string();
+    std::filesystem::copy(VST2Effect("ZebGain2Plain"), folder / "z.so");
+    AddBundle("a-segv");
+    AddBundle("b");
+    EXPECT_THAT(States(Succeed({"scan", "--json"}).Json()),
+                ElementsAre(Pair("a-segv", "crashed"), Pair("b", "scanned"), Pair("z", "scanned")));
+    EXPECT_THAT(Blocks(), ElementsAre(Pair("a-segv", HasSubstr("SIGSEGV"))));
+    std::filesystem::copy(VST2Hazard("CrashInEntry"), folder / "zz.so");
+    AddBundle("c");
+    EXPECT_EQ(States(Succeed({"scan", "--json"}).Json()).at("zz"), "crashed");
+    EXPECT_THAT(Records(), ElementsAre("b", "c"));
+    EXPECT_EQ(Blocks().size(), 2U);
 }
 
 TEST_F(ScanSurvivalTest, ABundleThatWasNamedDecidesTheExitCode)

@@ -14,6 +14,8 @@
 #include <sys/socket.h>
 #include <unistd.h>
 
+extern "C" char** environ; // which not every system's headers declare
+
 namespace zebhost
 {
 
@@ -96,8 +98,8 @@ int Spawn(pid_t& process, std::vector<std::string> words, int channel, int print
         pointers.push_back(word.data());
     }
     pointers.push_back(nullptr);
-    posix_spawnattr_t attributes;
-    posix_spawn_file_actions_t actions;
+    posix_spawnattr_t attributes{};
+    posix_spawn_file_actions_t actions{};
     posix_spawnattr_init(&attributes);
     posix_spawn_file_actions_init(&actions);
     SetAttributes(attributes);
