@@ -20,10 +20,11 @@ using zebaudiofilterhost::PluginModuleInfoManager;
 namespace
 {
 
+// What is no file is looked up among all that is found, from which the blocked are left out.
 bool IsThere(const PluginLocator& locator)
 {
-    std::error_code error;
-    return std::filesystem::exists(PathOf(locator), error);
+    return IsInstalled(locator) || (locator.GetTechnologyType() == zebaudiofilterhost::kTechnologyAudioUnit &&
+                                    BannedPluginManager::GetInstance().IsPluginBanned(locator));
 }
 
 bool IsKnown(const PluginLocator& locator)
