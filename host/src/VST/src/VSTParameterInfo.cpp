@@ -45,9 +45,10 @@ UTF16String ReadLabel(AEffect* effect, int index)
 
 } // namespace
 
+// Braces, so that the plug-in is asked for the name before the label.
 VSTParameterInfo::VSTParameterInfo(AEffect* inAEffect, int index)
-    : AudioFilterParameterInfo(ReadName(inAEffect, index), ReadLabel(inAEffect, index),
-                               AudioFilterParameterInfoUnit())
+    : AudioFilterParameterInfo{ReadName(inAEffect, index), ReadLabel(inAEffect, index),
+                               AudioFilterParameterInfoUnit()}
     , VSTDispatcherBase(inAEffect)
     , mIndex(index)
 {
