@@ -66,7 +66,7 @@ Unit::Unit(UnitDescription description)
     , mCallbacks(mDescription.inputs.size())
 {
     for (const ParameterDescription& parameter : mDescription.parameters)
-        mValues.emplace(parameter.id, parameter.defaultValue);
+        mValues.try_emplace(parameter.id, parameter.defaultValue);
     for (const FactoryPreset& preset : mDescription.presets)
         mPresets.push_back({static_cast<SInt32>(mPresets.size()),
                             CFStringCreateWithCString(nullptr, preset.name, kCFStringEncodingUTF8)});
@@ -280,7 +280,7 @@ OSStatus Unit::SetPreset(const AUPreset& preset)
     if (preset.presetNumber < 0 || static_cast<std::size_t>(preset.presetNumber) >= mDescription.presets.size())
         return kAudioUnitErr_InvalidPropertyValue;
     for (const auto& [id, value] : mDescription.presets[static_cast<std::size_t>(preset.presetNumber)].values)
-        mValues[id] = value;
+        mValues.at(id) = value;
     return noErr;
 }
 
@@ -298,7 +298,7 @@ CFPropertyListRef Unit::CopyClassInfo() const
     for (const auto& [id, value] : mValues)
     {
         CFStringRef key = CFStringCreateWithCString(nullptr, std::to_string(id).c_str(), kCFStringEncodingASCII);
-        const Float64 wide = static_cast<Float64>(value);
+        const auto wide = static_cast<Float64>(value.load());
         SetNumber(info, key, kCFNumberFloat64Type, &wide);
         CFRelease(key);
     }
@@ -316,8 +316,11 @@ OSStatus Unit::SetClassInfo(CFPropertyListRef list)
         CFStringRef key = CFStringCreateWithCString(nullptr, std::to_string(id).c_str(), kCFStringEncodingASCII);
         const void* number = CFDictionaryGetValue(info, key);
         CFRelease(key);
-        if (number && CFGetTypeID(number) == CFNumberGetTypeID())
-            CFNumberGetValue(static_cast<CFNumberRef>(number), kCFNumberFloat32Type, &value);
+        if (!number || CFGetTypeID(number) != CFNumberGetTypeID())
+            continue;
+        Float32 saved = 0.0F;
+        CFNumberGetValue(static_cast<CFNumberRef>(number), kCFNumberFloat32Type, &saved);
+        value = saved;
     }
     LoadState(info);
     return noErr;
@@ -345,7 +348,7 @@ OSStatus Unit::SetParameter(AudioUnitParameterID id, AudioUnitScope scope, Float
     const ParameterDescription* parameter = FindParameter(id);
     if (scope != kAudioUnitScope_Global || !parameter)
         return kAudioUnitErr_InvalidParameter;
-    mValues[id] = std::clamp(value, parameter->minimum, parameter->maximum);
+    mValues.at(id) = std::clamp(value, parameter->minimum, parameter->maximum);
     return noErr;
 }
 

@@ -3,6 +3,7 @@
 #include <AudioToolbox/AudioToolbox.h>
 
 #include <array>
+#include <atomic>
 #include <map>
 #include <memory>
 #include <vector>
@@ -74,7 +75,7 @@ protected:
     virtual void SaveState(CFMutableDictionaryRef state) const;
     virtual void LoadState(CFDictionaryRef state);
 
-    Float32 GetValue(AudioUnitParameterID id) const { return mValues.at(id); }
+    Float32 GetValue(AudioUnitParameterID id) const { return mValues.at(id).load(std::memory_order_relaxed); }
     Float64 GetSampleRate() const { return mOutputFormat.mSampleRate; }
     UInt32 GetInputChannels(std::size_t input) const { return mInputFormats[input].mChannelsPerFrame; }
     UInt32 GetOutputChannels() const { return mOutputFormat.mChannelsPerFrame; }
@@ -96,8 +97,8 @@ private:
     void PullInput(std::size_t input, const AudioTimeStamp& time, UInt32 frames);
 
     UnitDescription mDescription;
-    std::map<AudioUnitParameterID, Float32> mValues;
-    std::vector<AUPreset> mPresets; // with their names
+    std::map<AudioUnitParameterID, std::atomic<Float32>> mValues; // a view and the host's thread of sound share them
+    std::vector<AUPreset> mPresets;                               // with their names
     std::vector<AudioStreamBasicDescription> mInputFormats;
     AudioStreamBasicDescription mOutputFormat;
     std::vector<AURenderCallbackStruct> mCallbacks; // of each input

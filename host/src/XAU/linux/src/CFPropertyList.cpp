@@ -3,6 +3,7 @@
 #include "CoreFoundation/CFData.h"
 #include "CoreFoundation/CFStream.h"
 #include "host/src/XAU/linux/src/CFStreamObject.h"
+#include "host/src/XAU/linux/src/PropertyListGuard.h"
 #include "host/src/XAU/linux/src/PropertyListNodes.h"
 
 #include <cstdint>
@@ -22,7 +23,7 @@ void ClearError(CFErrorRef* error)
 
 CFPropertyListRef Parse(std::span<const UInt8> bytes, CFPropertyListFormat* format)
 {
-    if (bytes.empty() || bytes.size() > std::numeric_limits<std::uint32_t>::max())
+    if (bytes.empty() || bytes.size() > std::numeric_limits<std::uint32_t>::max() || cf::HasZeroInText(bytes))
         return nullptr;
     const auto* text = reinterpret_cast<const char*>(bytes.data());
     const auto count = static_cast<std::uint32_t>(bytes.size());

@@ -76,6 +76,9 @@ GenericView::~GenericView()
     if (mListener)
         AUListenerDispose(mListener);
     zebcore::threads::RemoveDescriptorWatch(mWatch);
+    // cairo keeps what it knows of a connection under its address, which the next one may get.
+    cairo_device_finish(mDevice);
+    cairo_device_destroy(mDevice);
     xcb_disconnect(mConnection); // the window goes with it
 }
 
@@ -238,6 +241,8 @@ void GenericView::Paint()
 {
     cairo_surface_t* surface =
         cairo_xcb_surface_create(mConnection, mWindow, mVisual, mGeometry.width, mGeometry.height);
+    if (!mDevice)
+        mDevice = cairo_device_reference(cairo_surface_get_device(surface));
     cairo_t* context = cairo_create(surface);
     cairo_push_group(context); // at once, without flicker
     PaintView(context, mGeometry, mRows);

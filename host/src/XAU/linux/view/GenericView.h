@@ -45,6 +45,7 @@ private:
     xcb_connection_t* mConnection;
     xcb_window_t mWindow = XCB_NONE;
     xcb_visualtype_t* mVisual = nullptr; // the connection's
+    cairo_device_t* mDevice = nullptr;   // one reference, once something is drawn
     zebcore::threads::WatchID mWatch = zebcore::threads::kNoWatch;
     AudioUnit mUnit;
     AUEventListenerRef mListener = nullptr;

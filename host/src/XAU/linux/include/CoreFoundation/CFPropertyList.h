@@ -2,7 +2,8 @@
 
 #include "CoreFoundation/CFBase.h"
 
-// Property lists: strings, numbers, Booleans, dates, data, arrays, and dictionaries by string.
+// Property lists: strings, numbers, Booleans, dates, data, arrays, and dictionaries by string. A string is written up
+// to a zero in it, and bytes with one in a string are no property list here.
 
 enum CFPropertyListFormat : CFIndex
 {
