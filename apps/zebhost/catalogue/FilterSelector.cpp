@@ -76,7 +76,7 @@ std::vector<std::string> Candidates(const Descriptors& descriptors)
     for (std::size_t index = 0; index < std::min(descriptors.size(), kMost); ++index)
     {
         const Catalogue::Descriptor& each = descriptors[index];
-        lines.push_back(NameOf(each) + "  [" + ToUTF8(each->GetUniqueID()) + "]  " + PathOf(each->GetLocator()));
+        lines.push_back(NameOf(each) + "  [" + ToUTF8(each->GetUniqueID()) + "]  " + PlaceOf(each->GetLocator()));
     }
     if (descriptors.size() > kMost)
     {

@@ -4,6 +4,7 @@
 #include "output/PrintableText.h"
 
 #include <host/PluginModule.h>
+#include <host/TechnologyType.h>
 
 namespace zebhost
 {
@@ -13,6 +14,10 @@ std::string LoadProblem(const zebaudiofilterhost::PluginLocator& locator)
     std::string problem = Printable(zebaudiofilterhost::PluginModule::GetLoadProblem(locator.GetPath()));
     if (problem.empty())
     {
+        if (locator.GetTechnologyType() == zebaudiofilterhost::kTechnologyAudioUnit)
+        {
+            return PlaceOf(locator) + " gives no instance: its binary is missing, cannot be loaded or refuses";
+        }
         return PathOf(locator) + " holds no audio plug-in: none of its classes is one";
     }
     while (problem.back() == '.')

@@ -1,6 +1,7 @@
 #include "catalogue/PluginFinder.h"
 
 #include "cli/Failure.h"
+#include "output/PrintableText.h"
 
 #include <foundation/zebcore/NativePath.h>
 #include <host/PluginModuleInfoManager.h>
@@ -112,6 +113,15 @@ PluginLocator BundleLocator(const fs::path& path)
 std::string PathOf(const PluginLocator& locator)
 {
     return ToNativePath(locator.GetPath());
+}
+
+std::string PlaceOf(const PluginLocator& locator)
+{
+    const TechnologyType type = locator.GetTechnologyType();
+    const auto technology = PluginModuleInfoManager::GetInstance().GetPluginTechnology(type);
+    return technology != nullptr && type == zebaudiofilterhost::kTechnologyAudioUnit
+               ? Printable(technology->GetPathDisplayString(locator.GetPath()))
+               : PathOf(locator);
 }
 
 bool IsInstalled(const PluginLocator& locator)

@@ -18,6 +18,9 @@ zebaudiofilterhost::PluginLocator BundleLocator(const std::filesystem::path& pat
 
 std::string PathOf(const zebaudiofilterhost::PluginLocator& locator);
 
+// For the user's eyes: the path, and for a plug-in that is no file the name by which its system knows it.
+std::string PlaceOf(const zebaudiofilterhost::PluginLocator& locator);
+
 // Whether the plug-in's file or bundle is there; for one that is no file, whether its technology still finds it.
 bool IsInstalled(const zebaudiofilterhost::PluginLocator& locator);
 

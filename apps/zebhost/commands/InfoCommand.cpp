@@ -26,6 +26,16 @@ bool IsSideChain(const AudioFilterBusDescription& bus)
     return bus.GetType() == AudioFilterBusDescription::kBusType_SideChain;
 }
 
+// Audio Units have no buses before something is asked of them.
+void ShowBuses(AudioFilter& filter)
+{
+    const zebaudiofilterhost::ChannelLayout stereo = zebmediatypes::CreateStereoChannelLayout();
+    if (filter.GetInputBuses().empty() && filter.GetOutputBuses().empty())
+    {
+        filter.RequestIOConfiguration({stereo}, {stereo});
+    }
+}
+
 Json BusesJson(const std::vector<AudioFilterBusDescription>& buses)
 {
     Json list = Json::array();
@@ -97,7 +107,7 @@ std::string Text(const CommandContext& context, const FilterOfCommand& filter)
     return filter.Name() + (vendor.empty() ? "" : " by " + vendor) + "\n" +                                   //
            "ID:           " + ToUTF8(descriptor.GetUniqueID()) + "\n" +                                       //
            "Kind:         " + TechnologyName(descriptor) + (category.empty() ? "" : ", " + category) + "\n" + //
-           "Path:         " + PathOf(descriptor.GetLocator()) + "\n" +                                        //
+           "Path:         " + PlaceOf(descriptor.GetLocator()) + "\n" +                                       //
            BusLines("Input:        ", filter->GetInputBuses()) +                                              //
            BusLines("Output:       ", filter->GetOutputBuses()) +                                             //
            "Latency:      " + Counted(static_cast<std::size_t>(std::max(filter->GetInitialDelay(), 0)), "frame") +
@@ -113,6 +123,7 @@ std::string Text(const CommandContext& context, const FilterOfCommand& filter)
 ExitCode RunInfo(CommandContext& context)
 {
     const FilterOfCommand filter(context);
+    ShowBuses(*filter);
     if (context.WantsJson())
     {
         context.Print(Document(context, filter));

@@ -24,7 +24,7 @@ bool Holds(const AudioFilterDescriptor& descriptor, const std::string& text)
 {
     const std::vector<std::string> places = {DisplayName(descriptor), Printable(descriptor.GetVendorString()),
                                              Printable(descriptor.GetCategoryName()),
-                                             ToUTF8(descriptor.GetUniqueID()), PathOf(descriptor.GetLocator())};
+                                             ToUTF8(descriptor.GetUniqueID()), PlaceOf(descriptor.GetLocator())};
     return std::any_of(places.begin(), places.end(),
                        [&text](const std::string& place) { return ContainsIgnoringCase(place, text); });
 }
@@ -63,7 +63,7 @@ void PrintTable(const CommandContext& context, const std::vector<Catalogue::Desc
     {
         table.AddRow({DisplayName(*each), Printable(each->GetVendorString()), Printable(each->GetCategoryName()),
                       Layouts(*each), TechnologyName(*each), ToUTF8(each->GetUniqueID()),
-                      PathOf(each->GetLocator())});
+                      PlaceOf(each->GetLocator())});
     }
     context.console.Print(table.Text(context.console.HasOutputColour()));
 }

@@ -73,8 +73,9 @@ ScanReport::ScanReport(const CommandContext& context, const ScanPlan& plan) : mC
 void ScanReport::Stepping(const PluginLocator& locator, const std::string& detail, std::size_t current,
                           std::size_t total)
 {
-    const std::string name =
-        std::filesystem::path(PathOf(locator)).stem().string() + (detail.empty() ? "" : " ") + detail;
+    const bool isFile = PlaceOf(locator) == PathOf(locator);
+    const std::string plugin = isFile ? std::filesystem::path(PathOf(locator)).stem().string() : PlaceOf(locator);
+    const std::string name = plugin + (detail.empty() ? "" : " ") + detail;
     if (mContext.console.IsErrorTerminal())
     {
         mContext.console.ShowProgress(
@@ -89,12 +90,12 @@ void ScanReport::Stepping(const PluginLocator& locator, const std::string& detai
 void ScanReport::Finished(const PluginLocator& locator, const Outcome& outcome)
 {
     const std::string path = PathOf(locator);
-    mResults.push_back(
-        {path, StateOf(outcome.end), outcome.problem, outcome.effects, zebhost::FailureOf(path, outcome)});
+    mResults.push_back({path, PlaceOf(locator), StateOf(outcome.end), outcome.problem, outcome.effects,
+                        zebhost::FailureOf(path, outcome)});
     ++mFinished;
     if (outcome.end == End::Crashed || outcome.end == End::TimedOut)
     {
-        mContext.console.Remark("zebhost: " + path + " " + outcome.problem + "; it is blocked now");
+        mContext.console.Remark("zebhost: " + PlaceOf(locator) + " " + outcome.problem + "; it is blocked now");
     }
 }
 
@@ -121,7 +122,7 @@ void ScanReport::Add(const std::vector<ScanPlan::Item>& items, const char* state
 {
     for (const ScanPlan::Item& item : items)
     {
-        mResults.push_back({PathOf(item.locator), state, item.why, 0, std::nullopt});
+        mResults.push_back({PathOf(item.locator), PlaceOf(item.locator), state, item.why, 0, std::nullopt});
     }
 }
 
@@ -157,7 +158,7 @@ void ScanReport::Print(Json document) const
     for (const Result& result : mResults)
     {
         const std::string effects = result.effects == 0 ? "no effect in it" : Counted(result.effects, "effect");
-        table.AddRow({result.state, result.path, result.state == kScanned ? effects : result.detail});
+        table.AddRow({result.state, result.place, result.state == kScanned ? effects : result.detail});
         document["plugins"].push_back(Json{
             {"path", result.path}, {"state", result.state}, {"effects", result.effects}, {"reason", result.detail}});
     }

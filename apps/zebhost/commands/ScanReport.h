@@ -39,6 +39,7 @@ private:
     struct Result
     {
         std::string path;
+        std::string place; // for the user's eyes
         std::string state;
         std::string detail;
         std::size_t effects = 0;

@@ -22,7 +22,7 @@ namespace
 
 std::string Title(const Catalogue::Descriptor& descriptor)
 {
-    return DisplayName(*descriptor) + " in " + PathOf(descriptor->GetLocator());
+    return DisplayName(*descriptor) + " in " + PlaceOf(descriptor->GetLocator());
 }
 
 void CheckUsable(const Catalogue::Descriptor& descriptor)
