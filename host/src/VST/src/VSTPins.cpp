@@ -8,7 +8,7 @@ namespace zebaudiofilterhost::vst
 namespace
 {
 
-// Some plug-ins touch more pins than they tell of, or grow some when they are switched on.
+// Some plug-ins touch more pins than they tell of.
 constexpr std::size_t kSparePointers = 64;
 
 // Mono buses may stand before two pins.
@@ -17,9 +17,9 @@ constexpr int kMinPins = 2;
 // What the plug-in was told when it was opened.
 constexpr int kMinFrames = 2048;
 
-std::size_t PinCount(int pins, int channels)
+std::size_t PinCount(int pins)
 {
-    return static_cast<std::size_t>(std::clamp(std::max(pins, channels), kMinPins, VSTPins::kMaxPins));
+    return static_cast<std::size_t>(std::clamp(pins, kMinPins, VSTPins::kMaxPins));
 }
 
 std::size_t ChannelCount(int channels)
@@ -29,17 +29,23 @@ std::size_t ChannelCount(int channels)
 
 } // namespace
 
-void VSTPins::Prepare(int inputPins, int outputPins, int inputChannels, int outputChannels, int blockSize)
+// Always for all pins that there may be: a plug-in may grow some whenever it is called, in the middle of being
+// switched on for instance.
+void VSTPins::Prepare(int inputChannels, int outputChannels, int blockSize)
 {
     mInputChannels = ChannelCount(inputChannels);
     mOutputChannels = ChannelCount(outputChannels);
-    mInputPins = PinCount(inputPins, inputChannels);
-    mOutputPins = PinCount(outputPins, outputChannels);
     const auto frames = static_cast<std::size_t>(std::max(blockSize, kMinFrames));
     mSilence.assign(frames, 0.0F);
     mDiscard.assign(frames, 0.0F);
-    mInputs.assign(mInputPins + kSparePointers, mSilence.data());
-    mOutputs.assign(mOutputPins + kSparePointers, mDiscard.data());
+    mInputs.assign(kMaxPins + kSparePointers, mSilence.data());
+    mOutputs.assign(kMaxPins + kSparePointers, mDiscard.data());
+}
+
+void VSTPins::Follow(int inputPins, int outputPins)
+{
+    mInputPins = PinCount(inputPins);
+    mOutputPins = PinCount(outputPins);
 }
 
 } // namespace zebaudiofilterhost::vst

@@ -14,8 +14,11 @@ public:
     /// Pins beyond these are a lie of the plug-in's.
     static constexpr int kMaxPins = 4096;
 
-    /// Sizes everything for a plug-in with so many pins, and buses with so many channels. [main, suspended]
-    void Prepare(int inputPins, int outputPins, int inputChannels, int outputChannels, int blockSize);
+    /// Sizes everything for buses with so many channels, and for as many pins as there may be. [main, suspended]
+    void Prepare(int inputChannels, int outputChannels, int blockSize);
+
+    /// What the plug-in says of its pins now; to be told ahead of each Connect or ConnectMono. [process]
+    void Follow(int inputPins, int outputPins);
 
     /// Most frames that the pins beyond the buses can take at once; 1 or more behind Prepare. [process]
     int GetMaxFrames() const { return static_cast<int>(mSilence.size()); }

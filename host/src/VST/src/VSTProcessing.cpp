@@ -62,6 +62,7 @@ void VSTAudioFilter::Process(float** in, float** out, int frames, ChannelFlags /
 
 void VSTAudioFilter::ProcessSlice(AEffect& effect, float** in, float** out, int offset, int frames)
 {
+    mPins.Follow(effect.numInputs, effect.numOutputs);
     if (mMonoThroughStereo)
         mPins.ConnectMono(in, out, offset, frames, mScratchOutput);
     else

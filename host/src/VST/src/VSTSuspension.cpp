@@ -60,9 +60,7 @@ void VSTAudioFilter::PreparePins()
     // Each count stands for itself: no order is needed.
     mFirstInputBusChannels.store(ChannelsOfFirst(GetInputBuses()), std::memory_order_relaxed);
     mFirstOutputBusChannels.store(ChannelsOfFirst(GetOutputBuses()), std::memory_order_relaxed);
-    const AEffect* const effect = GetEffect();
-    mPins.Prepare(effect ? effect->numInputs : 0, effect ? effect->numOutputs : 0, GetNumberOfInputChannels(),
-                  GetNumberOfOutputChannels(), mBlockSize);
+    mPins.Prepare(GetNumberOfInputChannels(), GetNumberOfOutputChannels(), mBlockSize);
 }
 
 } // namespace zebaudiofilterhost::vst
