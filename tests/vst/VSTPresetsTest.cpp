@@ -132,9 +132,28 @@ TEST_F(Presets, FactoryPresetsOutOfRangeAndTheFirstAreIgnored)
         filter->SetFactoryPreset(index);
     EXPECT_TRUE(fake.Calls().empty());
     fake.effect.numPrograms = -5;
+    EXPECT_EQ(filter->GetNumFactoryPresets(), 0);
     filter->SetFactoryPreset(1);
     EXPECT_TRUE(filter->GetFactoryPresetName(0).empty());
     EXPECT_TRUE(fake.Calls().empty());
+}
+
+TEST_F(Presets, ALieAboutTheirNumberIsNotWalkedThrough)
+{
+    Make({"A"});
+    fake.recording = false;
+    int asked = 0;
+    fake.On(effGetProgramNameIndexed,
+            [&asked](int, long long, void*, float)
+            {
+                ++asked;
+                return 0LL;
+            });
+    fake.effect.numPrograms = INT_MAX;
+    EXPECT_EQ(filter->GetNumFactoryPresets(), 32768);
+    PresetList list(propList);
+    filter->GetFactoryDefaultPresets(list);
+    EXPECT_EQ(asked, 32768);
 }
 
 TEST_F(Presets, DefaultListHoldsTheStateAndReferences)

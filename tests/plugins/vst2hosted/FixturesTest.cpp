@@ -105,7 +105,7 @@ constexpr Expected kExpected[] = {
     {.name = "ManyParameters", .parameters = 3000},
     {.name = "NoDisplays"},
     {.name = "HugeCounts", .parameters = 20000, .presets = 20000},
-    {.name = "NegativeCounts", .parameters = 0, .inputs = 0, .outputs = 0, .presets = -1},
+    {.name = "NegativeCounts", .parameters = 0, .inputs = 0, .outputs = 0, .presets = 0},
     {.name = "FullTexts"},
     {.name = "IllFormedTexts"},
     {.name = "EmptyProgramName"},

@@ -4,6 +4,7 @@
 #include "host/src/VST/src/VSTAudioFilter.h"
 #include "host/src/VST/src/VSTText.h"
 
+#include <algorithm>
 #include <array>
 #include <cstdint>
 #include <limits>
@@ -22,6 +23,9 @@ constexpr std::size_t kProgramNameSize = 73;
 // Sizes are 32-bit numbers in most plug-ins; a larger one is garbage.
 constexpr long long kMaxChunkSize = std::numeric_limits<std::int32_t>::max();
 
+// Programs beyond these are a lie of the plug-in's.
+constexpr int kMaxPrograms = 32768;
+
 } // namespace
 
 bool VSTAudioFilter::DoPresetsUseChunkData() const
@@ -31,7 +35,7 @@ bool VSTAudioFilter::DoPresetsUseChunkData() const
 
 int VSTAudioFilter::GetNumFactoryPresets() const
 {
-    return GetEffect() ? GetEffect()->numPrograms : 0;
+    return GetEffect() ? std::clamp(GetEffect()->numPrograms, 0, kMaxPrograms) : 0;
 }
 
 UTF16String VSTAudioFilter::GetFactoryPresetName(int index) const
