@@ -57,6 +57,19 @@ VSTAudioFilter::VSTAudioFilter(const UTF16String& filterID, const UTF16String& p
     // Ahead of the first dispatcher call, which may already call back.
     sCallbackMap.Insert(effect, [this](int opcode, int index, long long value, void* ptr, float opt)
                         { return AudioMasterCallback(opcode, index, value, ptr, opt); });
+    try
+    {
+        OpenPlugin(path, useFileTitle);
+    }
+    catch (...) // no destructor follows
+    {
+        ClosePlugin();
+        throw;
+    }
+}
+
+void VSTAudioFilter::OpenPlugin(const UTF16String& path, bool useFileTitle)
+{
     Dispatcher(effOpen, 0, 0, nullptr, 0.0F);
     Dispatcher(effSetSampleRate, 0, 0, nullptr, kOpeningSampleRate);
     Dispatcher(effSetBlockSize, 0, kOpeningBlockSize, nullptr, 0.0F);
@@ -65,13 +78,18 @@ VSTAudioFilter::VSTAudioFilter(const UTF16String& filterID, const UTF16String& p
     BuildIOConfiguration();
 }
 
-VSTAudioFilter::~VSTAudioFilter()
+// From here on the plug-in gets the static answers. Its calls that are still under way on threads of its own have
+// ended when effClose returns, since these threads live in what it then takes down; all that such a call can reach is
+// still there.
+void VSTAudioFilter::ClosePlugin()
 {
-    // From here on the plug-in gets the static answers. Its calls that are still under way on threads of its own have
-    // ended when effClose returns, since these threads live in what it then takes down; all that such a call can
-    // reach is still there.
     sCallbackMap.Erase(GetEffect());
     Dispatcher(effClose, 0, 0, nullptr, 0.0F);
+}
+
+VSTAudioFilter::~VSTAudioFilter()
+{
+    ClosePlugin();
     FreeCurrentSpeakerArrangements();
     mEditor.reset();
 }

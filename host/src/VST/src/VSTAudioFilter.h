@@ -90,8 +90,10 @@ public:
     static void SetCurrentFilterID(int filterID);
 
 private:
-    // Construction.
+    // Construction and destruction.
     void StartTimeInfo();
+    void OpenPlugin(const UTF16String& path, bool useFileTitle);
+    void ClosePlugin();
     UTF16String ChooseDisplayName(const UTF16String& path, bool useFileTitle) const;
     void BuildParameterInfos();
 
