@@ -29,8 +29,9 @@ VSTAudioFilterEditor::~VSTAudioFilterEditor() = default;
 
 zebcore::geom::RectT<int> VSTAudioFilterEditor::GetEditorRect() const
 {
-    if (mWidth > 0 && mHeight > 0)
-        return {0, 0, mWidth, mHeight};
+    const Size size = mSize.load(std::memory_order_relaxed); // says nothing about other data
+    if (size.mWidth > 0 && size.mHeight > 0)
+        return {0, 0, size.mWidth, size.mHeight};
     const ERect* rect = nullptr;
     Dispatcher(effEditGetRect, 0, 0, &rect, 0.0F);
     if (!rect)
@@ -88,8 +89,7 @@ long long VSTAudioFilterEditor::AudioMasterCallback(int opcode, int index, long 
     switch (opcode)
     {
     case audioMasterSizeWindow:
-        mWidth = index;
-        mHeight = static_cast<int>(value);
+        mSize.store({index, static_cast<std::int32_t>(value)}, std::memory_order_relaxed);
         GetContentSizeChangedSignal()();
         return 1;
     case audioMasterVendorSpecific: // answered whatever the selector: while a view is open, none gets further

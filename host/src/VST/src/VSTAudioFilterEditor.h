@@ -3,6 +3,9 @@
 #include "audiofilter/AudioFilterEditor.h"
 #include "host/src/VST/src/VSTDispatcherBase.h"
 
+#include <atomic>
+#include <cstdint>
+
 namespace zebaudiofilterhost::vst
 {
 
@@ -37,11 +40,17 @@ public:
     long long AudioMasterCallback(int opcode, int index, long long value, void* ptr, float opt);
 
 private:
+    struct Size
+    {
+        std::int32_t mWidth; // in pixels, 0 until the plug-in asks for a size
+        std::int32_t mHeight;
+    };
+    static_assert(std::atomic<Size>::is_always_lock_free);
+
     long long CallVendorSpecific(unsigned int selector, long long value, float opt) const;
 
     VSTAudioFilter* mFilter;
-    int mWidth = 0; // in pixels, 0 until the plug-in asks for a size
-    int mHeight = 0;
+    std::atomic<Size> mSize = Size{0, 0}; // as one, for a plug-in may ask on any thread while another reads
 };
 
 } // namespace zebaudiofilterhost::vst
