@@ -57,7 +57,7 @@ private:
     void Sort(const Dir& subdir)
     {
         const UTF16String path = subdir.FullPath();
-        if (path.ends_with(mRules.mBundleExtension))
+        if (IsNamedAsBundle(path, mRules.mBundleExtension))
             Add(path);
         else if (!mRules.mIsSearched || mRules.mIsSearched(path))
             mStack.push_back(subdir);
@@ -77,6 +77,15 @@ private:
 };
 
 } // namespace
+
+// Folders such as ~/.vst have their extension for a name.
+bool IsNamedAsBundle(std::u16string_view path, std::u16string_view extension)
+{
+    if (!path.ends_with(extension))
+        return false;
+    path.remove_suffix(extension.size());
+    return !path.empty() && path.back() != u'/';
+}
 
 std::vector<PluginLocator> SearchForPlugins(const std::vector<Dir>& places, const PluginSearchRules& rules)
 {

@@ -44,7 +44,7 @@ UTF16String GetPathDisplayString(const UTF16String& path)
 
 bool IsVSTPlugin(const UTF16String& path)
 {
-    return path.ends_with(kRules.mBundleExtension) ? Dir(path).Exists() : IsPluginFile(path);
+    return IsNamedAsBundle(path, kRules.mBundleExtension) ? Dir(path).Exists() : IsPluginFile(path);
 }
 
 } // namespace zebaudiofilterhost::vst
