@@ -2,8 +2,10 @@
 
 #include "tests/vst/support/FakeFilter.h"
 
+#include <array>
 #include <atomic>
 #include <bit>
+#include <chrono>
 #include <list>
 #include <thread>
 
@@ -21,10 +23,16 @@ public:
     bool GetTempo(zebaudiofilterhost::utility::Tempo& tempo) const override
     {
         tempo.mTempo = 120.0;
+        ++mAsked;
         return true;
     }
     bool GetTransportState(bool&, bool&, bool&) const override { return false; }
+
+    mutable std::atomic<int> mAsked = 0;
 };
+
+// Beyond any time that a thread is kept waiting.
+constexpr std::chrono::seconds kPatience{20};
 
 // A plug-in with a thread that asks its host from effOpen to effClose.
 class Caller
@@ -54,13 +62,25 @@ public:
     // Until the thread has been round so many times more.
     void AwaitRounds(int rounds) const
     {
-        for (const int start = mRounds; mRounds < start + rounds;)
+        Await([this, end = mRounds + rounds] { return mRounds >= end; });
+    }
+
+    // Until the thread has seen it.
+    template <class Condition>
+    void Await(Condition condition) const
+    {
+        const auto end = std::chrono::steady_clock::now() + kPatience;
+        while (!condition() && std::chrono::steady_clock::now() < end)
             std::this_thread::yield();
+        EXPECT_TRUE(condition());
     }
 
     FakeEffect fake;
     std::atomic<int> mWrongAnswers = 0;
     std::atomic<int> mAutomated = 0;
+    std::atomic<int> mTimes = 0;      // how often there was a record of the time
+    std::atomic<int> mHandled = 0;    // how often a handler answered
+    std::atomic<int> mNotHandled = 0; // and how often there was none
 
 private:
     void Run()
@@ -85,10 +105,14 @@ private:
         check(pin == 0 || pin == 1);
         const long long icon = fake.CallHost(audioMasterSetIcon);
         check(icon == 0 || icon == 77);
+        ++(icon == 77 ? mHandled : mNotHandled);
         fake.CallHost(audioMasterCurrentId);
         fake.CallHost(audioMasterAutomate, 0, 0, nullptr, 0.5F);
         if (auto* const info = std::bit_cast<VstTimeInfo*>(fake.CallHost(audioMasterGetTime)))
+        {
+            ++mTimes;
             check((std::atomic_ref(info->flags).load(std::memory_order_relaxed) & kVstPpqPosValid) != 0);
+        }
     }
 
     std::thread mThread;
@@ -108,9 +132,11 @@ TEST(FilterThreads, APlugInMayAskAllItsLife)
         filter->SetAudioFilterHost(&host);
         caller.AwaitRounds(2);
         filter->Resume();
-        caller.AwaitRounds(2);
+        caller.Await([&caller] { return caller.mTimes > 1; });
         filter.reset(); // with calls under way
         EXPECT_EQ(caller.mWrongAnswers, 0);
+        EXPECT_EQ(caller.fake.callsAfterClose, 0);
+        EXPECT_EQ(caller.fake.host(caller.fake.Get(), audioMasterGetTime, 0, 0, nullptr, 0.0F), 0);
     }
 }
 
@@ -132,12 +158,56 @@ TEST(FilterThreads, TheMainThreadMayWorkOnTheFilterMeanwhile)
         filter->Resume();
         filter->SetCurrentOffset(round);
         VSTAudioFilter::SetCurrentFilterID(round);
+        if (round % 50 == 0) // the others come and go unseen, or under a call
+            caller.Await([&caller, times = caller.mTimes + 2, handled = caller.mHandled + 2]
+                         { return caller.mTimes >= times && caller.mHandled >= handled; });
         filter->RemoveAudioMasterHandler(&caller);
         filter->Suspend();
     }
-    caller.AwaitRounds(1);
+    caller.Await([&caller, unanswered = caller.mNotHandled + 2] { return caller.mNotHandled >= unanswered; });
     EXPECT_EQ(caller.mWrongAnswers, 0);
     EXPECT_GT(caller.mAutomated, 0);
+    filter->SetAudioFilterHost(nullptr);
+}
+
+// They share one record. Whichever came last, each member is one that the host has told.
+TEST(FilterThreads, TwoMayAskForTheTimeAtOnce)
+{
+    constexpr int kQuestions = 5000;
+    Host host;
+    FakeEffect fake;
+    fake.recording = false;
+    const auto filter = MakeFilter(fake);
+    filter->SetAudioFilterHost(&host);
+    filter->SetSampleRate(48000.0F);
+    filter->Resume();
+    std::atomic<int> waiting = 2;
+    std::atomic<int> wrong = 0;
+    const auto ask = [&]
+    {
+        for (--waiting; waiting > 0;)
+            std::this_thread::yield();
+        for (int question = 0; question < kQuestions; ++question)
+        {
+            filter->SetCurrentOffset(question % 2 == 0 ? 0 : 24000);
+            auto* const info = std::bit_cast<VstTimeInfo*>(fake.CallHost(audioMasterGetTime));
+            const auto read = [](double& member)
+            {
+                return std::atomic_ref(member).load(std::memory_order_relaxed);
+            };
+            const double beat = read(info->ppqPos);
+            const double position = read(info->samplePos);
+            wrong +=
+                (beat == 1.0 || beat == 2.0) && (position == 0.0 || position == 24000.0) && read(info->tempo) == 120.0
+                    ? 0
+                    : 1;
+        }
+    };
+    std::array<std::thread, 2> threads{std::thread(ask), std::thread(ask)};
+    for (std::thread& thread : threads)
+        thread.join();
+    EXPECT_EQ(wrong, 0);
+    EXPECT_EQ(host.mAsked, 2 * kQuestions);
     filter->SetAudioFilterHost(nullptr);
 }
 
