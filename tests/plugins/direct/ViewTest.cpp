@@ -60,8 +60,12 @@ protected:
         return first;
     }
 
+    // A window has no pixels before it is on the screen: the plug-in maps it by a connection of its own.
     unsigned long PixelAt(int x, int y)
     {
+        XWindowAttributes attributes{};
+        if (XGetWindowAttributes(mDisplay, mChild, &attributes) == 0 || attributes.map_state != IsViewable)
+            return 0;
         XImage* image = XGetImage(mDisplay, mChild, x, y, 1, 1, AllPlanes, ZPixmap);
         const unsigned long pixel = image != nullptr ? XGetPixel(image, 0, 0) & 0xffffff : 0;
         if (image != nullptr)
