@@ -73,8 +73,7 @@ protected:
 };
 
 const char* const kPlaces[] = {"plain", "my vst3 & vst/Zeb",
-                               "Zo\xc3\xab & S\xc3\xb6hne's <Apps>/\xe9\x9f\xb3 \"x\" &amp;",
-                               " blanks \\u0041 "};
+                               "Zo\xc3\xab & S\xc3\xb6hne's <Apps>/\xe9\x9f\xb3 \"x\" &amp;", " blanks \\u0041 "};
 
 TEST_F(PrivateApplicationTest, WhatIsShippedKnowsNoPlaceOfTheMachineThatBuiltIt)
 {

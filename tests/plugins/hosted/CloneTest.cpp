@@ -18,7 +18,7 @@ using zebtest::FilterPtr;
 
 constexpr Steinberg::Vst::ParamID kGain = 0;
 constexpr double kQuarter = 0.6245708351400078; // normalised, of -72 dB to 24 dB: a gain of 0.25
-constexpr float kInput = 0.5F;         // what RunBlocks sends
+constexpr float kInput = 0.5F;                  // what RunBlocks sends
 
 class CloneOfGain : public testing::Test
 {
