@@ -12,8 +12,8 @@ namespace zebaudiofilterhost::vst
 /// Who answers the calls of plug-ins: handlers by the address of their owner, in the order of these addresses.
 ///
 /// Changed on the main thread while others call: calling takes no lock, allocates nothing and waits for nobody. A
-/// call that is under way goes on with the handlers that it found, each of which lives until no call is under way;
-/// what a handler is bound to must outlive the calls by its own means.
+/// call that is under way goes on with the handlers that it found; these die at the first later change that
+/// meets no call under way, or with the map. What a handler is bound to must outlive the calls by its own means.
 class AudioMasterHandlerMap
 {
 public:

@@ -1,5 +1,6 @@
 // What plug-ins ask their host: handlers of an instance first, then the instance, then the static answers. Any thread
-// may call, the process thread included, so nothing here locks or allocates.
+// may call, the process thread included, so the answers neither lock nor allocate. What a plug-in tells of its
+// parameters and its view is another matter: that fires signals, which do both.
 
 #include "foundation/zebcore/Trace.h"
 #include "host/PluginModule.h"
