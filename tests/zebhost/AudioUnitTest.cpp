@@ -1,0 +1,195 @@
+// Audio Units at the shell: they are found, told of, rendered, kept in presets and shown like all others.
+#include "tests/zebhost/support/Sound.h"
+#include "tests/zebhost/support/Zebhost.h"
+
+#include <cmath>
+#include <set>
+
+namespace zebtest
+{
+
+namespace
+{
+
+using testing::ElementsAre;
+using testing::HasSubstr;
+
+constexpr std::size_t kFrames = 5000;
+constexpr const char* kGainID = "4:1635083896 2053595497 2053464696";
+
+class AudioUnitTest : public ZebhostTest
+{
+protected:
+    AudioUnitTest()
+    {
+        SearchIn(mFolder / "none");
+        mVariables["VST_PATH"] = Path("none");
+        mVariables["AUDIO_COMPONENT_PATH"] = ZEB_UNITS;
+        WriteSound(Path("in.wav"), mInput);
+        Succeed({"scan", "--quiet"});
+    }
+
+    Sound Rendered(const std::string& filter, std::vector<std::string> options = {}) const
+    {
+        options.insert(options.begin(), {"render", filter, Path("in.wav"), Path("out.wav"), "--overwrite"});
+        Succeed(options);
+        return ReadSound(Path("out.wav"));
+    }
+
+    static std::vector<std::string> Texts(const nlohmann::json& document)
+    {
+        std::vector<std::string> texts;
+        for (const nlohmann::json& parameter : document.at("parameters"))
+        {
+            texts.push_back(parameter.at("name").get<std::string>() + "=" + parameter.at("text").get<std::string>());
+        }
+        return texts;
+    }
+
+    Sound mInput = MakeNoise(2, kFrames);
+};
+
+TEST_F(AudioUnitTest, AScanFindsEachUnitOnce)
+{
+    const RunResult again = Succeed({"scan", "--full"});
+    EXPECT_THAT(again.LastLine(), HasSubstr("4 plug-ins scanned, 4 effects found"));
+    EXPECT_THAT(again.out, HasSubstr("Zeb: Zeb Unit Mixer"));
+    EXPECT_THAT(Succeed({"scan"}).LastLine(), HasSubstr("nothing to scan"));
+    EXPECT_EQ(Succeed({"list", "--names"}).out, "Zeb Unit Delay\nZeb Unit Gain\nZeb Unit Mixer\nZeb Unit Tone\n");
+    EXPECT_THAT(Succeed({"list", "--long"}).out, HasSubstr("Audio Unit"));
+    for (const nlohmann::json& filter : Succeed({"list", "--json"}).Json().at("filters"))
+    {
+        EXPECT_EQ(filter.at("technology"), "Audio Unit");
+        EXPECT_EQ(filter.at("vendor"), "Zeb");
+    }
+}
+
+TEST_F(AudioUnitTest, AUnitThatIsGoneIsDropped)
+{
+    mVariables["AUDIO_COMPONENT_PATH"] = Path("none");
+    const RunResult result = Run({"info", "Zeb Unit Gain"});
+    EXPECT_EQ(result.code, 4);
+    EXPECT_THAT(result.LastLine(), HasSubstr("is gone"));
+    EXPECT_THAT(Succeed({"scan"}).LastLine(), HasSubstr("4 dropped"));
+    EXPECT_EQ(Succeed({"list", "--names"}).out, "");
+}
+
+TEST_F(AudioUnitTest, NameAndIDSelectTheSameUnit)
+{
+    for (const char* selector : {"Zeb Unit Gain", kGainID})
+    {
+        const nlohmann::json filter = Succeed({"info", selector, "--json"}).Json().at("filter");
+        EXPECT_EQ(filter.at("id"), kGainID);
+        EXPECT_EQ(filter.at("editor"), true);
+        EXPECT_EQ(filter.at("factoryPresets"), nlohmann::json({"Unity", "Half"}));
+        EXPECT_EQ(filter.at("outputs").at(0).at("channels"), nlohmann::json({"L", "R"}));
+    }
+    EXPECT_THAT(Succeed({"info", kGainID}).out, HasSubstr("Path:         Zeb: Zeb Unit Gain\n"));
+    const nlohmann::json mixer = Succeed({"info", "Zeb Unit Mixer", "--json"}).Json().at("filter");
+    EXPECT_EQ(mixer.at("inputs").at(0).at("name"), "Voice");
+    EXPECT_EQ(mixer.at("inputs").at(1).at("name"), "Music");
+}
+
+TEST_F(AudioUnitTest, RendersToTheSample)
+{
+    EXPECT_TRUE(Rendered("Zeb Unit Gain").channels == mInput.channels);
+    const Sound soft = Rendered(kGainID, {"--set", "Gain=-12"});
+    const double factor = std::pow(10.0, -12.0 / 20.0);
+    for (std::size_t frame = 0; frame < kFrames; ++frame)
+    {
+        ASSERT_NEAR(soft.channels[1][frame], mInput.channels[1][frame] * factor, 1024.0) << frame;
+    }
+    EXPECT_TRUE(Rendered("Zeb Unit Gain", {"--set", "Mute=1"}).channels[0] == std::vector<int>(kFrames, 0));
+    const Sound half = Rendered("Zeb Unit Gain", {"--preset", "Half"});
+    EXPECT_NEAR(half.channels[0][7], mInput.channels[0][7] / 2.0, 1024.0);
+}
+
+TEST_F(AudioUnitTest, TheLatencyIsTakenOut)
+{
+    EXPECT_EQ(Succeed({"info", "Zeb Unit Delay", "--json"}).Json().at("filter").at("latency"), 88);
+    EXPECT_TRUE(Rendered("Zeb Unit Delay", {"--set", "Mix=0"}).channels == mInput.channels);
+}
+
+TEST_F(AudioUnitTest, MonoFilesAndGeneratorsFindTheirWay)
+{
+    const Sound mono = MakeNoise(1, kFrames);
+    WriteSound(Path("in.wav"), mono);
+    EXPECT_TRUE(Rendered("Zeb Unit Gain").channels == mono.channels);
+    WriteSound(Path("in.wav"), mInput);
+    const Sound tone = Rendered("Zeb Unit Tone", {"--set", "Frequency=1000"});
+    ASSERT_EQ(tone.channels.size(), 2U);
+    for (std::size_t frame = 0; frame < 480; ++frame)
+    {
+        const double expected = 0.25 * std::sin(2.0 * 3.14159265358979 * static_cast<double>(frame) / 48.0);
+        ASSERT_NEAR(tone.channels[1][frame] / 2147483648.0, expected, 1e-4) << frame;
+    }
+}
+
+TEST_F(AudioUnitTest, PresetsComeBackFromStoreAndFile)
+{
+    for (const std::string& preset : {std::string("kept"), Path("kept.xml")})
+    {
+        Succeed({"preset", "save", "Zeb Unit Delay", preset, "--set", "Time=0.01", "--set", "Mix=25"});
+        EXPECT_THAT(Texts(Succeed({"preset", "load", "Zeb Unit Delay", preset, "--json"}).Json()),
+                    ElementsAre("Time=0.01", "Mix=25", "Mode=0"));
+        EXPECT_FALSE(Rendered("Zeb Unit Delay", {"--preset", preset}).channels == mInput.channels);
+    }
+}
+
+// The bytes of a preset are a property list that the common tools read.
+TEST_F(AudioUnitTest, OtherToolsReadThePreset)
+{
+    if (RunProgram({"plistutil", "--version"}, mVariables, mFolder).code != 0)
+    {
+        GTEST_SKIP() << "plistutil (libplist-utils) is not installed: no other tool has read a preset";
+    }
+    Succeed({"preset", "save", "Zeb Unit Delay", Path("kept.xml"), "--set", "Mix=25"});
+    const std::string text = ReadText(Path("kept.xml"));
+    const std::string key = "<utf8 key=\"ChunkData\">";
+    const std::size_t begin = text.find(key) + key.size();
+    WriteText(Path("chunk.txt"), text.substr(begin, text.find('<', begin) - begin));
+    const RunResult list = RunProgram(
+        {"sh", "-c",
+         "base64 -d " + Path("chunk.txt") + " > " + Path("c.plist") + " && plistutil -i " + Path("c.plist")},
+        mVariables, mFolder);
+    ASSERT_EQ(list.code, 0) << list.err;
+    for (const char* part : {"<key>manufacturer</key>", "<integer>2053399916</integer>", "<string>crossed</string>",
+                             "<false/>", "AAEC/w==", "<real>25"})
+    {
+        EXPECT_THAT(list.out, HasSubstr(part));
+    }
+}
+
+class AudioUnitEditTest : public AudioUnitTest
+{
+protected:
+    void SetUp() override
+    {
+        if (RunProgram({"xvfb-run", "--help"}, mVariables, mFolder).code != 0)
+        {
+            GTEST_SKIP() << "xvfb-run is not installed: no editor was opened";
+        }
+    }
+};
+
+TEST_F(AudioUnitEditTest, ShowsEveryUnitAndSavesWhatItHas)
+{
+    for (const char* unit : {"Zeb Unit Delay", "Zeb Unit Gain", "Zeb Unit Mixer", "Zeb Unit Tone"})
+    {
+        const RunResult result =
+            RunProgram({"xvfb-run", "--auto-servernum", "--server-args=-screen 0 1024x768x24", ZEBHOST_PROGRAM,
+                        "--settings", Settings().string(), "edit", unit, "--seconds", "0.4", "--norm", "#1=0.25",
+                        "--screenshot", Path("view.png"), "--overwrite", "--save", "kept", "--json"},
+                       mVariables, mFolder);
+        ASSERT_EQ(result.code, 0) << unit << result.err;
+        const std::string png = ReadText(Path("view.png"));
+        ASSERT_EQ(png.substr(1, 3), "PNG") << unit;
+        EXPECT_GT(std::set<char>(png.begin() + 60, png.end() - 20).size(), 50U) << "an empty window: " << unit;
+        const nlohmann::json loaded = Succeed({"preset", "load", unit, "kept", "--json"}).Json();
+        EXPECT_NEAR(loaded.at("parameters").at(0).at("value").get<double>(), 0.25, 1e-5) << unit;
+    }
+}
+
+} // namespace
+
+} // namespace zebtest
