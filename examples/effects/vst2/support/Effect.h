@@ -16,9 +16,9 @@ using namespace zebaudiofilterhost::vst;
 
 struct Parameter
 {
-    const char* name;  // 7 bytes at most, as is `label`
-    const char* label; // of the unit
-    float initial;     // 0 to 1, as all values
+    const char* name = nullptr;  // 7 bytes at most, as is `label`
+    const char* label = nullptr; // of the unit
+    float initial = 0.0F;        // 0 to 1, as all values
     std::int32_t flags = kVstParameterCanRamp;
 };
 
