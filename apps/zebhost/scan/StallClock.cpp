@@ -11,7 +11,7 @@ StallClock::StallClock(double seconds) : mLimit(seconds)
 
 void StallClock::Restart()
 {
-    mCounted = mCounted.zero();
+    mCounted = std::chrono::duration<double>::zero();
     mLast = Clock::now();
 }
 

@@ -12,7 +12,7 @@ namespace
 {
 
 constexpr std::size_t kKept = 4096;
-constexpr std::size_t kShown = 256 * 1024;
+constexpr std::size_t kShown = std::size_t{256} * 1024;
 constexpr std::size_t kLongestLine = 160;
 
 } // namespace
