@@ -57,7 +57,7 @@ private:
     void Sort(const Dir& subdir)
     {
         const UTF16String path = subdir.FullPath();
-        if (IsNamedAsBundle(path, mRules.mBundleExtension))
+        if (IsNamedAsBundle(path, mRules))
             Add(path);
         else if (!mRules.mIsSearched || mRules.mIsSearched(path))
             mStack.push_back(subdir);
@@ -78,13 +78,9 @@ private:
 
 } // namespace
 
-// Folders such as ~/.vst have their extension for a name.
-bool IsNamedAsBundle(std::u16string_view path, std::u16string_view extension)
+bool IsNamedAsBundle(const UTF16String& path, const PluginSearchRules& rules)
 {
-    if (!path.ends_with(extension))
-        return false;
-    path.remove_suffix(extension.size());
-    return !path.empty() && path.back() != u'/';
+    return path.ends_with(rules.mBundleExtension) && (!rules.mIsBundle || rules.mIsBundle(path));
 }
 
 std::vector<PluginLocator> SearchForPlugins(const std::vector<Dir>& places, const PluginSearchRules& rules)

@@ -161,6 +161,19 @@ TEST_F(Life, AbsurdParameterCountsAreNotBelieved)
     }
 }
 
+TEST_F(Life, APlugInWithoutADispatcherStillComesUpAndGoes)
+{
+    fake.effect.dispatcher = nullptr;
+    fake.effect.numParams = 1;
+    MakeRunning();
+    EXPECT_EQ(filter->GetDisplayName(), u"Title.of.file");
+    EXPECT_TRUE(filter->CreateFilterDescriptor({}, false));
+    EXPECT_EQ(filter->GetParameterString(0), u"");
+    filter->Suspend();
+    filter.reset();
+    EXPECT_TRUE(fake.Calls().empty());
+}
+
 TEST_F(Life, APlugInThatThrowsEverywhereStillComesUpAndGoes)
 {
     for (const auto opcode : {effOpen, effSetSampleRate, effSetBlockSize, effGetEffectName, effGetParamName,

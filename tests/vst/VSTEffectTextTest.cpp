@@ -33,6 +33,17 @@ TEST(VSTEffectText, EachQuestionHasItsOpcode)
     }
 }
 
+TEST(VSTEffectText, NobodyAnswersWithoutADispatcher)
+{
+    FakeEffect fake;
+    fake.effect.dispatcher = nullptr;
+    for (const auto ask : {GetEffectName, GetVendorString, GetProductString})
+    {
+        EXPECT_TRUE(ask(fake.Get()).empty());
+        EXPECT_TRUE(ask(nullptr).empty());
+    }
+}
+
 TEST(VSTEffectText, TheBufferIsLongAndEmpty)
 {
     FakeEffect fake;

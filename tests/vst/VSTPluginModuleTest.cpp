@@ -279,6 +279,38 @@ TEST_F(VSTPluginModuleTest, WhatIsThrownAtTheVersionPassesThrough)
     EXPECT_EQ(recorder.LiveObjects(), 0) << "the instance does not stay";
 }
 
+TEST_F(VSTPluginModuleTest, WhatIsThrownAtTheEntryPassesThroughAndIsTold)
+{
+    const auto path = zebtest::VST2Hazard("ThrowInEntry");
+    const ModulePtr module = GetVSTPlugin(PathOf(path));
+    ASSERT_NE(module, nullptr);
+    EXPECT_EQ(ProblemOf(path), "");
+    EXPECT_THROW(module->CreateAudioFilter(u"2:1"), std::runtime_error);
+    EXPECT_EQ(ProblemOf(path), "\"" + path.string() + "\" refuses to work: its entry function throws.");
+}
+
+TEST_F(VSTPluginModuleTest, AFilterThatIsMadeEndsTheProblem)
+{
+    const auto path = VST2Fixture("Normal");
+    const auto recorder = RecorderOf(path);
+    const ModulePtr module = LoadFixture("Normal");
+    recorder.Set("entryNull", 1);
+    EXPECT_EQ(module->CreateAudioFilter(MemberID("Normal")), nullptr);
+    EXPECT_NE(ProblemOf(path), "");
+    recorder.Reset();
+    EXPECT_NE(module->CreateAudioFilter(MemberID("Normal")), nullptr);
+    EXPECT_EQ(ProblemOf(path), "");
+}
+
+// There is no plug-in to ask.
+TEST_F(VSTPluginModuleTest, WithoutAnEntryPointThereAreNoIDs)
+{
+    const ModulePtr module(new VSTPluginModule(PathOf(VST2Fixture("Normal"))));
+    std::vector<UTF16String> ids = {u"old"};
+    EXPECT_EQ(module->GetPluginInfo(ids), nullptr);
+    EXPECT_TRUE(ids.empty());
+}
+
 TEST_F(VSTPluginModuleTest, TracesAnOldVersion)
 {
     std::string lines;

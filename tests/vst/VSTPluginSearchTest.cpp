@@ -29,13 +29,6 @@ TEST_F(VSTPluginSearchTest, BundlesByTheirSuffixDepthFirstAndLastFoundFirst)
     EXPECT_TRUE(mFolder.Search("nowhere").empty());
 }
 
-TEST_F(VSTPluginSearchTest, AFolderCalledLikeTheExtensionIsAFolder)
-{
-    mFolder.MakeFolders({"home/.vst/Inner.vst", "home/..vst"});
-    EXPECT_EQ(mFolder.Search("home"), (Paths{"home/..vst", "home/.vst/Inner.vst"}));
-    EXPECT_FALSE(IsVSTPlugin(mFolder.TextOf("home/.vst")));
-}
-
 TEST_F(VSTPluginSearchTest, LinksDoNotMakeTheWalkEndless)
 {
     mFolder.MakeFolders({"a/One.vst", "b/Two.vst"});

@@ -46,6 +46,13 @@ TEST_F(VSTPluginFilesTest, PlainFilesByWhatTheyExport)
               (Paths{"a/Bundle.vst", "a/Alias.so", "a/OldMain.so", "a/Plain.so", "a/deeper/Macho.so"}));
 }
 
+TEST_F(VSTPluginFilesTest, AFolderCalledLikeTheExtensionIsAFolder)
+{
+    mFolder.MakeFolders({"home/.vst/Inner.vst", "home/..vst"});
+    EXPECT_EQ(mFolder.Search("home"), (Paths{"home/..vst", "home/.vst/Inner.vst"}));
+    EXPECT_FALSE(IsVSTPlugin(mFolder.TextOf("home/.vst")));
+}
+
 TEST_F(VSTPluginFilesTest, BundlesOfOtherStandardsAreNotEntered)
 {
     mFolder.MakeFolders({"a/One.vst3/Inner.vst", "a/Two.lv2/Inner.vst", "a/Three.clap", "a/Four.VST3/Inner.vst"});

@@ -18,6 +18,8 @@ constexpr std::size_t kTextSize = 256;
 UTF16String AskForText(AEffect* effect, AEffectOpcodes opcode)
 {
     UTF16String text;
+    if (!effect || !effect->dispatcher)
+        return text;
     try
     {
         std::array<char, kTextSize> buffer{};

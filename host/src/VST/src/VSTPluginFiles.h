@@ -16,8 +16,15 @@ bool IsPluginFile(const UTF16String& path);
 /// The plug-ins among a directory's plain files, in the order of their names. [main]
 std::vector<UTF16String> FindPluginFiles(const Dir& directory);
 
+/// Whether a directory whose path ends in ".vst" is a bundle. [any]
+bool IsBundleName(const UTF16String& path);
+
 /// False for the bundles of other plug-in standards, whose binaries may export a VST 2 entry point as well. [main]
 bool IsSearchedDirectory(const UTF16String& path);
+
+/// The names of GetVSTEntryPoints, in their order, that this bundle or file has itself, and not some library that it
+/// needs; all of them if that is not known without loading. [main]
+std::vector<const char*> FindEntryPoints(const UTF16String& path);
 
 /// Why loading this bundle or file cannot give a plug-in: a sentence that names it. Empty if it can, or if that is
 /// not known without loading. [main]

@@ -57,7 +57,7 @@ void VSTPluginModule::SetProblem(const UTF16String& ending) const
 
 bool VSTPluginModule::FindEntryPoint()
 {
-    for (const char* name : GetVSTEntryPoints())
+    for (const char* name : FindEntryPoints(GetPath()))
     {
         const auto entryPoint = reinterpret_cast<VSTPluginMainProc>(
             zebcore::utility::GetFunctionPointerFromModuleImpl(GetOSModule(), name));
@@ -78,9 +78,10 @@ void VSTPluginModule::Unload()
 AEffect* VSTPluginModule::MakeEffect(unsigned int uniqueID) const
 {
     VSTAudioFilter::SetCurrentFilterID(static_cast<int>(uniqueID));
+    // Holds if the entry function throws, which passes through.
+    SetProblem(u" refuses to work: its entry function throws.");
     AEffect* effect = mEntryPoint(VSTAudioFilter::StaticAudioMasterCallback);
-    if (!effect)
-        SetProblem(u" refuses to work: its entry function gives no plug-in.");
+    SetProblem(effect ? u"" : u" refuses to work: its entry function gives no plug-in.");
     return effect;
 }
 

@@ -20,10 +20,11 @@ constexpr std::size_t kMemberNameSize = 256;
 // More than any shell has: one that never ends its list must not fill the memory.
 constexpr std::size_t kMaxShellMembers = 65536;
 
-// Guards nothing: a plug-in that cannot even answer these questions ends its scan by what it throws.
+// Guards against nothing that is thrown: a plug-in that cannot even answer these questions ends its scan by what it
+// throws.
 int Ask(AEffect* effect, AEffectOpcodes opcode, void* ptr = nullptr)
 {
-    return static_cast<int>(effect->dispatcher(effect, opcode, 0, 0, ptr, 0.0F));
+    return effect->dispatcher ? static_cast<int>(effect->dispatcher(effect, opcode, 0, 0, ptr, 0.0F)) : 0;
 }
 
 unsigned int UniqueIDOf(const AEffect* effect)

@@ -13,6 +13,7 @@ namespace
 
 constexpr PluginSearchRules kRules = {.mType = kTechnologyVST,
                                       .mBundleExtension = u".vst",
+                                      .mIsBundle = IsBundleName,
                                       .mIsSearched = IsSearchedDirectory,
                                       .mFindFiles = FindPluginFiles};
 constexpr const char16_t* kPrivateDirectory = u"Plug-Ins/VST";
@@ -44,7 +45,7 @@ UTF16String GetPathDisplayString(const UTF16String& path)
 
 bool IsVSTPlugin(const UTF16String& path)
 {
-    return IsNamedAsBundle(path, kRules.mBundleExtension) ? Dir(path).Exists() : IsPluginFile(path);
+    return IsNamedAsBundle(path, kRules) ? Dir(path).Exists() : IsPluginFile(path);
 }
 
 } // namespace zebaudiofilterhost::vst

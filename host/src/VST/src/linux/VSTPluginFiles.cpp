@@ -8,6 +8,7 @@
 #include <algorithm>
 #include <filesystem>
 #include <fstream>
+#include <iterator>
 #include <string_view>
 #include <system_error>
 
@@ -21,6 +22,15 @@ namespace fs = std::filesystem;
 
 constexpr const char* kFileExtension = ".so";
 constexpr std::u16string_view kForeignBundles[] = {u".vst3", u".lv2", u".clap"};
+
+std::vector<const char*> FindEntryPointsOf(ElfExports& exports)
+{
+    const std::span<const char* const> names = GetVSTEntryPoints();
+    std::vector<const char*> found;
+    std::copy_if(names.begin(), names.end(), std::back_inserter(found),
+                 [&exports](const char* name) { return exports.HasFunction(name); });
+    return found;
+}
 
 // Null, or the end of a sentence that the path begins.
 const char16_t* FindFileProblem(const fs::path& path)
@@ -36,10 +46,7 @@ const char16_t* FindFileProblem(const fs::path& path)
         return u" is not a shared library.";
     if (exports.GetKind() == ElfKind::kOtherMachine)
         return u" is a binary for another kind of machine.";
-    const std::span<const char* const> names = GetVSTEntryPoints();
-    const bool hasEntry =
-        std::any_of(names.begin(), names.end(), [&exports](const char* name) { return exports.HasFunction(name); });
-    return hasEntry ? nullptr : kNoEntryPoint;
+    return FindEntryPointsOf(exports).empty() ? kNoEntryPoint : nullptr;
 }
 
 bool IsPlugin(const fs::path& path)
@@ -71,10 +78,24 @@ std::vector<UTF16String> FindPluginFiles(const Dir& directory)
     return paths;
 }
 
+// The folder ~/.vst, where users keep their plug-ins, has its extension for a name.
+bool IsBundleName(const UTF16String& path)
+{
+    return !path.ends_with(u"/.vst");
+}
+
 bool IsSearchedDirectory(const UTF16String& path)
 {
     return std::none_of(std::begin(kForeignBundles), std::end(kForeignBundles),
                         [&path](std::u16string_view extension) { return path.ends_with(extension); });
+}
+
+std::vector<const char*> FindEntryPoints(const UTF16String& path)
+{
+    const UTF16String binary = zebcore::utility::FindOSModuleBinary(path);
+    std::ifstream file(zebcore::filesupport::ToNativePath(binary), std::ios::binary);
+    ElfExports exports(file);
+    return FindEntryPointsOf(exports);
 }
 
 UTF16String FindPluginProblem(const UTF16String& path)
