@@ -18,11 +18,13 @@ namespace zebaudiofilterhost::vst
 namespace
 {
 
+using testing::AnyOf;
 using testing::Contains;
 using testing::Each;
+using testing::ElementsAre;
 using testing::EndsWith;
-using testing::IsEmpty;
-using testing::Not;
+using testing::HasSubstr;
+using testing::StartsWith;
 using zebtest::FixtureRecorder;
 
 constexpr int kFrames = 64;
@@ -116,13 +118,17 @@ TEST_F(FilterFixtures, EachMomentOfLifeHasItsAnswers)
 TEST_F(FilterFixtures, EachOneProcesses)
 {
     int made = 0;
+    std::vector<std::string> notMade;
     for (const auto& entry : std::filesystem::recursive_directory_iterator(zebtest::VST2FixtureFolder()))
     {
         if (entry.path().extension() != ".so" || entry.path().filename() == "Helper.so")
             continue;
         const auto filter = MakeFilterOf(entry.path());
         if (!filter)
+        {
+            notMade.push_back(entry.path().stem());
             continue;
+        }
         SCOPED_TRACE(entry.path().filename());
         const FixtureRecorder recorder(entry.path());
         for (const std::size_t channels : {1U, 2U, 6U})
@@ -132,13 +138,15 @@ TEST_F(FilterFixtures, EachOneProcesses)
             recorder.Clear();
             for (const std::vector<float>& channel : Process(*filter))
                 EXPECT_TRUE(IsFinite(channel));
-            EXPECT_THAT(recorder.CallsTo("process"), Not(IsEmpty()));
-            EXPECT_THAT(recorder.CallsTo("processReplacing"), Each(EndsWith("null= 0")));
+            const std::vector<std::string> calls = recorder.CallsTo("process");
+            EXPECT_THAT(calls, Contains(HasSubstr(" null= ")));
+            EXPECT_THAT(calls, Each(AnyOf(EndsWith(" null= 0"), StartsWith("process.")))); // or a call to the host
             filter->Suspend();
         }
         ++made;
     }
     EXPECT_GT(made, 50);
+    EXPECT_THAT(notMade, ElementsAre("NullEntry"));
 }
 
 } // namespace zebaudiofilterhost::vst
