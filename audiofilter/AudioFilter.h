@@ -75,7 +75,8 @@ public:
 
     // Technologies override what follows; the order is that of the virtual table.
 
-    /// Sets the answer to questions of musical time; not owned, may be null, must outlive its use here. [main]
+    /// Sets the answer to questions of musical time; not owned, may be null. Must outlive the filter, even if another
+    /// takes its place: a plug-in's own thread may still be asking it. [main]
     virtual void SetAudioFilterHost(IAudioFilterHost* host);
 
     /// Hertz. [main, suspended]
@@ -401,7 +402,7 @@ public:
     ParameterPropertiesChangedSignal& GetParameterPropertiesChangedSignal();
     SuspendedStateChangedSignal& GetSuspendedStateChangedSignal();
 
-    /// Parameter index, new value; fired on whatever thread the plug-in calls from. [any]
+    /// Parameter index, new value; fired on whatever thread the plug-in calls from. Slots must not throw. [any]
     boost::signals2::connection
     ConnectAutomatedParameterChange(const AutomatedParameterChangeSignal::slot_type& slot);
 

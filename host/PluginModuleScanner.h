@@ -44,7 +44,8 @@ public:
     bool GetCurrentProgressInfo(PluginLocator& locator, UTF16String& detail, int& current, int& total) const;
     /// One step: at most one plug-in load or one filter. A call that finds its technology finished goes on with the
     /// first step of the next one, whose plug-in GetCurrentProgressInfo has not announced. Returns whether anything
-    /// remains. Exceptions of a context pass through, and the scan stays where it was.
+    /// remains. Exceptions of a context pass through, and the scan stays where it was:
+    /// the same step would run again, so drop the scanner and make one for the plug-ins that are left.
     bool ContinueScan();
     /// Enables again what was enabled when the scanner was made.
     void EndScan();
