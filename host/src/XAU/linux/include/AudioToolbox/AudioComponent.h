@@ -59,7 +59,7 @@ CF_EXPORT OSStatus AudioComponentGetVersion(AudioComponent component, UInt32* ve
 CF_EXPORT AudioComponent AudioComponentRegister(const AudioComponentDescription* description, CFStringRef name,
                                                 UInt32 version, AudioComponentFactoryFunction factory);
 
-/// Calls the factory, and Open of what it made.
+/// Calls the factory, and Open of what it made; Close if Open fails.
 CF_EXPORT OSStatus AudioComponentInstanceNew(AudioComponent component, AudioComponentInstance* instance);
 /// Calls Close.
 CF_EXPORT OSStatus AudioComponentInstanceDispose(AudioComponentInstance instance);
