@@ -104,7 +104,7 @@ UTF16String VSTAudioFilter::ChooseDisplayName(const UTF16String& path, bool useF
 
 void VSTAudioFilter::BuildParameterInfos()
 {
-    const int count = GetParameterCount();
+    const int count = VSTAudioFilter::GetParameterCount();
     mParameterInfos.reserve(static_cast<std::size_t>(count));
     for (int index = 0; index < count; ++index)
         mParameterInfos.emplace_back(new VSTParameterInfo(GetEffect(), index));
@@ -124,7 +124,7 @@ void VSTAudioFilter::SetParameter(int index, float value)
 
 float VSTAudioFilter::GetParameter(int index) const
 {
-    const bool exists = index >= 0 && index < GetParameterCount() && GetEffect()->getParameter;
+    const bool exists = index >= 0 && index < GetParameterCount() && GetEffect()->getParameter != nullptr;
     return exists ? GetEffect()->getParameter(GetEffect(), index) : 0.0F;
 }
 
@@ -137,7 +137,7 @@ boost::intrusive_ptr<AudioFilterParameterInfo> VSTAudioFilter::GetParameterInfo(
 
 bool VSTAudioFilter::CanMono() const
 {
-    return GetEffect() && (GetEffect()->flags & effFlagsCanMono) != 0;
+    return GetEffect() != nullptr && (GetEffect()->flags & effFlagsCanMono) != 0;
 }
 
 boost::intrusive_ptr<AudioFilterDescriptor> VSTAudioFilter::CreateFilterDescriptor(const PluginLocator& locator,
