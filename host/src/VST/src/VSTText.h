@@ -24,7 +24,8 @@ inline std::string_view BoundedText(std::span<const char> bytes)
 inline bool EqualsText(const void* asked, std::string_view text)
 {
     const std::string_view question(asked ? static_cast<const char*>(asked) : "");
-    const zebcore::utility::CaseInsensitive::EqualChar<char> equal(zebcore::Locale::Default());
+    // Not of a locale: the first use of one in a process calls the system.
+    constexpr zebcore::utility::CaseInsensitive::EqualChar<char> equal;
     return asked && std::equal(question.begin(), question.end(), text.begin(), text.end(), equal);
 }
 
