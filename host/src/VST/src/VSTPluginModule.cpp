@@ -10,6 +10,9 @@
 #include "host/src/VST/src/VSTFilterID.h"
 #include "host/src/VST/src/VSTPluginFiles.h"
 
+#include <algorithm>
+#include <vector>
+
 namespace zebaudiofilterhost::vst
 {
 
@@ -57,16 +60,14 @@ void VSTPluginModule::SetProblem(const UTF16String& ending) const
 
 bool VSTPluginModule::FindEntryPoint()
 {
-    for (const char* name : FindEntryPoints(GetPath()))
-    {
-        const auto entryPoint = reinterpret_cast<VSTPluginMainProc>(
-            zebcore::utility::GetFunctionPointerFromModuleImpl(GetOSModule(), name));
-        if (!entryPoint)
-            continue;
-        mEntryPoint = entryPoint;
-        return true;
-    }
-    return false;
+    const std::vector<const char*> names = FindEntryPoints(GetPath());
+    return std::any_of(names.begin(), names.end(),
+                       [this](const char* name)
+                       {
+                           mEntryPoint = reinterpret_cast<VSTPluginMainProc>(
+                               zebcore::utility::GetFunctionPointerFromModuleImpl(GetOSModule(), name));
+                           return mEntryPoint != nullptr;
+                       });
 }
 
 void VSTPluginModule::Unload()

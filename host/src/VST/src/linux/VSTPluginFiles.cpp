@@ -51,7 +51,7 @@ const char16_t* FindFileProblem(const fs::path& path)
 
 bool IsPlugin(const fs::path& path)
 {
-    return path.extension() == kFileExtension && !FindFileProblem(path);
+    return path.extension() == kFileExtension && FindFileProblem(path) == nullptr;
 }
 
 } // namespace
