@@ -27,7 +27,7 @@ NodePtr MakeDate(const CFOpaqueDate& date)
     if (!(std::abs(seconds) <= INT32_MAX))
         return nullptr;
     return NodePtr(plist_new_date(static_cast<std::int32_t>(seconds),
-                                  static_cast<std::int32_t>((date.mTime - seconds) * kMicroseconds)));
+                                  static_cast<std::int32_t>(std::lround((date.mTime - seconds) * kMicroseconds))));
 }
 
 NodePtr MakeArray(const CFOpaqueArray& array, int depth)
