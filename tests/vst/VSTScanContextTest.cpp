@@ -14,7 +14,9 @@
 
 #include <gtest/gtest.h>
 
+#include <stdexcept>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 namespace zebaudiofilterhost::vst
@@ -145,6 +147,21 @@ TEST_F(VSTScanContextTest, ClosesEachPluginAfterItsStep)
         EXPECT_EQ(recorder.LiveObjects(), 0);
         EXPECT_EQ(recorder.Count("effOpen"), step + 1) << "one for the list of members";
     }
+}
+
+TEST_F(VSTScanContextTest, WhatIsThrownPassesThroughAndTheStepStays)
+{
+    const auto recorder = zebtest::RecorderOf(VST2Fixture("ThrowsInVersion"));
+    mContext->SetPluginLocators({Fixture("ThrowsInVersion"), Fixture("Normal")}, false);
+    for (int attempt = 0; attempt < 2; ++attempt)
+    {
+        EXPECT_THROW(mContext->Continue(), std::runtime_error);
+        EXPECT_TRUE(Progress() == std::pair(UTF16String(), 0UL));
+        EXPECT_EQ(recorder.LiveObjects(), 0);
+    }
+    EXPECT_EQ(InfoOf(Fixture("ThrowsInVersion")), nullptr);
+    Scan({Fixture("Normal")});
+    EXPECT_NE(InfoOf(Fixture("Normal")), nullptr) << "the context can be used for the plug-ins that are left";
 }
 
 TEST_F(VSTScanContextTest, AnAbandonedBinaryLeavesNothing)

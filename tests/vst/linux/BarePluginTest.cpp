@@ -1,4 +1,5 @@
-// A plug-in that is hardly one, and needs a library with an entry point of its own.
+// Plug-ins that are hardly any: one without functions, which needs a library with an entry point of its own, and one
+// that never stops to list its members.
 
 #include "foundation/zebcore/NativePath.h"
 #include "foundation/zebcore/StringConversion.h"
@@ -42,6 +43,18 @@ TEST_F(BarePlugin, IsRefusedSinceItDoesNotAnswer)
     EXPECT_TRUE(ids.empty());
     EXPECT_THAT(zebcore::utility::NarrowFromUTF16(PluginModule::GetLoadProblem(mPath)),
                 testing::EndsWith(" is made for an interface older than VST 2.3."));
+}
+
+TEST_F(BarePlugin, AShellWithoutEndIsCutOff)
+{
+    const auto module = GetVSTPlugin(zebcore::filesupport::FromNativePath(ZEB_ENDLESS_PLUGIN));
+    ASSERT_NE(module, nullptr);
+    std::vector<UTF16String> ids;
+    const auto info = module->GetPluginInfo(ids);
+    ASSERT_NE(info, nullptr);
+    EXPECT_TRUE(info->IsShell());
+    ASSERT_EQ(ids.size(), 65536U);
+    EXPECT_TRUE(ids.back().starts_with(u"2:65536 "));
 }
 
 } // namespace
