@@ -36,7 +36,7 @@ boost::intrusive_ptr<XAUAudioFilter> XAUAudioFilter::Create(const UTF16String& f
     ZEB_TRACE("XAUAudioFilter", "Create(" << filterID << ")");
     const bool lacksPrefix = filterID.size() > kPrefixLength && filterID[1] != u':';
     const UTF16String prefixedID = lacksPrefix ? u"4:" + filterID : filterID;
-    AudioComponent const component = FindComponentForDescription(DecodeComponentID(prefixedID));
+    auto* const component = FindComponentForDescription(DecodeComponentID(prefixedID));
     AudioUnit instance = nullptr;
     if (!component || AudioComponentInstanceNew(component, &instance) != noErr || !instance)
         return {};
@@ -51,7 +51,7 @@ XAUAudioFilter::XAUAudioFilter(const UTF16String& filterID, AudioComponent compo
     GetNameAndManufacturer(component, name, vendor);
     SetDisplayName(name);
     ZEB_TRACE("XAUAudioFilter", "XAUAudioFilter(), vendor: " << vendor << ", effect: " << name);
-    UInt32 size = sizeof(mFactoryPresets);
+    UInt32 size = sizeof(CFArrayRef);
     if (AudioUnitGetProperty(mInstance, kAudioUnitProperty_FactoryPresets, kAudioUnitScope_Global, 0,
                              &mFactoryPresets, &size) != noErr)
         mFactoryPresets = nullptr;

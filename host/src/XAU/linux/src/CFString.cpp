@@ -3,7 +3,6 @@
 #include "host/src/XAU/linux/src/CFStringObject.h"
 
 #include <algorithm>
-#include <cstring>
 #include <functional>
 #include <map>
 #include <memory>
@@ -105,7 +104,7 @@ Boolean CFStringGetCString(CFStringRef text, char* buffer, CFIndex size, CFStrin
     if (size < 0 || !cf::Encode(text->mText, encoding, bytes) || bytes.size() + zero > static_cast<std::size_t>(size))
         return 0;
     bytes.append(zero, '\0');
-    std::memcpy(buffer, bytes.data(), bytes.size());
+    bytes.copy(buffer, bytes.size());
     return 1;
 }
 

@@ -67,13 +67,13 @@ CFTypeRef MakeBoolean(plist_t node)
     return value ? kCFBooleanTrue : kCFBooleanFalse;
 }
 
+// The parser's fractions of a second have lost their sign, and change with each round.
 CFTypeRef MakeDate(plist_t node)
 {
-    constexpr double kMicroseconds = 1e6;
     std::int32_t seconds = 0;
     std::int32_t microseconds = 0;
     plist_get_date_val(node, &seconds, &microseconds);
-    return CFDateCreate(nullptr, seconds + microseconds / kMicroseconds);
+    return CFDateCreate(nullptr, seconds);
 }
 
 CFTypeRef MakeArray(plist_t node, int depth)

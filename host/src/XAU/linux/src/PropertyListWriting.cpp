@@ -22,12 +22,10 @@ NodePtr MakeNumber(const CFOpaqueNumber& number)
 
 NodePtr MakeDate(const CFOpaqueDate& date)
 {
-    constexpr double kMicroseconds = 1e6;
-    const double seconds = std::floor(date.mTime);
-    if (!(std::abs(seconds) <= INT32_MAX))
+    const double seconds = std::trunc(date.mTime);
+    if (!(seconds >= INT32_MIN && seconds <= INT32_MAX))
         return nullptr;
-    return NodePtr(plist_new_date(static_cast<std::int32_t>(seconds),
-                                  static_cast<std::int32_t>(std::lround((date.mTime - seconds) * kMicroseconds))));
+    return NodePtr(plist_new_date(static_cast<std::int32_t>(seconds), 0));
 }
 
 NodePtr MakeArray(const CFOpaqueArray& array, int depth)

@@ -3,7 +3,7 @@
 #include "CoreFoundation/CFBase.h"
 
 // Property lists: strings, numbers, Booleans, dates, data, arrays, and dictionaries by string. A string is written up
-// to a zero in it, and bytes with one in a string are no property list here.
+// to a zero in it, and bytes with one in a string are no property list here. Dates are kept to the second.
 
 enum CFPropertyListFormat : CFIndex
 {
