@@ -1,4 +1,5 @@
 #include "catalogue/PluginFinder.h"
+#include "catalogue/SettingsLock.h"
 #include "cli/ArgumentParser.h"
 #include "cli/Failure.h"
 #include "cli/HelpText.h"
@@ -13,6 +14,7 @@
 #include <array>
 #include <exception>
 #include <functional>
+#include <optional>
 #include <string_view>
 
 namespace zebhost
@@ -37,6 +39,12 @@ constexpr std::array<std::pair<std::string_view, CommandFunction>, 13> kCommands
                                                                                      {"blocks", RunBlocks},
                                                                                      {"console", RunConsole}}};
 
+bool ChangesSettings(const Arguments& arguments)
+{
+    return arguments.command == "block" || arguments.command == "unblock" ||
+           (arguments.command == "scan" && !arguments.Has("dry-run"));
+}
+
 ExitCode RunWithLibrary(const Arguments& arguments, Console& console)
 {
     const auto command = std::find_if(kCommands.begin(), kCommands.end(),
@@ -48,6 +56,12 @@ ExitCode RunWithLibrary(const Arguments& arguments, Console& console)
     StartTracing(arguments.All("trace"));
     zebaudiofilterhost::Initialize();
     const SettingsFolder folder(arguments.Text("settings"));
+    // Before the files are read: what another program saved after that would be lost with the next save of this one.
+    std::optional<SettingsLock> lock;
+    if (ChangesSettings(arguments))
+    {
+        lock.emplace(folder.Path());
+    }
     Catalogue catalogue(folder, console);
     catalogue.Load();
     UseStandardPlaces();

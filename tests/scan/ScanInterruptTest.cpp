@@ -3,12 +3,17 @@
 
 #include <csignal>
 
+#include <fcntl.h>
+#include <sys/file.h>
+#include <unistd.h>
+
 namespace zebtest
 {
 
 namespace
 {
 
+namespace fs = std::filesystem;
 using testing::ElementsAre;
 using testing::HasSubstr;
 using testing::IsEmpty;
@@ -43,6 +48,34 @@ protected:
     StartedProgram Start(const std::vector<std::string>& arguments) const
     {
         return {CommandLine(arguments), mVariables, mFolder};
+    }
+
+    // Starts the command while the settings are empty and locked, and fills them once it has turned to them.
+    int RunWhileFilesAppear(const std::vector<std::string>& command, const fs::path& files) const
+    {
+        fs::remove_all(Settings());
+        fs::create_directories(Settings());
+        const int folder = open(Settings().c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
+        EXPECT_EQ(flock(folder, LOCK_EX), 0);
+        StartedProgram program = Start(command);
+        EXPECT_TRUE(Eventually([this, &program] { return HasOpen(program.Process(), Settings()); }));
+        fs::copy(files, Settings(), fs::copy_options::recursive);
+        close(folder);
+        return program.Wait();
+    }
+
+    static bool HasOpen(pid_t process, const fs::path& path)
+    {
+        std::error_code gone;
+        for (const fs::directory_entry& each :
+             fs::directory_iterator("/proc/" + std::to_string(process) + "/fd", gone))
+        {
+            if (fs::read_symlink(each, gone) == path)
+            {
+                return true;
+            }
+        }
+        return !IsAlive(process);
     }
 };
 
@@ -148,6 +181,31 @@ TEST_F(ScanInterruptTest, NobodyElseChangesTheSettingsMeanwhile)
     scan.Signal(SIGINT);
     EXPECT_EQ(scan.Wait(), 1);
     Succeed({"block", Bundle("c").string()});
+}
+
+// The files change between the start of a command and the moment at which it may change them itself.
+TEST_F(ScanInterruptTest, WhatAnotherProgramSavedMeanwhileIsKept)
+{
+    AddBundle("b");
+    AddBundle("d");
+    const fs::path saved = mFolder / "saved";
+    Succeed({"scan", Bundle("a").string()});
+    Succeed({"block", Bundle("d").string()});
+    fs::rename(Settings(), saved);
+    const std::vector<std::string> commands[] = {{"scan", Bundle("b").string()}, {"block", Bundle("b").string()}};
+    for (const std::vector<std::string>& command : commands)
+    {
+        // A machine so slow that the command gives up waiting proves nothing.
+        int code = 1;
+        for (int tries = 0; code == 1 && tries < 20; ++tries)
+        {
+            code = RunWhileFilesAppear(command, saved);
+        }
+        EXPECT_EQ(code, 0) << command.front();
+        EXPECT_EQ(Records().count("a"), 1U) << command.front();
+        EXPECT_EQ(Blocks().count("d"), 1U) << command.front();
+        EXPECT_EQ(Records().count("b") + Blocks().count("b"), 1U) << command.front();
+    }
 }
 
 // Ctrl-Z and a lid that is closed must not count as a plug-in's silence.

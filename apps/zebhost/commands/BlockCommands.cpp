@@ -1,6 +1,5 @@
 #include "catalogue/FilterSelector.h"
 #include "catalogue/PluginFinder.h"
-#include "catalogue/SettingsLock.h"
 #include "cli/Failure.h"
 #include "commands/Commands.h"
 #include "output/TextTable.h"
@@ -84,7 +83,6 @@ ExitCode RunBlock(CommandContext& context)
     BlockReason why;
     why.reason = context.arguments.Text("reason", "blocked by hand");
     why.since = TimeOfNow();
-    const SettingsLock lock(context.catalogue.Folder().Path());
     context.catalogue.Block(locator, why);
     Tell(context, locator, " is blocked; 'zebhost unblock' lets it be used again");
     return ExitCode::Done;
@@ -93,7 +91,6 @@ ExitCode RunBlock(CommandContext& context)
 ExitCode RunUnblock(CommandContext& context)
 {
     const PluginLocator locator = BlockedPlugin(context, context.arguments.Text("PLUGIN"));
-    const SettingsLock lock(context.catalogue.Folder().Path());
     context.catalogue.Unblock(locator);
     ForgetProblem(context.catalogue, locator);
     Tell(context, locator, " is not blocked any more; the next 'zebhost scan' tries it");

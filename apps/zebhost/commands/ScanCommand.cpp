@@ -1,6 +1,5 @@
 #include "catalogue/ScanPlan.h"
 #include "catalogue/ScanSession.h"
-#include "catalogue/SettingsLock.h"
 #include "cli/Failure.h"
 #include "commands/Commands.h"
 #include "commands/ScanReport.h"
@@ -130,7 +129,6 @@ ExitCode RunScan(CommandContext& context)
     {
         return DryRun(context);
     }
-    const SettingsLock lock(context.catalogue.Folder().Path());
     const ScanPlan plan = MakePlan(context);
     ScanReport report(context, plan);
     std::size_t restarts = 0;
