@@ -149,6 +149,17 @@ TEST_F(ScanInterruptTest, AHangTakesItsChildrenAlong)
     EXPECT_TRUE(Eventually([child] { return !IsAlive(child); }));
 }
 
+TEST_F(ScanInterruptTest, AHangOutsideItsProcessGroupEndsToo)
+{
+    AddBundle("b-leave");
+    StartedProgram scan = Start({"scan", "--timeout", Seconds(0.5)});
+    const pid_t worker = WorkerThatLoads("b-leave");
+    ASSERT_TRUE(Eventually([worker] { return !IsAlive(worker); }));
+    EXPECT_EQ(scan.Wait(), 0) << scan.Err();
+    EXPECT_THAT(Records(), ElementsAre("a", "c"));
+    EXPECT_THAT(Blocks(), ElementsAre(Pair("b-leave", HasSubstr("did not answer"))));
+}
+
 TEST_F(ScanInterruptTest, AWorkerDiesWithItsParent)
 {
     AddBundle("b-hang");

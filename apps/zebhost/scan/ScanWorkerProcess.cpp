@@ -151,12 +151,17 @@ WorkerEnd ScanWorkerProcess::End()
     const bool byItself = HasExited() || (!mIsConnected && mLines.Size() <= kLongestMessage && ExitsSoon());
     ReadOutput();
     kill(-mProcess, SIGKILL);
+    // A plug-in may have moved the process out of its group.
+    kill(mProcess, SIGKILL);
+    // One that even this can't end hangs in the system; it is left behind.
+    const bool hasEnded = ExitsSoon();
     int status = 0;
-    while (waitpid(mProcess, &status, 0) < 0 && errno == EINTR)
+    if (hasEnded)
     {
+        waitpid(mProcess, &status, 0);
     }
     mProcess = -1;
-    if (!byItself)
+    if (!byItself || !hasEnded)
     {
         return {WorkerEnd::Kind::Disconnected, 0};
     }

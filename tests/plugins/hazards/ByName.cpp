@@ -12,6 +12,7 @@
 
 #include <dlfcn.h>
 #include <fcntl.h>
+#include <sys/resource.h>
 #include <sys/socket.h>
 #include <unistd.h>
 
@@ -65,6 +66,31 @@ void SpawnAndHang()
     Hang();
 }
 
+// What is sent to its process group does not reach it any more.
+void LeaveAndHang()
+{
+    if (setpgid(0, getpgid(getppid())) == 0)
+        Hang();
+}
+
+// Descriptors below this are taken to be all that are open.
+constexpr int kAllDescriptors = 1024;
+
+// The process ends when it waits for more to do.
+void GoDeaf()
+{
+    for (int descriptor = 3; descriptor < kAllDescriptors; ++descriptor)
+        shutdown(descriptor, SHUT_RD);
+}
+
+// The scan can't start another process, for want of descriptors.
+void StarveAndGoDeaf()
+{
+    constexpr rlimit kFew{14, 14};
+    prlimit(getppid(), RLIMIT_NOFILE, &kFew, nullptr);
+    GoDeaf();
+}
+
 using Deed = void (*)();
 
 const std::map<std::string, Deed>& Deeds()
@@ -111,18 +137,18 @@ const std::map<std::string, Deed>& Deeds()
          {
              SpawnAndHang();
          }},
-        // The scanner's own descriptor is among the first.
+        // The scanner's own descriptor is among them.
         {"closes",
          []
          {
-             for (int descriptor = 3; descriptor < 64; ++descriptor)
+             for (int descriptor = 3; descriptor < kAllDescriptors; ++descriptor)
                  close(descriptor);
              Hang();
          }},
         {"writes",
          []
          {
-             for (int descriptor = 3; descriptor < 64; ++descriptor)
+             for (int descriptor = 3; descriptor < kAllDescriptors; ++descriptor)
                  static_cast<void>(!write(descriptor, "nonsense\n", 9));
              Hang();
          }},
@@ -130,7 +156,17 @@ const std::map<std::string, Deed>& Deeds()
         {"deaf",
          []
          {
-             shutdown(3, SHUT_RD);
+             GoDeaf();
+         }},
+        {"starve",
+         []
+         {
+             StarveAndGoDeaf();
+         }},
+        {"leave",
+         []
+         {
+             LeaveAndHang();
          }},
     };
     return sDeeds;
