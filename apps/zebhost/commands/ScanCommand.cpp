@@ -22,16 +22,17 @@ using zebaudiofilterhost::PluginModuleInfoManager;
 namespace
 {
 
-// A reader of standard error that goes away must not end a scan between two saves, nor a worker's end do so.
-class PipesMayBreak
+// Handles a signal in another way while it lives.
+class SignalHandling
 {
 public:
-    PipesMayBreak() : mBefore(std::signal(SIGPIPE, SIG_IGN)) {}
-    ~PipesMayBreak() { std::signal(SIGPIPE, mBefore); }
-    PipesMayBreak(const PipesMayBreak&) = delete;
-    PipesMayBreak& operator=(const PipesMayBreak&) = delete;
+    SignalHandling(int signal, void (*handler)(int)) : mSignal(signal), mBefore(std::signal(signal, handler)) {}
+    ~SignalHandling() { std::signal(mSignal, mBefore); }
+    SignalHandling(const SignalHandling&) = delete;
+    SignalHandling& operator=(const SignalHandling&) = delete;
 
 private:
+    int mSignal;
     void (*mBefore)(int);
 };
 
@@ -79,7 +80,10 @@ void PutInOrder(const CommandContext& context, const ScanPlan& plan)
 std::size_t ScanInWorkers(const CommandContext& context, const ScanPlan& plan, double timeout, ScanReport& report)
 {
     interrupt::Watch(interrupt::Second::Ignored);
-    const PipesMayBreak mayBreak;
+    // A reader of standard error that goes away must not end a scan between two saves, nor a worker's end do so.
+    const SignalHandling pipesMayBreak(SIGPIPE, SIG_IGN);
+    // Programs inherit that it is ignored; then nobody could be told how a worker ended.
+    const SignalHandling endsAreTold(SIGCHLD, SIG_DFL);
     ScanSupervisor::Options options;
     options.skipCategory = context.arguments.Has("skip-category");
     options.timeoutSeconds = timeout;
