@@ -142,6 +142,34 @@ TEST_F(ScanSurvivalTest, ThePluginAtHandIsNotBlamedForAWorkerThatNeverTurnedToIt
     EXPECT_EQ(CountLoads().at("b"), 1);
 }
 
+TEST_F(ScanSurvivalTest, NobodyIsBlamedForAWorkerThatCannotBeStarted)
+{
+    for (const char* name : {"a-starve", "b", "c"})
+    {
+        AddBundle(name);
+    }
+    const RunResult result = Run({"scan"});
+    EXPECT_EQ(result.code, 1) << result.err;
+    EXPECT_THAT(result.LastLine(), HasSubstr("could not be started"));
+    EXPECT_TRUE(Blocks().empty());
+    EXPECT_THAT(Records(), ElementsAre("a-starve"));
+    Succeed({"scan"});
+    EXPECT_THAT(Records(), ElementsAre("a-starve", "b", "c"));
+}
+
+TEST_F(ScanSurvivalTest, ThoughTheEndOfChildrenIsIgnoredWhereItWasStarted)
+{
+    AddBundle("a-segv");
+    AddBundle("b");
+    std::vector<std::string> words = {"/bin/sh", "-c", "trap '' CHLD; exec \"$0\" \"$@\""};
+    const std::vector<std::string> scan = CommandLine({"scan", "--json"});
+    words.insert(words.end(), scan.begin(), scan.end());
+    const RunResult result = RunProgram(words, mVariables, mFolder);
+    ASSERT_EQ(result.code, 0) << result.err;
+    EXPECT_THAT(States(result.Json()), ElementsAre(Pair("a-segv", "crashed"), Pair("b", "scanned")));
+    EXPECT_THAT(Blocks(), ElementsAre(Pair("a-segv", HasSubstr("SIGSEGV"))));
+}
+
 // Where one technology's share of a scan ends, the step into the next must not hit a plug-in that nobody announced.
 TEST_F(ScanSurvivalTest, ACrashBehindTheLastOfATechnologyIsNotBlamedOnThat)
 {

@@ -48,14 +48,7 @@ void ScanJournal::Conclude(const PluginLocator& locator, const std::string& prob
     }
     catch (const Failure&)
     {
-        try
-        {
-            Release(locator);
-        }
-        catch (const Failure&)
-        {
-            // The first failure says why; this file lies on the same disk.
-        }
+        ReleaseAfterFailure(locator);
         throw;
     }
     mCatalogue.Unblock(locator);
@@ -93,6 +86,18 @@ void ScanJournal::Release(const PluginLocator& locator)
     else
     {
         mCatalogue.Unblock(locator);
+    }
+}
+
+void ScanJournal::ReleaseAfterFailure(const PluginLocator& locator)
+{
+    try
+    {
+        Release(locator);
+    }
+    catch (const Failure&)
+    {
+        // The first failure says why; the files that this one needs may lie on the same disk.
     }
 }
 

@@ -24,6 +24,8 @@ public:
     void Condemn(const zebaudiofilterhost::PluginLocator& locator, const std::string& reason);
     // It was not touched, or not to its end, through no fault of its own: all is as before.
     void Release(const zebaudiofilterhost::PluginLocator& locator);
+    // The same while something else is thrown: throws nothing itself.
+    void ReleaseAfterFailure(const zebaudiofilterhost::PluginLocator& locator);
 
 private:
     void Record(const zebaudiofilterhost::PluginLocator& locator, const std::string& problem);

@@ -46,7 +46,7 @@ bool ScanSupervisor::ScanOne(const PluginLocator& locator, const Progress& progr
     UseWorkerFor(locator.GetTechnologyType());
     mOutput.Begin();
     mJournal.Announce(locator);
-    const Verdict verdict = Try(locator, progress);
+    const Verdict verdict = TryOrRelease(locator, progress);
     switch (verdict)
     {
     case Verdict::Result:
@@ -66,6 +66,21 @@ bool ScanSupervisor::ScanOne(const PluginLocator& locator, const Progress& progr
     }
     Blame(locator, verdict);
     return true;
+}
+
+// A worker that cannot be started again says nothing against the plug-in at hand.
+ScanSupervisor::Verdict ScanSupervisor::TryOrRelease(const PluginLocator& locator, const Progress& progress)
+{
+    try
+    {
+        return Try(locator, progress);
+    }
+    catch (...)
+    {
+        mWorker.reset();
+        mJournal.ReleaseAfterFailure(locator);
+        throw;
+    }
 }
 
 // Something that a plug-in before left running may end a worker at any time; the next plug-in is not to blame.

@@ -53,6 +53,7 @@ private:
 
     // False when the scan is to end.
     bool ScanOne(const zebaudiofilterhost::PluginLocator& locator, const Progress& progress);
+    Verdict TryOrRelease(const zebaudiofilterhost::PluginLocator& locator, const Progress& progress);
     Verdict Try(const zebaudiofilterhost::PluginLocator& locator, const Progress& progress);
     Verdict Await(const zebaudiofilterhost::PluginLocator& locator, const Progress& progress);
     void UseWorkerFor(zebaudiofilterhost::TechnologyType type);

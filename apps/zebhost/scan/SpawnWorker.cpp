@@ -42,6 +42,10 @@ struct Ends
         theirs = fcntl(pair[1], F_DUPFD_CLOEXEC, kAboveAll);
         close(pair[0]);
         close(pair[1]);
+        if (ours < 0 || theirs < 0)
+        {
+            Refuse(EMFILE);
+        }
     }
 };
 
