@@ -30,7 +30,7 @@ AudioStreamBasicDescription MakeStereo()
 template <typename T>
 void Put(void* data, const T& value)
 {
-    std::memcpy(data, &value, sizeof(value));
+    std::memcpy(data, &value, sizeof(T)); // NOLINT(bugprone-sizeof-expression): of a reference, itself
 }
 
 // False for another size than the property's.
@@ -166,8 +166,9 @@ OSStatus Unit::GetPropertyInfo(AudioUnitPropertyID property, AudioUnitScope scop
                                UInt32& size, Boolean& isWritable)
 {
     size = GetPropertySize(property, scope, element);
-    isWritable = property == kAudioUnitProperty_ClassInfo || property == kAudioUnitProperty_StreamFormat ||
-                 property == kAudioUnitProperty_MaximumFramesPerSlice;
+    const bool isOneToSet = property == kAudioUnitProperty_ClassInfo || property == kAudioUnitProperty_StreamFormat ||
+                            property == kAudioUnitProperty_MaximumFramesPerSlice;
+    isWritable = isOneToSet ? 1 : 0;
     const bool mayBeEmpty = property == kAudioUnitProperty_ParameterList && scope == kAudioUnitScope_Global;
     return size > 0 || mayBeEmpty ? noErr : kAudioUnitErr_InvalidProperty;
 }
@@ -225,7 +226,7 @@ void Unit::FillParameterInfo(const ParameterDescription& parameter, AudioUnitPar
                  kAudioUnitParameterFlag_HasCFNameString | kAudioUnitParameterFlag_CFNameRelease;
 }
 
-OSStatus Unit::SetFormat(AudioStreamBasicDescription& format, const AudioStreamBasicDescription& wanted)
+OSStatus Unit::SetFormat(AudioStreamBasicDescription& format, const AudioStreamBasicDescription& wanted) const
 {
     if (mIsInitialized)
         return kAudioUnitErr_Initialized;

@@ -92,7 +92,7 @@ private:
     CFPropertyListRef CopyClassInfo() const;
     OSStatus SetClassInfo(CFPropertyListRef list);
     OSStatus SetPreset(const AUPreset& preset);
-    OSStatus SetFormat(AudioStreamBasicDescription& format, const AudioStreamBasicDescription& wanted);
+    OSStatus SetFormat(AudioStreamBasicDescription& format, const AudioStreamBasicDescription& wanted) const;
     bool AllowsChannels() const;
     void PullInput(std::size_t input, const AudioTimeStamp& time, UInt32 frames);
 

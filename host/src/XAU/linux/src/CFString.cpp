@@ -3,6 +3,7 @@
 #include "host/src/XAU/linux/src/CFStringObject.h"
 
 #include <algorithm>
+#include <cstring>
 #include <functional>
 #include <map>
 #include <memory>
