@@ -56,7 +56,7 @@ std::optional<OSType> FindCode(const CFOpaqueDictionary& dictionary, const char*
 {
     constexpr std::size_t kCodeLength = 4;
     constexpr unsigned int kByte = 8;
-    const CFStringRef text = Find<CFOpaqueString>(dictionary, key, CFStringGetTypeID());
+    const auto* text = Find<CFOpaqueString>(dictionary, key, CFStringGetTypeID());
     std::string bytes;
     if (!text || !cf::Encode(text->mText, kCFStringEncodingISOLatin1, bytes) || bytes.size() != kCodeLength)
         return std::nullopt;
@@ -71,12 +71,12 @@ std::optional<ComponentListing> ReadListing(const CFOpaqueDictionary& entry, con
     const auto type = FindCode(entry, "type");
     const auto subType = FindCode(entry, "subtype");
     const auto manufacturer = FindCode(entry, "manufacturer");
-    const CFStringRef name = Find<CFOpaqueString>(entry, "name", CFStringGetTypeID());
-    const CFStringRef factory = Find<CFOpaqueString>(entry, "factoryFunction", CFStringGetTypeID());
+    const auto* name = Find<CFOpaqueString>(entry, "name", CFStringGetTypeID());
+    const auto* factory = Find<CFOpaqueString>(entry, "factoryFunction", CFStringGetTypeID());
     if (!type || !subType || !manufacturer || !name || !factory || factory->mText.empty())
         return std::nullopt;
     UInt32 version = 0;
-    if (const CFNumberRef number = Find<CFOpaqueNumber>(entry, "version", CFNumberGetTypeID()))
+    if (const auto* number = Find<CFOpaqueNumber>(entry, "version", CFNumberGetTypeID()))
         CFNumberGetValue(number, kCFNumberSInt32Type, &version);
     return ComponentListing{
         {*type, *subType, *manufacturer, 0, 0}, name->mText, version, bundle, cf::ToUTF8(factory)};

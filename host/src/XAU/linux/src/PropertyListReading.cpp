@@ -64,7 +64,7 @@ CFTypeRef MakeBoolean(plist_t node)
 {
     std::uint8_t value = 0;
     plist_get_bool_val(node, &value);
-    return value ? kCFBooleanTrue : kCFBooleanFalse;
+    return value != 0 ? kCFBooleanTrue : kCFBooleanFalse;
 }
 
 // The parser's fractions of a second have lost their sign, and change with each round.

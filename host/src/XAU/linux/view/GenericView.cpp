@@ -64,7 +64,6 @@ std::unique_ptr<GenericView> GenericView::Create(AudioUnit unit, xcb_window_t pa
 
 GenericView::GenericView(xcb_connection_t* connection, AudioUnit unit, boost::function<void()> resized)
     : mConnection(connection)
-    , mUnit(unit)
     , mRows(ReadParameterRows(unit))
     , mGeometry(ViewGeometry::Fit(mRows.size(), kOpeningWidth))
     , mResized(std::move(resized))

@@ -47,7 +47,6 @@ private:
     xcb_visualtype_t* mVisual = nullptr; // the connection's
     cairo_device_t* mDevice = nullptr;   // one reference, once something is drawn
     zebcore::threads::WatchID mWatch = zebcore::threads::kNoWatch;
-    AudioUnit mUnit;
     AUEventListenerRef mListener = nullptr;
     std::vector<ParameterRow> mRows;
     ViewGeometry mGeometry;

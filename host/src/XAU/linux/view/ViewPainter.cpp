@@ -123,7 +123,9 @@ void DrawGrip(cairo_t* context, const ViewGeometry& geometry)
 {
     SetColour(context, kIdle);
     cairo_set_line_width(context, 1.0);
-    for (double inset = 3.0; inset < ViewGeometry::kGrip; inset += 4.0)
+    constexpr int kFirst = 3;
+    constexpr int kApart = 4;
+    for (int inset = kFirst; inset < ViewGeometry::kGrip; inset += kApart)
     {
         cairo_move_to(context, geometry.width - inset, geometry.height);
         cairo_line_to(context, geometry.width, geometry.height - inset);
