@@ -90,6 +90,22 @@ TEST_F(ScanDiskFaultsTest, TheUserIsToldWhichFileAndNothingIsLost)
     }
 }
 
+// Whichever save is the first to fail, and with known plug-ins as with new ones.
+TEST_F(ScanDiskFaultsTest, NoGoodPluginIsBlockedByATroubledDisk)
+{
+    const std::string faults[] = {"rename:full:", "write:full:", "sync:broken:"};
+    for (const char* file : {kCatalogue, kBinaries, kBlocks, kReasons, "$/settings"})
+    {
+        for (int step = 0; step < 12; ++step)
+        {
+            const std::string fault = faults[step % 3] + std::to_string(step / 3) + "+" + file;
+            RunOnFaultyDisk(fault, {"scan", "--full", Bundle("a").string(), Bundle("c").string()});
+            EXPECT_THAT(Blocks(), testing::ElementsAre(testing::Pair("b-segv", HasSubstr("SIGSEGV")))) << fault;
+            EXPECT_EQ(Records().count("a"), 1U) << fault;
+        }
+    }
+}
+
 TEST_F(ScanDiskFaultsTest, WithRoomAgainTheNextScanGoesOn)
 {
     RunOnFaultyDisk(std::string("write:full:") + kCatalogue, {"scan"});

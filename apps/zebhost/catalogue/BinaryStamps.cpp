@@ -16,7 +16,7 @@ std::optional<BinaryStamps::Entry> BinaryStamps::Find(const PluginLocator& locat
     {
         return std::nullopt;
     }
-    return Entry{StampIn(*entry), TextIn(*entry, "problem")};
+    return Entry{StampIn(*entry), TextIn(*entry, "problem"), TextIn(*entry, "visit")};
 }
 
 void BinaryStamps::Set(const PluginLocator& locator, const Entry& entry)
@@ -25,6 +25,10 @@ void BinaryStamps::Set(const PluginLocator& locator, const Entry& entry)
     if (!entry.problem.empty())
     {
         json["problem"] = entry.problem;
+    }
+    if (!entry.visit.empty())
+    {
+        json["visit"] = entry.visit;
     }
     mTable.Set(locator, std::move(json));
 }

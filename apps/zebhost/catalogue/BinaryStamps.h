@@ -23,6 +23,7 @@ public:
     {
         BinaryStamp binary;
         std::string problem; // why it could not be loaded; empty if it could
+        std::string visit;   // of the scan that found this out: see BlockReason
     };
     std::optional<Entry> Find(const zebaudiofilterhost::PluginLocator& locator) const;
     void Set(const zebaudiofilterhost::PluginLocator& locator, const Entry& entry);

@@ -16,6 +16,8 @@ constexpr const char* kSince = "since";
 constexpr const char* kBinary = "binary";
 constexpr const char* kAtHand = "atHand";
 constexpr const char* kKnown = "known";
+constexpr const char* kVisit = "visit";
+constexpr const char* kByHand = "byHand";
 
 bool FlagIn(const Json& entry, const char* name)
 {
@@ -49,6 +51,11 @@ void BlockReasons::Set(const PluginLocator& locator, const BlockReason& reason)
     {
         entry[kAtHand] = true;
         entry[kKnown] = reason.wasKnown;
+        entry[kVisit] = reason.visit;
+    }
+    if (reason.isByHand)
+    {
+        entry[kByHand] = true;
     }
     mTable.Set(locator, std::move(entry));
 }
@@ -60,8 +67,8 @@ BlockReason BlockReasons::Get(const PluginLocator& locator) const
     {
         return {};
     }
-    return {TextIn(*entry, kReason), TextIn(*entry, kSince), StampIn(*entry), FlagIn(*entry, kAtHand),
-            FlagIn(*entry, kKnown)};
+    return {TextIn(*entry, kReason), TextIn(*entry, kSince), StampIn(*entry),        FlagIn(*entry, kAtHand),
+            FlagIn(*entry, kKnown),  TextIn(*entry, kVisit), FlagIn(*entry, kByHand)};
 }
 
 } // namespace zebhost

@@ -19,6 +19,8 @@ struct BlockReason
     // Of a scan that has not ended, or was killed.
     bool isAtHand = false;
     bool wasKnown = false; // while at hand: the catalogue has a record of an earlier scan
+    std::string visit;     // while at hand: stands in BinaryStamps as well once the result is saved
+    bool isByHand = false; // no scan offers it again
 };
 
 // The time of now, as it stands in `since`.

@@ -13,6 +13,7 @@
 #include <algorithm>
 #include <cerrno>
 #include <iterator>
+#include <optional>
 
 namespace zebhost
 {
@@ -107,8 +108,8 @@ void Catalogue::Load()
     LiftFinishedBlocks();
 }
 
-// A scan that was killed after it had saved a plug-in's record, and before it took the plug-in off the list, had
-// nothing against it.
+// A scan that was killed, or met a full disk, after it had saved what it found of a plug-in, and before it took the
+// plug-in off the list, had nothing against it.
 void Catalogue::LiftFinishedBlocks()
 {
     BannedPluginManager& blocks = BannedPluginManager::GetInstance();
@@ -116,13 +117,19 @@ void Catalogue::LiftFinishedBlocks()
     for (const PluginLocator& locator : blocked)
     {
         const BlockReason why = mReasons.Get(locator);
-        if (why.isAtHand && !why.wasKnown &&
-            PluginModuleInfoManager::GetInstance().FindPluginInfo(locator) != nullptr)
+        if (why.isAtHand && HasResult(locator, why))
         {
             blocks.RemoveBannedPlugin(locator);
             mLifted.push_back(locator);
         }
     }
+}
+
+bool Catalogue::HasResult(const PluginLocator& locator, const BlockReason& why) const
+{
+    const std::optional<BinaryStamps::Entry> last = mStamps.Find(locator);
+    return (last && !why.visit.empty() && last->visit == why.visit) ||
+           (!why.wasKnown && PluginModuleInfoManager::GetInstance().FindPluginInfo(locator) != nullptr);
 }
 
 void Catalogue::LoadBlocks()

@@ -49,6 +49,8 @@ public:
 private:
     void LoadBlocks();
     void LiftFinishedBlocks();
+    // Of the scan that blocked the plug-in while it was at hand.
+    bool HasResult(const zebaudiofilterhost::PluginLocator& locator, const BlockReason& why) const;
     void SaveBlockList();
     bool IsSound(const std::filesystem::path& path, unsigned int version) const;
     void NoteDamaged(const std::filesystem::path& path);

@@ -68,7 +68,7 @@ void PutInOrder(const CommandContext& context, const ScanPlan& plan)
     }
     for (const PluginLocator& locator : plan.unstamped)
     {
-        context.catalogue.Stamps().Set(locator, {StampOf(locator), {}});
+        context.catalogue.Stamps().Set(locator, {StampOf(locator), {}, {}});
     }
     if (!plan.toDrop.empty() || !plan.unstamped.empty())
     {

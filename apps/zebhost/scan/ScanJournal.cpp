@@ -5,6 +5,10 @@
 #include <host/BannedPluginManager.h>
 #include <host/PluginModuleInfoManager.h>
 
+#include <chrono>
+
+#include <unistd.h>
+
 namespace zebhost
 {
 
@@ -22,6 +26,14 @@ bool IsKnown(const PluginLocator& locator)
     return PluginModuleInfoManager::GetInstance().FindPluginInfo(locator) != nullptr;
 }
 
+// No two are the same.
+std::string NewVisit()
+{
+    static unsigned int sCount = 0;
+    return std::to_string(std::chrono::system_clock::now().time_since_epoch().count()) + "-" +
+           std::to_string(getpid()) + "-" + std::to_string(++sCount);
+}
+
 } // namespace
 
 ScanJournal::ScanJournal(Catalogue& catalogue) : mCatalogue(catalogue)
@@ -37,7 +49,18 @@ void ScanJournal::Announce(const PluginLocator& locator)
     {
         mBlockedBefore = mCatalogue.Reasons().Get(locator);
     }
-    mCatalogue.Block(locator, {kAtHand, TimeOfNow(), mBinary, true, mWasKnown}, LocatorTable::Saving::Quick);
+    mVisit = NewVisit();
+    try
+    {
+        mCatalogue.Block(locator, {kAtHand, TimeOfNow(), mBinary, true, mWasKnown, mVisit, false},
+                         LocatorTable::Saving::Quick);
+    }
+    catch (const Failure&)
+    {
+        // The new list may be in place, and only the folder not flushed.
+        ReleaseAfterFailure(locator);
+        throw;
+    }
 }
 
 void ScanJournal::Conclude(const PluginLocator& locator, const std::string& problem)
@@ -60,13 +83,25 @@ void ScanJournal::Record(const PluginLocator& locator, const std::string& proble
     {
         mCatalogue.Save();
     }
-    mCatalogue.Stamps().Set(locator, {mBinary, problem});
+    mCatalogue.Stamps().Set(locator, ResultOf(locator, problem));
     mCatalogue.SaveStamps(LocatorTable::Saving::Quick);
+}
+
+// A plug-in that is in the catalogue, and cannot be loaded, keeps its record and the stamp that belongs to it:
+// another binary counts as changed for as long as it fails.
+BinaryStamps::Entry ScanJournal::ResultOf(const PluginLocator& locator, const std::string& problem) const
+{
+    if (problem.empty() || !IsKnown(locator))
+    {
+        return {mBinary, problem, mVisit};
+    }
+    const std::optional<BinaryStamps::Entry> last = mCatalogue.Stamps().Find(locator);
+    return {last ? last->binary : BinaryStamp(), {}, mVisit};
 }
 
 void ScanJournal::Condemn(const PluginLocator& locator, const std::string& reason)
 {
-    mCatalogue.Block(locator, {reason, TimeOfNow(), mBinary, false, false});
+    mCatalogue.Block(locator, {reason, TimeOfNow(), mBinary, false, false, {}, false});
     // What an earlier scan made of it is worth nothing any more.
     mCatalogue.Stamps().Remove(locator);
     mCatalogue.SaveStamps(LocatorTable::Saving::Quick);

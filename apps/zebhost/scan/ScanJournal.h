@@ -4,6 +4,7 @@
 #include "catalogue/IScanObserver.h"
 
 #include <optional>
+#include <string>
 
 namespace zebhost
 {
@@ -29,11 +30,13 @@ public:
 
 private:
     void Record(const zebaudiofilterhost::PluginLocator& locator, const std::string& problem);
+    BinaryStamps::Entry ResultOf(const zebaudiofilterhost::PluginLocator& locator, const std::string& problem) const;
 
     Catalogue& mCatalogue;
     // Of the plug-in at hand:
     bool mWasKnown = false;
     BinaryStamp mBinary;
+    std::string mVisit;
     std::optional<BlockReason> mBlockedBefore;
 };
 

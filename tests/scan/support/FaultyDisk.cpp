@@ -1,7 +1,8 @@
 // A disk that fails: the program's own calls of the system in place of the C library's, so that all of its libraries
 // use them. ZEB_FAULT holds a call, what is to become of it, and a part of the names of the files that it is to
 // happen to, separated by colons: "write:full:Settings.xml", "write:short:...", "sync:broken:...",
-// "rename:refused:...".
+// "rename:refused:...". The name's end alone counts behind a '$'; a number and a '+' in front of the name let so many
+// calls go well before.
 #include <cerrno>
 #include <cstdio>
 #include <cstdlib>
@@ -30,11 +31,23 @@ Fault TheFault()
     return {fault.substr(0, first), fault.substr(first + 1, second - first - 1), fault.substr(second + 1)};
 }
 
+bool IsMeant(const std::string& file, const std::string& name)
+{
+    return name.rfind('$', 0) == 0 ? file.size() >= name.size() - 1 && file.ends_with(name.substr(1))
+                                   : file.find(name) != std::string::npos;
+}
+
 // Empty unless the call is to fail on this file.
 std::string FaultOf(const std::string& call, const std::string& file)
 {
     const Fault fault = TheFault();
-    return fault.call == call && file.find(fault.file) != std::string::npos ? fault.what : "";
+    if (fault.call != call || !IsMeant(file, fault.file.substr(fault.file.find('+') + 1)))
+    {
+        return "";
+    }
+    static int sCalls = 0;
+    const bool hasCount = fault.file.find('+') != std::string::npos;
+    return hasCount && sCalls++ < std::stoi(fault.file) ? "" : fault.what;
 }
 
 std::string PathOf(int descriptor)
