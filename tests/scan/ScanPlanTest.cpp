@@ -112,6 +112,29 @@ TEST_F(ScanPlanTest, WhatCouldNotBeLoadedIsTriedAgainOnRequestOrWhenItHasChanged
     EXPECT_THAT(Records(), ElementsAre("a"));
 }
 
+TEST_F(ScanPlanTest, AKnownPluginThatFailsKeepsItsRecordAndIsTriedAgain)
+{
+    const std::string modes[] = {"--quiet", "--in-process"};
+    for (const std::string& mode : modes)
+    {
+        AddBundle("a");
+        Succeed({"scan"});
+        const std::string listed = Succeed({"list", "--json"}).out;
+        fs::resize_file(Binary("a"), 100);
+        const nlohmann::json failed = Succeed({"scan", "--json", mode}).Json();
+        EXPECT_THAT(States(failed), ElementsAre(Pair("a", "failed"))) << mode;
+        EXPECT_THAT(Records(), ElementsAre("a")) << mode;
+        EXPECT_EQ(Succeed({"list", "--json"}).out, listed) << mode;
+        EXPECT_THAT(Planned(), ElementsAre(Pair("a", "changed"))) << mode;
+        fs::remove_all(Bundle("a"));
+        AddBundle("a");
+        EXPECT_THAT(States(Succeed({"scan", "--json", mode}).Json()), ElementsAre(Pair("a", "scanned"))) << mode;
+        EXPECT_THAT(Planned(), IsEmpty()) << mode;
+        fs::remove_all(Bundle("a"));
+        Succeed({"scan"});
+    }
+}
+
 TEST_F(ScanPlanTest, ABlockedPluginIsOfferedAgainWhenItsBinaryHasChanged)
 {
     AddBundle("a-segv");

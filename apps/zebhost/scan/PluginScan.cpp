@@ -11,8 +11,8 @@
 #include <host/PluginModuleInfoManager.h>
 #include <host/PluginModuleScanner.h>
 
-#include <algorithm>
 #include <exception>
+#include <vector>
 
 namespace zebhost
 {
@@ -65,25 +65,57 @@ std::string StepGuarded(const PluginLocator& locator, bool skipCategory, const B
     }
 }
 
+// What the catalogue knows of a plug-in.
+struct Knowledge
+{
+    PluginModuleInfoManager::PluginInfoPtr record;
+    std::vector<AudioFilterDescriptorManager::DescriptorPtr> descriptors;
+
+    explicit Knowledge(const PluginLocator& locator)
+        : record(PluginModuleInfoManager::GetInstance().FindPluginInfo(locator))
+    {
+        for (const auto& descriptor : AudioFilterDescriptorManager::GetInstance().GetExternalInfos())
+        {
+            if (descriptor->GetLocator() == locator)
+            {
+                descriptors.push_back(descriptor);
+            }
+        }
+    }
+
+    void PutBack() const
+    {
+        PluginModuleInfoManager::GetInstance().AddPluginModuleInfo(record);
+        for (const auto& descriptor : descriptors)
+        {
+            AudioFilterDescriptorManager::GetInstance().AddAudioFilterDescriptor(descriptor);
+        }
+    }
+};
+
 } // namespace
 
 IScanObserver::Outcome ScanPlugin(const PluginLocator& locator, bool skipCategory, const BeforeStep& beforeStep)
 {
     PluginModuleInfoManager& infos = PluginModuleInfoManager::GetInstance();
     // A new descriptor does not displace an old one of the same ID.
+    const Knowledge before(locator);
     infos.RemovePluginLocators({locator});
     const std::string thrown = StepGuarded(locator, skipCategory, beforeStep);
 
+    const Knowledge after(locator);
     IScanObserver::Outcome outcome;
-    outcome.loaded = infos.FindPluginInfo(locator) != nullptr;
-    const auto descriptors = AudioFilterDescriptorManager::GetInstance().GetExternalInfos();
-    outcome.effects = static_cast<std::size_t>(std::count_if(descriptors.begin(), descriptors.end(),
-                                                             [&locator](const auto& descriptor)
-                                                             { return descriptor->GetLocator() == locator; }));
+    outcome.loaded = after.record != nullptr;
+    outcome.effects = after.descriptors.size();
     if (!outcome.loaded)
     {
         outcome.problem = thrown.empty() ? LoadProblem(locator) : thrown;
         outcome.end = IScanObserver::End::Failed;
+        if (before.record != nullptr)
+        {
+            infos.RemovePluginLocators({locator});
+            before.PutBack();
+        }
     }
     return outcome;
 }

@@ -170,9 +170,13 @@ void ScanSupervisor::StartWorker()
 
 void ScanSupervisor::TakeResult(const PluginLocator& locator)
 {
-    PluginModuleInfoManager& infos = PluginModuleInfoManager::GetInstance();
-    infos.RemovePluginLocators({locator});
-    infos.AddConfiguration(mResult.found, true);
+    // What could not be loaded keeps the record of an earlier scan.
+    if (mResult.outcome.loaded)
+    {
+        PluginModuleInfoManager& infos = PluginModuleInfoManager::GetInstance();
+        infos.RemovePluginLocators({locator});
+        infos.AddConfiguration(mResult.found, true);
+    }
     mJournal.Conclude(locator, mResult.outcome.problem);
     mObserver.Finished(locator, mResult.outcome);
 }
