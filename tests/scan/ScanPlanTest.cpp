@@ -166,14 +166,16 @@ TEST_F(ScanPlanTest, BlockedPluginsAreRetriedOnRequest)
     Succeed({"scan"});
     EXPECT_THAT(Records(), ElementsAre("b"));
     EXPECT_EQ(Run({"scan", Bundle("a-segv").string()}).code, 6);
-    EXPECT_THAT(Planned({"--retry-blocked"}), ElementsAre(Pair("a-segv", "was blocked"), Pair("c", "was blocked")));
+    EXPECT_THAT(Planned({"--retry-blocked"}),
+                ElementsAre(Pair("a-segv", "was blocked"), Pair("c", "blocked by hand")));
+    EXPECT_EQ(Run({"scan", "--retry-blocked", Bundle("c").string()}).code, 6);
     EXPECT_THAT(States(Succeed({"scan", "--retry-blocked", "--json"}).Json()),
-                ElementsAre(Pair("a-segv", "crashed"), Pair("c", "scanned")));
-    EXPECT_THAT(Blocks(), ElementsAre(Pair("a-segv", HasSubstr("SIGSEGV"))));
+                ElementsAre(Pair("a-segv", "crashed"), Pair("c", "blocked")));
+    EXPECT_THAT(Blocks(), ElementsAre(Pair("a-segv", HasSubstr("SIGSEGV")), Pair("c", "blocked by hand")));
     mVariables["ZEB_TEST_CALM"] = "1";
     Succeed({"scan", "--retry-blocked", Bundle("a-segv").string()});
-    EXPECT_THAT(Records(), ElementsAre("a-segv", "b", "c"));
-    EXPECT_THAT(Blocks(), IsEmpty());
+    EXPECT_THAT(Records(), ElementsAre("a-segv", "b"));
+    EXPECT_THAT(Blocks(), ElementsAre(Pair("c", "blocked by hand")));
 }
 
 TEST_F(ScanPlanTest, AFullScanTakesWhatIsThereAndLeavesWhatIsBlocked)

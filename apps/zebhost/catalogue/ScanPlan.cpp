@@ -106,8 +106,12 @@ public:
         {
             return nullptr;
         }
-        const BinaryStamp blocked = mCatalogue.Reasons().Get(locator).binary;
-        if (!blocked.IsEmpty() && blocked != StampOf(locator))
+        const BlockReason why = mCatalogue.Reasons().Get(locator);
+        if (why.isByHand)
+        {
+            return nullptr;
+        }
+        if (!why.binary.IsEmpty() && why.binary != StampOf(locator))
         {
             return "was blocked, and has changed";
         }

@@ -34,7 +34,7 @@ struct ScanPlan
 struct ScanWishes
 {
     bool full = false;         // what is in the catalogue as well
-    bool retryBlocked = false; // what is blocked as well, and what could not be loaded
+    bool retryBlocked = false; // what is blocked, but not by hand, as well, and what could not be loaded
 };
 
 // Of the standard places. Records of plug-ins elsewhere stay for as long as the plug-in is there.

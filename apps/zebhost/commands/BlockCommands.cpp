@@ -83,6 +83,7 @@ ExitCode RunBlock(CommandContext& context)
     BlockReason why;
     why.reason = context.arguments.Text("reason", "blocked by hand");
     why.since = TimeOfNow();
+    why.isByHand = true;
     context.catalogue.Block(locator, why);
     Tell(context, locator, " is blocked; 'zebhost unblock' lets it be used again");
     return ExitCode::Done;
