@@ -82,7 +82,7 @@ protected:
 TEST_F(ScanInterruptTest, CtrlCKeepsWhatIsDoneAndBlocksNothing)
 {
     AddBundle("b-hang");
-    for (const int signal : {SIGINT, SIGTERM, SIGHUP})
+    for (const int signal : {SIGINT, SIGTERM, SIGHUP, SIGQUIT})
     {
         StartedProgram scan = Start({"scan", "--json"});
         const pid_t worker = WorkerThatLoads("b-hang");
@@ -98,6 +98,19 @@ TEST_F(ScanInterruptTest, CtrlCKeepsWhatIsDoneAndBlocksNothing)
         EXPECT_FALSE(IsAlive(worker));
         ForgetLoads();
     }
+}
+
+TEST_F(ScanInterruptTest, UnderNohupAHangUpChangesNothing)
+{
+    AddBundle("b-hang");
+    std::vector<std::string> words = {"/bin/sh", "-c", "trap '' HUP; exec \"$0\" \"$@\""};
+    const std::vector<std::string> command = CommandLine({"scan", "--timeout", Seconds(1)});
+    words.insert(words.end(), command.begin(), command.end());
+    StartedProgram scan(words, mVariables, mFolder);
+    WorkerThatLoads("b-hang");
+    scan.Signal(SIGHUP);
+    EXPECT_EQ(scan.Wait(), 0) << scan.Err();
+    EXPECT_THAT(Records(), ElementsAre("a", "c"));
 }
 
 TEST_F(ScanInterruptTest, AnInterruptedRetryLeavesThePluginBlockedAsItWas)

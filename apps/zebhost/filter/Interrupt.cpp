@@ -26,9 +26,17 @@ void Watch(Second second)
     action.sa_handler = OnSignal;
     action.sa_flags = second == Second::Ignored ? 0 : static_cast<int>(SA_RESETHAND);
     sigemptyset(&action.sa_mask);
-    for (const int signal : {SIGINT, SIGTERM, SIGHUP})
+    for (const int signal : {SIGINT, SIGTERM, SIGHUP, SIGQUIT})
     {
-        sigaction(signal, &action, nullptr);
+        struct sigaction inherited
+        {
+        };
+        sigaction(signal, nullptr, &inherited);
+        // Whoever started this program with nohup wants it to outlive the hang-up.
+        if (inherited.sa_handler != SIG_IGN)
+        {
+            sigaction(signal, &action, nullptr);
+        }
     }
 }
 
