@@ -39,6 +39,12 @@ void ScanSupervisor::Run(const std::vector<PluginLocator>& locators)
     }
     mWorker.reset();
     mCatalogue.SaveStamps(LocatorTable::Saving::Flushed);
+    if (!mUntouched.empty())
+    {
+        throw Failure(ExitCode::JobFailed, "the scan's worker processes ended before they turned to " +
+                                               mUntouched.front() +
+                                               ": scan it with --in-process, and tell what happens");
+    }
 }
 
 bool ScanSupervisor::ScanOne(const PluginLocator& locator, const Progress& progress)
@@ -57,9 +63,10 @@ bool ScanSupervisor::ScanOne(const PluginLocator& locator, const Progress& progr
         mJournal.Release(locator);
         return false;
     case Verdict::Untouched:
+        mWorker.reset();
         mJournal.Release(locator);
-        throw Failure(ExitCode::JobFailed, "the scan's worker processes end before they turn to a plug-in: scan with "
-                                           "--in-process, and tell what happens");
+        mUntouched.push_back(PathOf(locator));
+        return true;
     case Verdict::Lost:
     case Verdict::TimedOut:
         break;
@@ -119,7 +126,7 @@ ScanSupervisor::Verdict ScanSupervisor::Await(const PluginLocator& locator, cons
         }
         const bool hasEnded = event == ScanWorkerProcess::Event::Ended;
         mResult = hasEnded ? protocol::Message() : protocol::ParseMessage(line);
-        if (mResult.kind == Kind::Result && isTouched)
+        if (mResult.kind == Kind::Result)
         {
             return Verdict::Result;
         }

@@ -31,7 +31,8 @@ public:
     ScanSupervisor(const ScanSupervisor&) = delete;
     ScanSupervisor& operator=(const ScanSupervisor&) = delete;
 
-    // Throws a Failure when a file can't be written, or no worker be started; what is done by then is saved.
+    // Throws a Failure when a file can't be written, or no worker be started; what is done by then is saved. So it
+    // does at the end if no worker turned to one of the plug-ins.
     void Run(const std::vector<zebaudiofilterhost::PluginLocator>& locators);
     // How many workers were lost.
     std::size_t Restarts() const { return mRestarts; }
@@ -70,6 +71,7 @@ private:
     zebaudiofilterhost::TechnologyType mTechnology = zebaudiofilterhost::kTechnologyNone; // that the worker has seen
     protocol::Message mResult;
     std::size_t mRestarts = 0;
+    std::vector<std::string> mUntouched; // paths
 };
 
 } // namespace zebhost
