@@ -4,6 +4,7 @@
 #include "output/Strings.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace zebhost
 {
@@ -14,6 +15,13 @@ namespace
 constexpr std::size_t kKept = 4096;
 constexpr std::size_t kShown = std::size_t{256} * 1024;
 constexpr std::size_t kLongestLine = 160;
+
+// What a plug-in prints must not reach the terminal as commands.
+std::string Shown(std::string line)
+{
+    std::replace(line.begin(), line.end(), '\t', ' ');
+    return Printable(FromUTF8(line));
+}
 
 } // namespace
 
@@ -42,9 +50,9 @@ void WorkerOutput::Take(std::string_view piece)
 void WorkerOutput::Show(std::string_view piece)
 {
     mLines.Append(piece);
-    while (const auto line = mLines.Next())
+    while (auto line = mLines.Next())
     {
-        mConsole.Warn(*line);
+        mConsole.Warn(Shown(*std::move(line)));
     }
     if (mAmount + piece.size() == kShown)
     {
