@@ -86,10 +86,12 @@ TEST(ScanWorkerProtocolTest, WhatAPluginWritesThereIsNonsense)
 TEST(WorkerEndTest, TellsPluginsFromPeople)
 {
     using Kind = WorkerEnd::Kind;
-    for (const int signal : {SIGINT, SIGTERM, SIGHUP})
+    for (const int signal : {SIGINT, SIGTERM, SIGHUP, SIGQUIT})
     {
         EXPECT_TRUE((WorkerEnd{Kind::Signalled, signal}.IsByUser()));
         EXPECT_FALSE((WorkerEnd{Kind::Exited, signal}.IsByUser()));
+        EXPECT_THAT((WorkerEnd{Kind::Signalled, signal}.Describe()),
+                    testing::StartsWith("was ended from outside: SIG"));
     }
     for (const int signal : {SIGSEGV, SIGABRT, SIGKILL, SIGPIPE})
     {

@@ -115,6 +115,31 @@ TEST_F(ScanSurvivalTest, TellsHowEachWorkerEnded)
     EXPECT_THAT(result.err, HasSubstr("a-exit.vst3 ended the process"));
 }
 
+TEST_F(ScanSurvivalTest, APluginThatTakesTheConnectionsNumberKeepsItsFileToItself)
+{
+    AddBundle("a-reuses");
+    AddBundle("b");
+    EXPECT_THAT(States(Succeed({"scan", "--json"}).Json()),
+                ElementsAre(Pair("a-reuses", "crashed"), Pair("b", "scanned")));
+    EXPECT_THAT(Blocks(), ElementsAre(Pair("a-reuses", HasSubstr("disturbed the connection"))));
+    ASSERT_TRUE(std::filesystem::exists(Path("loads.reused")));
+    EXPECT_EQ(ReadText(Path("loads.reused")), "");
+}
+
+TEST_F(ScanSurvivalTest, AWorkersMemoryIsWrittenNowhere)
+{
+    AddBundle("a-dumpable");
+    EXPECT_THAT(States(Succeed({"scan", "--json"}).Json()), ElementsAre(Pair("a-dumpable", "scanned")));
+}
+
+TEST_F(ScanSurvivalTest, WhatIsPrintedIsNoCommandToTheTerminal)
+{
+    AddBundle("a-colours");
+    const RunResult result = Succeed({"scan", "--verbose"});
+    EXPECT_THAT(result.err, HasSubstr("red \uFFFD[31m and tabs"));
+    EXPECT_THAT(result.err, Not(HasSubstr("\x1B")));
+}
+
 TEST_F(ScanSurvivalTest, WhatIsPrintedNeitherBlocksNorDisturbs)
 {
     AddBundle("a-prints"); // some megabytes

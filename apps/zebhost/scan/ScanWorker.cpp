@@ -4,6 +4,7 @@
 #include "output/Tracing.h"
 #include "scan/LineBuffer.h"
 #include "scan/PluginScan.h"
+#include "scan/WorkerEnd.h"
 #include "scan/WorkerPlatform.h"
 
 #include <foundation/zebcore/PropList.h>
@@ -23,6 +24,7 @@
 
 #include <fcntl.h>
 #include <sys/resource.h>
+#include <sys/socket.h>
 #include <unistd.h>
 
 namespace zebhost
@@ -39,6 +41,10 @@ constexpr std::string_view kWord = "--scan-worker";
 // Words in front of the categories to trace.
 constexpr int kFixedWords = 5;
 
+// Behind the numbers that plug-ins close in a row, and below the smallest usual limit.
+constexpr int kHighDescriptor = 200;
+int sChannel = kWorkerChannel;
+
 pid_t ParsePid(std::string_view text)
 {
     pid_t pid = -1;
@@ -52,16 +58,25 @@ pid_t ParsePid(std::string_view text)
     _exit(status);
 }
 
+// A parent that has gone is no reason for a signal. Where there is no such flag there is one.
+#ifdef MSG_NOSIGNAL
+constexpr int kSendFlags = MSG_NOSIGNAL;
+#else
+constexpr int kSendFlags = 0;
+#endif
+
+// Not write and read: a plug-in that closes what it did not open may have a file of its own there, which is no
+// socket.
 void Send(std::string_view line)
 {
     while (!line.empty())
     {
-        const ssize_t written = write(kWorkerChannel, line.data(), line.size());
-        if (written < 0 && errno != EINTR)
+        const ssize_t sent = send(sChannel, line.data(), line.size(), kSendFlags);
+        if (sent < 0 && errno != EINTR)
         {
-            End(EXIT_FAILURE);
+            End(kChannelLost);
         }
-        line.remove_prefix(static_cast<std::size_t>(std::max<ssize_t>(written, 0)));
+        line.remove_prefix(static_cast<std::size_t>(std::max<ssize_t>(sent, 0)));
     }
 }
 
@@ -74,7 +89,7 @@ std::string ReceiveLine(LineBuffer& lines)
         {
             return *std::move(line);
         }
-        const ssize_t size = read(kWorkerChannel, piece.data(), piece.size());
+        const ssize_t size = recv(sChannel, piece.data(), piece.size(), 0);
         if (size == 0 || (size < 0 && errno != EINTR))
         {
             End(EXIT_SUCCESS);
@@ -83,10 +98,23 @@ std::string ReceiveLine(LineBuffer& lines)
     }
 }
 
+void MoveChannel()
+{
+    const int moved = fcntl(kWorkerChannel, F_DUPFD_CLOEXEC, kHighDescriptor);
+    if (moved < 0)
+    {
+        fcntl(kWorkerChannel, F_SETFD, FD_CLOEXEC);
+        return;
+    }
+    close(kWorkerChannel);
+    sChannel = moved;
+}
+
 // The scan is to see each plug-in's true end, and a plug-in's children are not to keep the channel open.
 void SetUpProcess()
 {
-    fcntl(kWorkerChannel, F_SETFD, FD_CLOEXEC);
+    MoveChannel();
+    platform::ForbidDumps();
     // Last words are worth most, and would stay in the buffer.
     std::setvbuf(stdout, nullptr, _IOLBF, BUFSIZ);
     for (const int signal : {SIGSEGV, SIGBUS, SIGFPE, SIGILL, SIGABRT, SIGTRAP})

@@ -21,7 +21,7 @@ struct WorkerSetup
     std::vector<std::string> traces;
 };
 
-// The descriptor on which both talk.
+// The descriptor on which both talk, to begin with: the worker moves it out of its plug-ins' way.
 inline constexpr int kWorkerChannel = 3;
 
 std::vector<std::string> WorkerCommandLine(const WorkerSetup& setup, pid_t parent);

@@ -16,7 +16,7 @@ struct SignalText
     const char* text;
 };
 
-constexpr std::array<SignalText, 14> kSignals = {{
+constexpr std::array<SignalText, 15> kSignals = {{
     {SIGSEGV, "SIGSEGV (segmentation fault)"},
     {SIGABRT, "SIGABRT (aborted)"},
     {SIGBUS, "SIGBUS (bus error)"},
@@ -31,6 +31,7 @@ constexpr std::array<SignalText, 14> kSignals = {{
     {SIGTERM, "SIGTERM (asked to end)"},
     {SIGINT, "SIGINT (interrupted)"},
     {SIGHUP, "SIGHUP (hung up)"},
+    {SIGQUIT, "SIGQUIT (asked to end)"},
 }};
 
 std::string SignalName(int signal)
@@ -44,7 +45,7 @@ std::string SignalName(int signal)
 
 bool WorkerEnd::IsByUser() const
 {
-    return kind == Kind::Signalled && (value == SIGINT || value == SIGTERM || value == SIGHUP);
+    return kind == Kind::Signalled && (value == SIGINT || value == SIGTERM || value == SIGHUP || value == SIGQUIT);
 }
 
 std::string WorkerEnd::Describe() const
@@ -52,9 +53,13 @@ std::string WorkerEnd::Describe() const
     switch (kind)
     {
     case Kind::Exited:
-        return "ended the process with exit status " + std::to_string(value);
+        if (value != kChannelLost)
+        {
+            return "ended the process with exit status " + std::to_string(value);
+        }
+        break;
     case Kind::Signalled:
-        return "crashed: " + SignalName(value);
+        return (IsByUser() ? "was ended from outside: " : "crashed: ") + SignalName(value);
     case Kind::Disconnected:
         break;
     }

@@ -5,6 +5,9 @@
 namespace zebhost
 {
 
+// The exit status of a worker that finds its connection to the scan gone.
+inline constexpr int kChannelLost = 113;
+
 // How a worker process ended.
 struct WorkerEnd
 {

@@ -14,4 +14,7 @@ std::string OwnProgram();
 // From now on the calling process ends at once when `parent` does. Returns false if that has gone already.
 bool DieWith(pid_t parent);
 
+// Crashes of the calling process are written nowhere, not even to a program that the system hands them to.
+void ForbidDumps();
+
 } // namespace zebhost::platform

@@ -12,6 +12,7 @@
 
 #include <dlfcn.h>
 #include <fcntl.h>
+#include <sys/prctl.h>
 #include <sys/resource.h>
 #include <sys/socket.h>
 #include <unistd.h>
@@ -73,14 +74,28 @@ void LeaveAndHang()
         Hang();
 }
 
-// Descriptors below this are taken to be all that are open.
-constexpr int kAllDescriptors = 1024;
+// The scanner's own descriptor.
+constexpr int kChannel = 200;
 
 // The process ends when it waits for more to do.
 void GoDeaf()
 {
-    for (int descriptor = 3; descriptor < kAllDescriptors; ++descriptor)
-        shutdown(descriptor, SHUT_RD);
+    shutdown(kChannel, SHUT_RD);
+}
+
+void CloseAll()
+{
+    for (int descriptor = 3; descriptor < 256; ++descriptor)
+        close(descriptor);
+}
+
+// Closes what it did not open, and has files of its own there from then on.
+void ReuseAll()
+{
+    CloseAll();
+    const std::string path = std::string(std::getenv("ZEB_TEST_LOG")) + ".reused";
+    for (int descriptor = 0; descriptor < kChannel;)
+        descriptor = open(path.c_str(), O_RDWR | O_APPEND | O_CREAT, 0600);
 }
 
 // The scan can't start another process, for want of descriptors.
@@ -137,20 +152,34 @@ const std::map<std::string, Deed>& Deeds()
          {
              SpawnAndHang();
          }},
-        // The scanner's own descriptor is among them.
         {"closes",
          []
          {
-             for (int descriptor = 3; descriptor < kAllDescriptors; ++descriptor)
-                 close(descriptor);
+             CloseAll();
              Hang();
+         }},
+        {"reuses",
+         []
+         {
+             ReuseAll();
          }},
         {"writes",
          []
          {
-             for (int descriptor = 3; descriptor < kAllDescriptors; ++descriptor)
-                 static_cast<void>(!write(descriptor, "nonsense\n", 9));
+             static_cast<void>(!write(kChannel, "nonsense\n", 9));
              Hang();
+         }},
+        // What a crash of it would write could be read.
+        {"dumpable",
+         []
+         {
+             if (prctl(PR_GET_DUMPABLE) != 0)
+                 std::abort();
+         }},
+        {"colours",
+         []
+         {
+             std::fputs("red \x1B[31m and\ttabs\n", stderr);
          }},
         // Ends its process only when that waits for more to do.
         {"deaf",

@@ -20,4 +20,10 @@ bool DieWith(pid_t parent)
     return getppid() == parent;
 }
 
+// The limit on the size of core files does not hold for a core pattern that is a pipe.
+void ForbidDumps()
+{
+    prctl(PR_SET_DUMPABLE, 0);
+}
+
 } // namespace zebhost::platform

@@ -47,4 +47,9 @@ bool DieWith(pid_t parent)
     return getppid() == parent;
 }
 
+// The limit on the size of core files is enough.
+void ForbidDumps()
+{
+}
+
 } // namespace zebhost::platform
