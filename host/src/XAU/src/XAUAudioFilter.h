@@ -123,7 +123,7 @@ private:
     struct BufferList
     {
         explicit BufferList(std::size_t count);
-        AudioBufferList& Get();
+        AudioBufferList& Get() const;
         /// As before each call of AudioUnitRender: the unit brings its own memory.
         void Reset();
 

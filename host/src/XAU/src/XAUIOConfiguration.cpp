@@ -44,7 +44,7 @@ bool ReadDescriptions(const std::vector<std::byte>& bytes, UInt32 count, Channel
         return false;
     for (UInt32 index = 0; index < count; ++index)
     {
-        ::AudioChannelDescription description;
+        ::AudioChannelDescription description = {};
         std::memcpy(&description, bytes.data() + kLayoutHeader + index * sizeof(description), sizeof(description));
         layout.emplace_back(TranslateLabel(description.mChannelLabel));
     }
@@ -182,7 +182,7 @@ void XAUAudioFilter::BuildIOConfiguration()
 UTF16String XAUAudioFilter::ReadElementName(AudioUnitElement element) const
 {
     CFStringRef name = nullptr;
-    UInt32 size = sizeof(name);
+    UInt32 size = sizeof(CFTypeRef);
     const OSStatus result =
         AudioUnitGetProperty(mInstance, kAudioUnitProperty_ElementName, kAudioUnitScope_Input, element, &name, &size);
     if (result != noErr || !name)

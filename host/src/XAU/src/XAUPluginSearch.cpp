@@ -70,7 +70,7 @@ std::vector<UTF16String> GetDefaultAUPluginDirectories()
 
 UTF16String GetPathDisplayString(const UTF16String& id)
 {
-    AudioComponent const component = FindComponentForDescription(DecodeComponentID(id));
+    AudioComponent component = FindComponentForDescription(DecodeComponentID(id));
     CFStringRef name = nullptr;
     if (!component || AudioComponentCopyName(component, &name) != noErr || !name)
         return id;

@@ -15,7 +15,7 @@ CFOwner PrintBinary(CFPropertyListRef list)
 {
     CFWriteStreamRef stream = CFWriteStreamCreateWithAllocatedBuffers(kCFAllocatorDefault, kCFAllocatorDefault);
     const CFOwner owner(stream);
-    if (!stream || !CFWriteStreamOpen(stream))
+    if (!stream || CFWriteStreamOpen(stream) == 0)
         return nullptr;
     const CFIndex written = CFPropertyListWrite(list, stream, kCFPropertyListBinaryFormat_v1_0, 0, nullptr);
     CFOwner bytes(written > 0 ? CFWriteStreamCopyProperty(stream, kCFStreamPropertyDataWritten) : nullptr);
@@ -29,7 +29,7 @@ CFOwner ParseBytes(const std::vector<unsigned char>& bytes)
     CFReadStreamRef stream = CFReadStreamCreateWithBytesNoCopy(kCFAllocatorDefault, bytes.data(),
                                                                static_cast<CFIndex>(bytes.size()), kCFAllocatorNull);
     const CFOwner owner(stream);
-    if (!stream || !CFReadStreamOpen(stream))
+    if (!stream || CFReadStreamOpen(stream) == 0)
         return nullptr;
     CFOwner list(
         CFPropertyListCreateWithStream(kCFAllocatorDefault, stream, 0, kCFPropertyListImmutable, nullptr, nullptr));

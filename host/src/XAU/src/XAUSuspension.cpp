@@ -21,7 +21,7 @@ XAUAudioFilter::BufferList::BufferList(std::size_t count)
     Reset();
 }
 
-AudioBufferList& XAUAudioFilter::BufferList::Get()
+AudioBufferList& XAUAudioFilter::BufferList::Get() const
 {
     return *reinterpret_cast<AudioBufferList*>(mMemory.get());
 }

@@ -56,7 +56,7 @@ AudioComponent AudioComponentRegister(const AudioComponentDescription* descripti
     if (!description || !factory)
         return nullptr;
     ComponentRegistry& registry = ComponentRegistry::GetInstance();
-    if (AudioComponent const known = registry.Find(*description))
+    if (AudioComponent known = registry.Find(*description))
         return known;
     UTF16String text(name ? static_cast<std::size_t>(CFStringGetLength(name)) : 0, u'\0');
     if (name)

@@ -24,7 +24,8 @@ ListenerTable* FindTable(const AudioUnitEvent& event)
 
 bool IsSender(const Row& row, AUEventListenerRef sender, const void* sendingObject)
 {
-    return sender && row.mListener == sender && (!sendingObject || row.mInterest.mObject == sendingObject);
+    return sender != nullptr && row.mListener == sender &&
+           (sendingObject == nullptr || row.mInterest.mObject == sendingObject);
 }
 
 bool Concerns(const Interest& interest, const AudioUnitEvent& event)

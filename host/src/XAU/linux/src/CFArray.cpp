@@ -40,7 +40,7 @@ bool CFOpaqueArray::Equals(const Object& other) const
     const auto& values = static_cast<const CFOpaqueArray&>(other).mValues;
     return std::equal(mValues.begin(), mValues.end(), values.begin(), values.end(),
                       [this](const void* a, const void* b)
-                      { return a == b || (mCallBacks.equal && mCallBacks.equal(a, b) != 0); });
+                      { return a == b || (mCallBacks.equal != nullptr && mCallBacks.equal(a, b) != 0); });
 }
 
 CFTypeID CFArrayGetTypeID()

@@ -41,7 +41,7 @@ CFHashCode CFOpaqueDictionary::HashKey(const void* key) const
 
 bool CFOpaqueDictionary::AreKeysEqual(const void* a, const void* b) const
 {
-    return a == b || (mKeyCallBacks.equal && mKeyCallBacks.equal(a, b) != 0);
+    return a == b || (mKeyCallBacks.equal != nullptr && mKeyCallBacks.equal(a, b) != 0);
 }
 
 std::size_t CFOpaqueDictionary::FindIndex(const void* key) const
@@ -97,9 +97,9 @@ bool CFOpaqueDictionary::Equals(const Object& other) const
                        [&](const Entry& entry)
                        {
                            const Entry* match = dictionary.Find(entry.key);
-                           return match &&
-                                  (match->value == entry.value ||
-                                   (mValueCallBacks.equal && mValueCallBacks.equal(match->value, entry.value) != 0));
+                           return match != nullptr && (match->value == entry.value ||
+                                                       (mValueCallBacks.equal != nullptr &&
+                                                        mValueCallBacks.equal(match->value, entry.value) != 0));
                        });
 }
 

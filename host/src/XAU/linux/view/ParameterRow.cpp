@@ -67,10 +67,10 @@ void ParameterRow::ReadSteps()
         return;
     mControl = Control::Steps;
     CFArrayRef names = nullptr;
-    UInt32 size = sizeof(names);
+    UInt32 size = sizeof(CFTypeRef);
     const bool hasNames =
         AudioUnitGetProperty(mUnit, kAudioUnitProperty_ParameterValueStrings, mScope, mID, &names, &size) == noErr &&
-        names;
+        names != nullptr;
     const CFOwner owner(hasNames ? names : nullptr);
     for (std::size_t step = 0; step < static_cast<std::size_t>(steps); ++step)
     {
