@@ -101,7 +101,7 @@ void ReuseAll()
 // The scan can't start another process, for want of descriptors.
 void StarveAndGoDeaf()
 {
-    constexpr rlimit kFew{14, 14};
+    constexpr rlimit kFew{16, 16}; // files can be saved with so many
     prlimit(getppid(), RLIMIT_NOFILE, &kFew, nullptr);
     GoDeaf();
 }
