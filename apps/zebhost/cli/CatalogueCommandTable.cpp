@@ -38,7 +38,7 @@ CommandSpec ScanSpec()
         {{"PATH", "a plug-in or a folder to search", Values::File, false, true}},
         {
             {"full", "", "scan plug-ins again that are in the catalogue already, or could not be loaded"},
-            {"retry-blocked", "", "scan blocked plug-ins again, and those that could not be loaded"},
+            {"retry-blocked", "", "scan plug-ins again that a scan blocked or could not load"},
             {"dry-run", "", "print what would be scanned, and why; load nothing and save nothing"},
             {"skip-category", "", "do not ask plug-ins for their category"},
             {"timeout", "SECONDS", "give up on a plug-in after SECONDS, and block it; 0 waits for ever (default 30)",
