@@ -1,5 +1,6 @@
 // Life of a VST 2 filter: exact orders, names, parameters, and plug-ins that lie or throw.
 
+#include "host/AudioFilterDescriptor.h"
 #include "tests/vst/support/FakeFilter.h"
 
 #include <gmock/gmock.h>
