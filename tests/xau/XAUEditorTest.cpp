@@ -1,6 +1,7 @@
 // The view of a unit in a real window: wants an X server.
 
 #include "foundation/zebcore/MainThreadLoop.h"
+#include "host/src/XAU/linux/view/ViewPainter.h"
 #include "tests/xau/support/CFTestObjects.h"
 #include "tests/xau/support/FakeUnit.h"
 #include "utility/ThreadUtils.h"
@@ -66,6 +67,26 @@ protected:
             info.maxValue = id == 1 ? 2.0F : 1.0F;
             mUnit.Answer(key, info);
         }
+    }
+
+    // Steps 0 to `last` of parameter 1, with names if there are any.
+    void DescribeSteps(Float32 last, const std::vector<const char*>& names)
+    {
+        const FakeUnit::Key key(kAudioUnitProperty_ParameterInfo, kAudioUnitScope_Global, 1);
+        auto info = mUnit.Read<AudioUnitParameterInfo>(key);
+        info.maxValue = last;
+        mUnit.Answer(key, info);
+        const FakeUnit::Key strings(kAudioUnitProperty_ParameterValueStrings, kAudioUnitScope_Global, 1);
+        mUnit.Forget(strings);
+        if (names.empty())
+            return;
+        CFMutableArrayRef array = CFArrayCreateMutable(nullptr, 0, &kCFTypeArrayCallBacks);
+        for (const char* name : names)
+        {
+            const CFOwner text(MakeString(name));
+            CFArrayAppendValue(array, text.get());
+        }
+        mUnit.Answer<CFArrayRef>(strings, array); // the reference is that of the one row that reads it
     }
 
     void Open()
@@ -157,6 +178,44 @@ TEST_F(XAUEditorTest, AClickOnAControlChangesTheParameterWithinAGesture)
         EXPECT_TRUE(WaitFor([&] { return Value(2) == value; })) << "the switch: " << Value(2);
     }
     EXPECT_EQ(Value(0), 1.0F);
+}
+
+TEST_F(XAUEditorTest, StepsHaveFieldsWhileTheirTextsFit)
+{
+    struct Case
+    {
+        Float32 last;
+        std::vector<const char*> names;
+        int width;
+        bool hasFields;
+        const char* third; // the text of value 2
+    };
+    const std::vector<const char*> wide = {"Low shelving", "Peak", "High shelving"};
+    for (const Case& steps : {Case{2, {}, 480, true, "2"}, Case{7, {}, 480, true, "2"}, Case{8, {}, 2000, false, "2"},
+                              Case{15, {}, 2000, false, "2"}, Case{100, {}, 2000, false, "2"},
+                              Case{2, {"A", "B", "C"}, 320, true, "C"}, Case{2, wide, 480, false, "High shelving"},
+                              Case{2, wide, 1200, true, "High shelving"}, Case{3, {"A"}, 480, true, "2"}})
+    {
+        DescribeSteps(steps.last, steps.names);
+        ParameterRow row(mUnit.GetInstance(), kAudioUnitScope_Global, 1);
+        EXPECT_EQ(HasStepFields(ViewGeometry::Fit(3, steps.width), row), steps.hasFields)
+            << steps.last << " at " << steps.width << ", " << steps.names.size() << " names";
+        row.SetPosition((2.0 + 0.4) / static_cast<double>(steps.last));
+        EXPECT_EQ(Value(1), 2.0F) << "the nearest step of " << steps.last;
+        EXPECT_EQ(row.GetText(), steps.third);
+    }
+}
+
+TEST_F(XAUEditorTest, ASliderOfStepsGoesToTheNearest)
+{
+    DescribeSteps(15, {});
+    Open();
+    const ViewGeometry geometry = ViewGeometry::Fit(3, mEditor->GetEditorRect().right);
+    // Of 16 fields it would be the third.
+    const int place = static_cast<int>(geometry.GetControlLeft() + geometry.GetControlWidth() * 2.8 / 15.0);
+    Send(XCB_BUTTON_PRESS, place, RowMiddle(1));
+    Send(XCB_BUTTON_RELEASE, place, RowMiddle(1));
+    EXPECT_TRUE(WaitFor([&] { return Value(1) == 3.0F; })) << Value(1);
 }
 
 TEST_F(XAUEditorTest, AChangeFromElsewhereIsDrawn)

@@ -188,7 +188,7 @@ void GenericView::OnMotion(int x)
     if (row.GetControl() == ParameterRow::Control::Switch)
         return;
     double position = mGeometry.GetPosition(x);
-    if (row.GetControl() == ParameterRow::Control::Steps)
+    if (HasStepFields(mGeometry, row))
     {
         // The field that the pointer is in, and not the nearest end of one.
         const auto count = static_cast<double>(row.GetStepNames().size());

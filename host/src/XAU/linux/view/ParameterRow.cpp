@@ -17,8 +17,8 @@ namespace zebaudiofilterhost::xau
 namespace
 {
 
-constexpr UInt32 kMaxRows = 512;      // a longer window could not be shown anyway
-constexpr std::size_t kMaxSteps = 64; // more of them are a slider
+constexpr UInt32 kMaxRows = 512;   // a longer window could not be shown anyway
+constexpr double kMaxNames = 64.0; // of steps: the unit is asked for each
 
 std::string ToNarrow(const UTF16String& text)
 {
@@ -63,9 +63,11 @@ void ParameterRow::ReadInfo(AudioUnitParameterInfo& info) const
 void ParameterRow::ReadSteps()
 {
     const double steps = std::floor(mMaximum - mMinimum) + 1.0;
-    if (!(steps >= 2.0 && steps <= static_cast<double>(kMaxSteps)))
+    if (!(steps >= 2.0))
         return;
     mControl = Control::Steps;
+    if (steps > kMaxNames)
+        return;
     CFArrayRef names = nullptr;
     UInt32 size = sizeof(CFTypeRef);
     const bool hasNames =
@@ -91,8 +93,17 @@ std::string ParameterRow::ReadText(AudioUnitParameterValue value) const
     UInt32 size = sizeof(request);
     if (AudioUnitGetProperty(mUnit, kAudioUnitProperty_ParameterStringFromValue, mScope, 0, &request, &size) == noErr)
         return ToNarrow(MACtoZEB(request.outString)); // not released, as everywhere: units differ in whose it is
+    return MakeText(static_cast<double>(value));
+}
+
+// For a value of which the unit has no text.
+std::string ParameterRow::MakeText(double value) const
+{
+    const double step = std::round(value - mMinimum);
+    if (step >= 0.0 && step < static_cast<double>(mStepNames.size()))
+        return mStepNames[static_cast<std::size_t>(step)];
     std::array<char, 48> text = {};
-    std::snprintf(text.data(), text.size(), "%.2f", static_cast<double>(value));
+    std::snprintf(text.data(), text.size(), mControl == Control::Steps ? "%.0f" : "%.2f", value);
     return text.data();
 }
 

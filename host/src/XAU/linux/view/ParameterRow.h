@@ -17,7 +17,7 @@ public:
     enum class Control
     {
         Slider,
-        Steps, // one of a few values, named by the unit
+        Steps, // one of whole numbers, named by the unit
         Switch
     };
 
@@ -26,14 +26,14 @@ public:
     const std::string& GetName() const { return mName; }
     Control GetControl() const { return mControl; }
     bool IsWritable() const { return mIsWritable; }
-    /// Names of the steps; their number where the unit has no names.
+    /// Names of the steps; their values where the unit has no names. Empty if there are too many to be named.
     const std::vector<std::string>& GetStepNames() const { return mStepNames; }
 
     /// The unit's present value, from 0 to 1 of the range.
     double GetPosition() const { return mPosition; }
     /// The step of the present value, from 0.
     std::size_t GetStep() const;
-    /// The unit's text for the present value, with the unit of measure.
+    /// The unit's text for the present value, or the name of its step, with the unit of measure.
     const std::string& GetText() const { return mText; }
 
     /// Reads value and text. Returns whether something has changed.
@@ -51,6 +51,7 @@ private:
     void ReadInfo(AudioUnitParameterInfo& info) const;
     void ReadSteps();
     std::string ReadText(AudioUnitParameterValue value) const;
+    std::string MakeText(double value) const;
     void SetValue(double value);
 
     AudioUnit mUnit;

@@ -15,6 +15,9 @@ constexpr double kGap = 8.0;
 constexpr double kFontSize = 12.0;
 constexpr double kTrackHeight = 6.0;
 constexpr double kKnobRadius = 7.0;
+constexpr std::size_t kMaxFields = 8; // of steps
+constexpr double kFieldMargin = 4.0;  // left of a field's text
+constexpr double kFieldSpacing = 1.0; // right of a field
 constexpr double kPi = 3.14159265358979323846;
 
 struct Colour
@@ -49,6 +52,30 @@ void FillCircle(cairo_t* context, const Colour& colour, double x, double y, doub
     SetColour(context, colour);
     cairo_arc(context, x, y, radius, 0.0, 2.0 * kPi);
     cairo_fill(context);
+}
+
+void SetFont(cairo_t* context)
+{
+    cairo_select_font_face(context, "sans-serif", CAIRO_FONT_SLANT_NORMAL, CAIRO_FONT_WEIGHT_NORMAL);
+    cairo_set_font_size(context, kFontSize);
+}
+
+// Pixels. Not on the view's surface: a click asks as well, and must get the answer that was drawn.
+double MeasureWidest(const std::vector<std::string>& texts)
+{
+    cairo_surface_t* surface = cairo_image_surface_create(CAIRO_FORMAT_A8, 1, 1);
+    cairo_t* context = cairo_create(surface);
+    SetFont(context);
+    double widest = 0.0;
+    for (const std::string& text : texts)
+    {
+        cairo_text_extents_t extents = {};
+        cairo_text_extents(context, text.c_str(), &extents);
+        widest = std::max(widest, extents.x_advance);
+    }
+    cairo_destroy(context);
+    cairo_surface_destroy(surface);
+    return widest;
 }
 
 // Cut at the right end of its field.
@@ -86,8 +113,10 @@ void DrawSteps(cairo_t* context, const ViewGeometry& geometry, const ParameterRo
         const bool isOn = step == row.GetStep();
         const double left = geometry.GetControlLeft() + width * static_cast<double>(step);
         const Colour& on = row.IsWritable() ? kFill : kIdle;
-        FillRectangle(context, isOn ? on : kTrack, left, top + 3.0, width - 1.0, ViewGeometry::kRowHeight - 6.0);
-        DrawText(context, isOn ? kPaper : kInk, names[step], left + 4.0, top, width - 5.0);
+        FillRectangle(context, isOn ? on : kTrack, left, top + 3.0, width - kFieldSpacing,
+                      ViewGeometry::kRowHeight - 6.0);
+        DrawText(context, isOn ? kPaper : kInk, names[step], left + kFieldMargin, top,
+                 width - kFieldMargin - kFieldSpacing);
     }
 }
 
@@ -111,7 +140,10 @@ void DrawControl(cairo_t* context, const ViewGeometry& geometry, const Parameter
         DrawSlider(context, geometry, row, middle);
         return;
     case ParameterRow::Control::Steps:
-        DrawSteps(context, geometry, row, top);
+        if (HasStepFields(geometry, row))
+            DrawSteps(context, geometry, row, top);
+        else
+            DrawSlider(context, geometry, row, middle);
         return;
     case ParameterRow::Control::Switch:
         DrawSwitch(context, geometry, row, middle);
@@ -180,11 +212,19 @@ double ViewGeometry::GetPosition(int x) const
     return std::clamp((x - GetControlLeft()) / GetControlWidth(), 0.0, 1.0);
 }
 
+bool HasStepFields(const ViewGeometry& geometry, const ParameterRow& row)
+{
+    const std::vector<std::string>& names = row.GetStepNames();
+    if (row.GetControl() != ParameterRow::Control::Steps || names.empty() || names.size() > kMaxFields)
+        return false;
+    const double width = geometry.GetControlWidth() / static_cast<double>(names.size());
+    return MeasureWidest(names) <= width - kFieldMargin - kFieldSpacing;
+}
+
 void PaintView(cairo_t* context, const ViewGeometry& geometry, const std::vector<ParameterRow>& rows)
 {
     FillRectangle(context, kBackground, 0.0, 0.0, geometry.width, geometry.height);
-    cairo_select_font_face(context, "sans-serif", CAIRO_FONT_SLANT_NORMAL, CAIRO_FONT_WEIGHT_NORMAL);
-    cairo_set_font_size(context, kFontSize);
+    SetFont(context);
     const double nameWidth = geometry.GetControlLeft() - ViewGeometry::kMargin - kGap - kKnobRadius;
     const double textWidth = geometry.width - ViewGeometry::kMargin - geometry.GetTextLeft();
     for (std::size_t index = 0; index < rows.size(); ++index)

@@ -36,6 +36,9 @@ struct ViewGeometry
     double GetPosition(int x) const;
 };
 
+/// Whether a row has a field for each of its steps: few, and each text fits. Otherwise they are a slider. [main]
+bool HasStepFields(const ViewGeometry& geometry, const ParameterRow& row);
+
 /// Draws all rows. [main]
 void PaintView(cairo_t* context, const ViewGeometry& geometry, const std::vector<ParameterRow>& rows);
 
