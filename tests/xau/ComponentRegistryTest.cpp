@@ -1,7 +1,9 @@
+#include "host/src/XAU/linux/src/ComponentBundle.h"
 #include "tests/persistence/TempFolder.h"
 #include "tests/support/VariableGuard.h"
 #include "tests/xau/support/CFTestObjects.h"
 #include "tests/xau/support/FakeUnit.h"
+#include "tests/xau/support/TraceText.h"
 
 #include <gmock/gmock.h>
 
@@ -103,6 +105,27 @@ TEST_F(ComponentRegistryTest, ListsWhatBundlesSayInFullAndOpensNone)
     WriteBundle("Late.component", Entry("late", "Maker: Late", WithFactory("F")));
     EXPECT_EQ(Names().size(), names.size() + 1);
     EXPECT_EQ(Names().back(), "Maker: Late");
+}
+
+TEST_F(ComponentRegistryTest, TracesTheFirstFaultOfAnEntryThatItLeavesOut)
+{
+    WriteBundle("Faults.component",
+                Entry("ab", "Maker: Short code", WithFactory("F")) +
+                    Entry("full", "Maker: Complete", WithFactory("F")) + "<string>x</string><dict/>" +
+                    Entry("nofa", "Maker: No function") +
+                    "<dict><key>type</key><string>aufx</string><key>subtype</key><string>code</string>"
+                    "<key>manufacturer</key><integer>5</integer></dict>");
+    const TraceText trace("ComponentBundle");
+    const std::filesystem::path bundle = mFolder.Path("Faults.component");
+    EXPECT_EQ(ReadComponentBundle(bundle.u16string()).size(), 1U);
+    std::vector<testing::Matcher<std::string>> faults;
+    for (const char* fault : {"0: subtype", "2: no dictionary", "3: type", "4: factoryFunction", "5: manufacturer"})
+    {
+        const std::string text = fault;
+        faults.emplace_back(testing::AllOf(testing::HasSubstr(bundle.string() + ": entry " + text.substr(0, 1) + " "),
+                                           testing::EndsWith(text.substr(3) + "\n")));
+    }
+    EXPECT_THAT(trace.mLines, testing::ElementsAreArray(faults));
 }
 
 TEST_F(ComponentRegistryTest, ARegisteredDescriptionStays)

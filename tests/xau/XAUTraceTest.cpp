@@ -1,6 +1,6 @@
-#include "foundation/zebcore/Trace.h"
 #include "tests/xau/support/FakeUnit.h"
 #include "tests/xau/support/TestClock.h"
+#include "tests/xau/support/TraceText.h"
 
 #include <gmock/gmock.h>
 
@@ -13,29 +13,6 @@ namespace
 {
 
 using testing::HasSubstr;
-
-// What is traced while it lives.
-class TraceText
-{
-public:
-    explicit TraceText(const char* category) : mCategory(category)
-    {
-        zebcore::debug::SetTraceSink([this](std::string_view line) { mLines.emplace_back(line); });
-        zebcore::debug::SetTraceCategoryEnabled(category, true);
-    }
-    ~TraceText()
-    {
-        zebcore::debug::SetTraceCategoryEnabled(mCategory, false);
-        zebcore::debug::SetTraceSink({});
-    }
-    TraceText(const TraceText&) = delete;
-    TraceText& operator=(const TraceText&) = delete;
-
-    std::vector<std::string> mLines;
-
-private:
-    const char* mCategory;
-};
 
 TEST(XAUTrace, NamesTheCallsThatFail)
 {

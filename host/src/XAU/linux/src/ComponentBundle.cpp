@@ -3,13 +3,16 @@
 #include "foundation/zebcore/File.h"
 #include "foundation/zebcore/FileExceptions.h"
 #include "foundation/zebcore/FileUtils.h"
+#include "foundation/zebcore/Trace.h"
 #include "host/src/XAU/linux/src/CFStringObject.h"
 #include "host/src/linux/SearchPath.h"
 
 #include <algorithm>
+#include <initializer_list>
 #include <memory>
 #include <optional>
 #include <set>
+#include <utility>
 
 namespace zebaudiofilterhost::xau
 {
@@ -66,15 +69,38 @@ std::optional<OSType> FindCode(const CFOpaqueDictionary& dictionary, const char*
     return code;
 }
 
-std::optional<ComponentListing> ReadListing(const CFOpaqueDictionary& entry, const UTF16String& bundle)
+// Nothing else tells why a unit of a bundle is missing.
+void TraceLeftOut(const UTF16String& bundle, CFIndex index, const char* reason)
+{
+    ZEB_TRACE("ComponentBundle", bundle << ": entry " << index << " of \"AudioComponents\" is left out: " << reason);
+}
+
+// The key of the first value that is missing or of another form.
+const char* FindFault(std::initializer_list<std::pair<const char*, bool>> values)
+{
+    const auto* const fault =
+        std::find_if(values.begin(), values.end(), [](const auto& value) { return !value.second; });
+    return fault == values.end() ? "" : fault->first;
+}
+
+std::optional<ComponentListing> ReadListing(const CFOpaqueDictionary& entry, const UTF16String& bundle, CFIndex index)
 {
     const auto type = FindCode(entry, "type");
     const auto subType = FindCode(entry, "subtype");
     const auto manufacturer = FindCode(entry, "manufacturer");
     const auto* name = Find<CFOpaqueString>(entry, "name", CFStringGetTypeID());
     const auto* factory = Find<CFOpaqueString>(entry, "factoryFunction", CFStringGetTypeID());
-    if (!type || !subType || !manufacturer || !name || !factory || factory->mText.empty())
+    const bool hasFactory = factory && !factory->mText.empty();
+    if (!type || !subType || !manufacturer || !name || !hasFactory)
+    {
+        TraceLeftOut(bundle, index,
+                     FindFault({{"type", type.has_value()},
+                                {"subtype", subType.has_value()},
+                                {"manufacturer", manufacturer.has_value()},
+                                {"name", name != nullptr},
+                                {"factoryFunction", hasFactory}}));
         return std::nullopt;
+    }
     UInt32 version = 0;
     if (const auto* number = Find<CFOpaqueNumber>(entry, "version", CFNumberGetTypeID()))
         CFNumberGetValue(number, kCFNumberSInt32Type, &version);
@@ -111,8 +137,8 @@ std::vector<ComponentListing> ReadComponentBundle(const UTF16String& path)
     {
         const void* entry = CFArrayGetValueAtIndex(components, index);
         if (CFGetTypeID(entry) != CFDictionaryGetTypeID())
-            continue;
-        if (auto listing = ReadListing(*static_cast<CFDictionaryRef>(entry), path))
+            TraceLeftOut(path, index, "no dictionary");
+        else if (auto listing = ReadListing(*static_cast<CFDictionaryRef>(entry), path, index))
             listings.push_back(std::move(*listing));
     }
     return listings;

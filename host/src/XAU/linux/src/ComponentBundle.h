@@ -19,8 +19,9 @@ struct ComponentListing
     std::string factory; // exported function
 };
 
-/// The components of one bundle, in the order of its Info.plist. One whose entry is not complete is left out; a
-/// bundle without a readable Info.plist has none. Nothing is loaded. [main]
+/// The components of one bundle, in the order of its Info.plist. One whose entry is not complete is left out
+/// and traced ("ComponentBundle"), with the key at fault; a bundle without a readable Info.plist has none. Nothing is
+/// loaded. [main]
 std::vector<ComponentListing> ReadComponentBundle(const UTF16String& path);
 
 /// Paths of the bundles in the folders of components and below them, in a fixed order. [main]
