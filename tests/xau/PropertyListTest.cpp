@@ -139,6 +139,86 @@ TEST(PropertyList, NestingHasABottom)
     EXPECT_EQ(Print(list.get(), kCFPropertyListBinaryFormat_v1_0), "");
 }
 
+// A list in binary form, made by hand of objects whose references have two bytes. The first object is the root.
+std::string MakeBinary(const std::vector<std::string>& objects)
+{
+    const auto number = [](std::size_t value, int size)
+    {
+        std::string bytes;
+        for (int shift = 8 * (size - 1); shift >= 0; shift -= 8)
+            bytes += static_cast<char>(value >> shift & 0xFF);
+        return bytes;
+    };
+    std::string bytes = "bplist00";
+    std::string table;
+    for (const std::string& object : objects)
+    {
+        table += number(bytes.size(), 4);
+        bytes += object;
+    }
+    const std::size_t tableAt = bytes.size();
+    return bytes + table + std::string(6, '\0') + "\x04\x02" + number(objects.size(), 8) + number(0, 8) +
+           number(tableAt, 8);
+}
+
+// An array that has the object so many times, up to 255.
+std::string MakeReferences(std::size_t object, std::size_t count)
+{
+    std::string bytes = {'\xAF', '\x10', static_cast<char>(count)};
+    for (std::size_t index = 0; index < count; ++index)
+        bytes += {static_cast<char>(object >> 8), static_cast<char>(object & 0xFF)};
+    return bytes;
+}
+
+// Each array has the next one so many times; the last has a text.
+std::string MakeLevels(std::size_t levels, std::size_t count)
+{
+    std::vector<std::string> objects;
+    while (objects.size() < levels)
+        objects.push_back(MakeReferences(objects.size() + 1, count));
+    objects.emplace_back("\x52hi");
+    return MakeBinary(objects);
+}
+
+std::string Repeat(const std::string& text, int count)
+{
+    std::string all;
+    for (int index = 0; index < count; ++index)
+        all += text;
+    return all;
+}
+
+TEST(PropertyList, DepthIsBoundedBeforeTheParserRecurses)
+{
+    constexpr int kTooMany = 200000;
+    EXPECT_TRUE(Parse("<plist>" + Repeat("<array>", 250) + Repeat("</array>", 250) + "</plist>"));
+    EXPECT_TRUE(Parse("<plist><array>" + Repeat("<array/><dict></dict>", 2000) + "</array></plist>"));
+    for (const char* hidden : {"", "<!--</array>-->", "<!-- > </array>-->", "<?x </array>?>", "<array a='/'>",
+                               "<array a='</array>'>", "<!DOCTYPE a [ </array> ]>"})
+        EXPECT_FALSE(Parse("<plist>" + Repeat("<array>" + std::string(hidden), kTooMany) +
+                           Repeat("</array>", kTooMany) + "</plist>"))
+            << hidden;
+    EXPECT_FALSE(Parse("<plist>" + Repeat("<dict><key>k</key>", kTooMany)));
+    EXPECT_TRUE(Parse(MakeLevels(250, 1)));
+    EXPECT_FALSE(Parse(MakeLevels(300, 1)));
+    EXPECT_FALSE(Parse(MakeLevels(60000, 1)));
+}
+
+TEST(PropertyList, SharedObjectsCountAtEachOfTheirPlaces)
+{
+    const CFOwner shared = Parse(MakeLevels(2, 200));
+    ASSERT_TRUE(shared);
+    EXPECT_EQ(CFArrayGetCount(static_cast<CFArrayRef>(shared.get())), 200);
+    EXPECT_FALSE(Parse(MakeLevels(3, 120)));
+    EXPECT_FALSE(Parse(MakeLevels(8, 120)));
+    EXPECT_FALSE(Parse(MakeBinary({MakeReferences(0, 1)}))) << "an array in itself";
+    EXPECT_FALSE(Parse(MakeBinary({MakeReferences(1, 1), MakeReferences(0, 1)})));
+
+    const std::string text = "\x5F\x12" + std::string("\0\x10\0\0", 4) + std::string(1U << 20U, 'x');
+    EXPECT_TRUE(Parse(MakeBinary({MakeReferences(1, 3), text})));
+    EXPECT_FALSE(Parse(MakeBinary({MakeReferences(1, 200), text}))) << "200 times a MiB";
+}
+
 TEST(PropertyList, WhatIsNoPartOfAListIsRefused)
 {
     const std::string path = "/tmp";

@@ -23,7 +23,7 @@ void ClearError(CFErrorRef* error)
 
 CFPropertyListRef Parse(std::span<const UInt8> bytes, CFPropertyListFormat* format)
 {
-    if (bytes.empty() || bytes.size() > std::numeric_limits<std::uint32_t>::max() || cf::HasZeroInText(bytes))
+    if (!cf::IsSafeToParse(bytes))
         return nullptr;
     const auto* text = reinterpret_cast<const char*>(bytes.data());
     const auto count = static_cast<std::uint32_t>(bytes.size());
