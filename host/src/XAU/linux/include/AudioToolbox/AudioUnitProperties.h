@@ -3,6 +3,40 @@
 #include "AudioToolbox/AUComponent.h"
 
 // Properties of units: published numbers and records.
+//
+// Those that this host uses. Those with a star it needs: without them a unit has no buses, or is asked for more
+// frames than it has room for. Any other may be missing, with kAudioUnitErr_InvalidProperty. Element is 0 unless it
+// says more. [main]
+//
+//     Property                   Scope          Element
+//     ElementCount *             input, output            read
+//     StreamFormat *             input, output  bus       read; set only while uninitialised
+//     MaximumFramesPerSlice *    global                   set only while uninitialised
+//     SetRenderCallback *        input          bus       set after Initialize, before each run; if it has inputs
+//     HostCallbacks              global                   set once, before the first Initialize
+//     SupportedNumChannels       global                   read before formats are set
+//     AudioChannelLayout         input, output  bus       read after formats are set, the size first
+//     ElementName                input          bus       read after formats are set
+//     Latency                    global                   read
+//     ParameterList              global                   read when the unit is made, and by a view
+//     ParameterInfo              global         ID        the same
+//     ParameterValueStrings      global         ID        read by a view, of indexed parameters
+//     ParameterStringFromValue   global                   read
+//     FactoryPresets             global                   read once, when the unit is made
+//     PresentPreset              global                   set, also beside a render
+//     ClassInfo                  global                   read and set, also beside a render
+//
+// It has no use for the others: MakeConnection, SampleRate, TailTime, BypassEffect, LastRenderError, CocoaUI,
+// SupportedChannelLayoutTags, OfflineRender, ParameterValueFromString.
+//
+// Initialised units are uninitialised for what wants that, and initialised again. The host reads the formats that a
+// unit has and sets them with another mSampleRate; where it chooses the channels, of bus 0 on either side, it asks
+// for 32-bit floats of native order, packed and not interleaved: mFormatFlags 0x29, mFramesPerPacket 1,
+// mBytesPerPacket and mBytesPerFrame 4 (one channel's), mBitsPerChannel 32. Start with that format too: no other is
+// rendered right.
+//
+// Parameters lie in the global scope. The other scopes are asked for the size of their list as well, and a unit that
+// gives one there has its global parameters listed twice.
 
 enum : AudioUnitScope
 {
@@ -43,6 +77,9 @@ enum : AudioUnitPropertyID
     kAudioUnitProperty_ParameterValueFromString = 38    // AudioUnitParameterValueFromString
 };
 
+/// Counts of channels that a unit works with. {-1, -1} are any two that are equal, {-1, -2} in this order any two.
+/// The host asks for the nearest pair. Without the property it asks for what it wants; the unit may always refuse the
+/// format, and keeps the one that it has.
 struct AUChannelInfo
 {
     SInt16 inChannels; // -1: any; below: up to so many
@@ -51,14 +88,16 @@ struct AUChannelInfo
 
 struct AURenderCallbackStruct
 {
-    AURenderCallback inputProc;
+    AURenderCallback inputProc; // null: nothing is connected, the input is silent
     void* inputProcRefCon;
 };
 
+/// The array of factory presets points to such records: it is made with null callbacks, and the unit keeps records
+/// and names until Close. The host sets PresentPreset to a copy of one.
 struct AUPreset
 {
-    SInt32 presetNumber; // below 0: a user's
-    CFStringRef presetName;
+    SInt32 presetNumber;    // below 0: a user's
+    CFStringRef presetName; // may be null
 };
 
 using AudioUnitParameterUnit = UInt32;
@@ -96,20 +135,23 @@ enum : AudioUnitParameterUnit
 
 enum AudioUnitParameterOptions : UInt32
 {
-    kAudioUnitParameterFlag_CFNameRelease = 1U << 4, // whoever reads the info releases its strings
-    kAudioUnitParameterFlag_NonRealTime = 1U << 24,
+    // Whoever reads the info releases its strings; without the flag the unit keeps them alive until Close.
+    kAudioUnitParameterFlag_CFNameRelease = 1U << 4,
+    kAudioUnitParameterFlag_NonRealTime = 1U << 24, // not to be automated, and hidden from the application's lists
     kAudioUnitParameterFlag_CanRamp = 1U << 25,
-    kAudioUnitParameterFlag_ExpertMode = 1U << 26,
-    kAudioUnitParameterFlag_HasCFNameString = 1U << 27,
-    kAudioUnitParameterFlag_IsHighResolution = 1U << 29,
-    kAudioUnitParameterFlag_IsReadable = 1U << 30,
-    kAudioUnitParameterFlag_IsWritable = 1U << 31
+    kAudioUnitParameterFlag_ExpertMode = 1U << 26,       // no difference to this host
+    kAudioUnitParameterFlag_HasCFNameString = 1U << 27,  // cfNameString counts, and `name` does not
+    kAudioUnitParameterFlag_IsHighResolution = 1U << 29, // no difference to this host
+    kAudioUnitParameterFlag_IsReadable = 1U << 30,       // no difference to this host
+    kAudioUnitParameterFlag_IsWritable = 1U << 31        // without it a view only shows the value
 };
 
+/// An indexed parameter has the whole numbers from minValue to maxValue; ParameterValueStrings names them, one string
+/// for each from minValue on.
 struct AudioUnitParameterInfo
 {
-    char name[52];
-    CFStringRef unitName; // of a custom unit
+    char name[52];        // ASCII
+    CFStringRef unitName; // of kAudioUnitParameterUnit_CustomUnit alone
     UInt32 clumpID;
     CFStringRef cfNameString;
     AudioUnitParameterUnit unit;
@@ -119,6 +161,7 @@ struct AudioUnitParameterInfo
     UInt32 flags;
 };
 
+/// A get whose record is input and output: it arrives with the first two members, and the unit writes the third.
 struct AudioUnitParameterStringFromValue
 {
     AudioUnitParameterID inParamID;
@@ -134,7 +177,7 @@ struct AudioUnitParameterValueFromString
 };
 
 /// What a unit may ask of its host while it renders; each answers 0 and writes what is asked for and known. Outputs
-/// may be null.
+/// may be null, and so may members of the record: this host has no transportStateProc2. [process]
 using HostCallback_GetBeatAndTempo = OSStatus (*)(void* hostUserData, Float64* beat, Float64* tempo);
 using HostCallback_GetMusicalTimeLocation = OSStatus (*)(void* hostUserData, UInt32* deltaToNextBeat,
                                                          Float32* numerator, UInt32* denominator,
@@ -155,7 +198,10 @@ struct HostCallbackInfo
     HostCallback_GetTransportState2 transportStateProc2;
 };
 
-// The entries of class info that all units have.
+// The entries of class info that all units have, by custom: this host looks at none, and keeps class info as a binary
+// property list. Type, subtype, manufacturer and version are numbers (kCFNumberSInt32Type), the name is a string, the
+// data bytes of the unit's own (CFDataRef). More entries are the unit's business. What comes back may have numbers of
+// another type, which CFNumberGetValue converts.
 #define kAUPresetTypeKey "type"
 #define kAUPresetSubtypeKey "subtype"
 #define kAUPresetManufacturerKey "manufacturer"

@@ -7,6 +7,10 @@
 // allocates nor locks. Of several changes of one parameter between two gestures the last is heard, and those that lie
 // the granularity or more apart are all heard. Listeners are made, changed and disposed of on their loop's thread,
 // and before the units that they listen to.
+//
+// This host listens to gestures and to values in the global scope. A unit that changes a value by itself notifies;
+// one that is set from outside does not: after SetParameter, a preset or class info the host tells of it, of the
+// latter two with kAUParameterListener_AnyParameter.
 
 struct AudioUnitParameter
 {

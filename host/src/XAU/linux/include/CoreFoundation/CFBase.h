@@ -4,9 +4,14 @@
 #include <cstdint>
 
 // The part of CoreFoundation that audio units and their host share on a system that has none: published names,
-// numbers and meanings. Objects are counted: a function with "Create" or "Copy" in its name hands out a reference
-// that the caller releases, one with "Get" does not. A null allocator is the default one; objects ignore which one
-// they are given. Objects that cannot change may be used from any thread, the others from one at a time. [any]
+// numbers and meanings. These headers want C++17; the interface of the binaries is C's. Objects are counted: a CF
+// function with "Create" or "Copy" in its name hands out a reference that the caller releases, one with "Get" does
+// not. (Units have a custom of their own: see AudioUnitGetProperty.) A null allocator is the default one; objects
+// ignore which one they are given. Objects that cannot change may be used from any thread, the others from one at a
+// time. [any]
+//
+// Who calls what, here and in the headers of units: [main] is the thread that the host makes its units on, [process]
+// the one that renders, [any] one of these or another, several at once.
 #define CF_EXPORT extern "C" __attribute__((visibility("default")))
 
 using Boolean = unsigned char;
