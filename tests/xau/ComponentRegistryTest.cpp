@@ -162,6 +162,26 @@ TEST_F(ComponentRegistryTest, InstancesComeFromTheFactoryAndGoByClose)
     EXPECT_EQ(instance, nullptr);
 }
 
+// An instance whose Open fails has deleted itself: a call of it then would be one of freed memory.
+TEST_F(ComponentRegistryTest, AnInstanceThatDoesNotOpenIsNotClosed)
+{
+    FakeUnit unit;
+    AudioComponentInstance instance = nullptr;
+    unit.mOpenResult = kAudioUnitErr_FailedInitialization;
+    EXPECT_EQ(AudioComponentInstanceNew(unit.GetComponent(), &instance), kAudioUnitErr_FailedInitialization);
+    EXPECT_EQ(instance, nullptr);
+    EXPECT_EQ(unit.CountCalls("close"), 0U);
+}
+
+TEST_F(ComponentRegistryTest, WhatAFactoryThrowsIsAnError)
+{
+    FakeUnit unit;
+    AudioComponentInstance instance = nullptr;
+    unit.mThrowsIn = {"create"};
+    EXPECT_NE(AudioComponentInstanceNew(unit.GetComponent(), &instance), noErr);
+    EXPECT_EQ(instance, nullptr);
+}
+
 TEST_F(ComponentRegistryTest, NullArgumentsAreErrors)
 {
     AudioComponentInstance instance = nullptr;

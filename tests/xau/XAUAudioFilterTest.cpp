@@ -20,6 +20,11 @@ protected:
     FakeUnit mUnit;
 };
 
+CFOwner MakePresets()
+{
+    return CFOwner(CFArrayCreate(nullptr, nullptr, 0, nullptr));
+}
+
 TEST_F(XAUAudioFilterTest, IsMadeOfItsIDWithAndWithoutPrefix)
 {
     for (const UTF16String& id : {u"4:" + mUnit.GetID(), mUnit.GetID()})
@@ -35,6 +40,30 @@ TEST_F(XAUAudioFilterTest, IsMadeOfItsIDWithAndWithoutPrefix)
     EXPECT_FALSE(XAUAudioFilter::Create(u"4:1 2 3"));
     mUnit.mGivesInstance = false;
     EXPECT_FALSE(XAUAudioFilter::Create(u"4:" + mUnit.GetID()));
+}
+
+// Wherever a unit throws: there is no filter, and the instance is disposed of.
+TEST_F(XAUAudioFilterTest, AUnitThatThrowsWhileItIsMadeGivesNone)
+{
+    const auto presets = MakePresets();
+    mUnit.Answer(Global(kAudioUnitProperty_FactoryPresets), presets.get());
+    for (const char* call : {"create", "open", "set property", "initialize"})
+    {
+        CFRetain(presets.get()); // for the filter
+        mUnit.mCalls.clear();
+        mUnit.mThrowsIn = {call};
+        EXPECT_FALSE(mUnit.MakeFilter()) << call;
+        const bool isOpened = std::string(call) != "create" && std::string(call) != "open";
+        EXPECT_EQ(mUnit.CountCalls("close"), isOpened ? 1U : 0U) << call;
+        EXPECT_EQ(CFGetRetainCount(presets.get()), isOpened ? 1 : 2) << call;
+        if (!isOpened)
+            CFRelease(presets.get());
+    }
+    mUnit.Forget(Global(kAudioUnitProperty_FactoryPresets));
+    mUnit.mThrowsIn.clear();
+    ASSERT_TRUE(mUnit.MakeFilter());
+    mUnit.mThrowsIn = {"uninitialize", "close"};
+    mUnit.MakeFilter().reset();
 }
 
 // Rates before sizes before initialisation; what needs it is done while the unit is not initialised.
@@ -114,6 +143,13 @@ TEST_F(XAUAudioFilterTest, LatencyIsReadEachTimeInFramesOfTheRate)
     filter->SetSampleRate(48000.0F);
     mUnit.Answer(Global(kAudioUnitProperty_Latency), Float64{0.25});
     EXPECT_EQ(filter->GetInitialDelay(), 12000);
+}
+
+TEST_F(XAUAudioFilterTest, BlockSizesBelowZeroAreZero)
+{
+    const auto filter = mUnit.MakeFilter();
+    filter->SetBlockSize(-1);
+    EXPECT_EQ(mUnit.Read<UInt32>(Global(kAudioUnitProperty_MaximumFramesPerSlice)), 0U);
 }
 
 TEST_F(XAUAudioFilterTest, ManyElementsAreALie)

@@ -191,6 +191,36 @@ TEST_F(XAUParametersTest, ValuesGoToTheScopeOfTheParameter)
     EXPECT_EQ(mFilter->GetParameterString(2), u"");
 }
 
+TEST_F(XAUParametersTest, WhatAUnitThrowsIsAFailure)
+{
+    AnswerIDs(kAudioUnitScope_Global, {10});
+    mUnit.Answer({kAudioUnitProperty_ParameterInfo, kAudioUnitScope_Global, 10}, MakeInfo(0, 1.0F, 4.0F));
+    mFilter = mUnit.MakeFilter();
+    mUnit.mThrowsIn = {"get parameter", "set parameter"};
+    const auto count = mFilter->GetParameterDirtyCount();
+    mFilter->SetParameter(0, 0.5F);
+    EXPECT_NE(mFilter->GetParameterDirtyCount(), count) << "it was set, and failed";
+    mFilter->GetParameter(0);
+    mUnit.mThrowsIn.clear();
+    mUnit.mValues[{kAudioUnitScope_Global, 10}] = 4.0F;
+    EXPECT_EQ(mFilter->GetParameter(0), 1.0F);
+}
+
+// Units announce nothing for a scope or a list that they have, and then write it whole.
+TEST_F(XAUParametersTest, AListLongerThanAnnouncedHasRoom)
+{
+    AnswerIDs(kAudioUnitScope_Global, std::vector<AudioUnitParameterID>(1500, 10));
+    AnswerIDs(kAudioUnitScope_Output, {});
+    mUnit.mIgnoresAnnouncedSize = true;
+    EXPECT_EQ(Listed().size(), 1500U);
+
+    mUnit.AnswerList(Global(kAudioUnitProperty_SupportedNumChannels), std::vector<AUChannelInfo>(900, {1, 1}));
+    mUnit.mAnnounced[Global(kAudioUnitProperty_SupportedNumChannels)] = 0;
+    mFilter = mUnit.MakeFilter();
+    mFilter->RequestIOConfiguration({ChannelLayout(1)}, {ChannelLayout(1)});
+    EXPECT_TRUE(mFilter->GetInputBuses().empty()) << "nothing was announced";
+}
+
 TEST_F(XAUParametersTest, TextsAreTheUnitsOwnAndStayItsOwn)
 {
     Describe(MakeInfo(0, 0.0F, 4.0F));

@@ -180,6 +180,76 @@ TEST_F(XAUProcessingTest, AFailingRenderLeavesTheOutputsAndTheChunkIsOver)
     EXPECT_EQ(mUnit.mTimes.back().mSampleTime, 1024.0);
 }
 
+TEST_F(XAUProcessingTest, ARenderThatThrowsIsOneThatFails)
+{
+    Start();
+    mUnit.mThrowsIn = {"render"};
+    Process(1030);
+    EXPECT_EQ(mOutput[0], Row(1030, -1.0F));
+    EXPECT_EQ(mUnit.CountCalls("render 6"), 1U) << "the next chunk is another try";
+    Buffers pulled(1);
+    pulled[0] = {9, 9, nullptr};
+    EXPECT_EQ(mUnit.Pull(0, 4, pulled.Get()), noErr);
+    EXPECT_EQ(pulled[0].mData, nullptr) << "the inputs of a render that is over";
+    mUnit.mThrowsIn.clear();
+    RenderInput(0, 2, true);
+    Process(8);
+    EXPECT_EQ(mOutput, mInput);
+}
+
+// A unit asks for more than it was asked for: silence is behind the input, in whosever memory.
+TEST_F(XAUProcessingTest, NoInputIsReadBeyondItsEnd)
+{
+    Start();
+    for (const auto& [frames, withMemory] : {std::pair(20U, true), {20U, false}, {5000U, true}, {5000U, false}})
+    {
+        mUnit.mRender = [&, frames = frames, withMemory = withMemory](UInt32, AudioBufferList& data)
+        {
+            Buffers pulled(2);
+            mOwn.assign(2, Row(frames, 77.0F));
+            for (std::size_t channel = 0; channel < 2; ++channel)
+                pulled[channel].mData = withMemory ? mOwn[channel].data() : nullptr;
+            EXPECT_EQ(mUnit.Pull(0, frames, pulled.Get()), noErr);
+            for (std::size_t channel = 0; channel < 2; ++channel)
+            {
+                const auto* sound = static_cast<const float*>(pulled[channel].mData);
+                const std::size_t told = pulled[channel].mDataByteSize / sizeof(float);
+                EXPECT_EQ(told, withMemory || frames <= kMaxChunk ? frames : kMaxChunk);
+                EXPECT_EQ(sound[3], mInput[channel][3]);
+                EXPECT_EQ(Row(sound + 4, sound + told), Row(told - 4, 0.0F));
+            }
+            data.mBuffers[0].mData = nullptr;
+            return noErr;
+        };
+        Process(4);
+    }
+}
+
+TEST_F(XAUProcessingTest, AUnitThatDoesNotInitializeIsNotRendered)
+{
+    mUnit.mInitializeResult = kAudioUnitErr_FailedInitialization;
+    Start();
+    Process(8);
+    EXPECT_EQ(mOutput[0], Row(8, -1.0F));
+    EXPECT_EQ(mUnit.CountCalls("render 8"), 0U);
+}
+
+// The arrays of the caller have as many channels as the buses that it sees.
+TEST_F(XAUProcessingTest, NewBusesAreRenderedFromTheNextResumeOn)
+{
+    mUnit.SetElements(kAudioUnitScope_Input, {6});
+    mUnit.SetElements(kAudioUnitScope_Output, {6});
+    Start();
+    RenderInput(0, 1, true);
+    mFilter->RequestIOConfiguration({ChannelLayout(1)}, {ChannelLayout(1)});
+    Process(8);
+    EXPECT_EQ(mUnit.CountCalls("render 8"), 0U);
+    EXPECT_EQ(mOutput, (std::vector<Row>{Row(8, -1.0F)}));
+    mFilter->Resume();
+    Process(8);
+    EXPECT_EQ(mOutput, mInput);
+}
+
 TEST_F(XAUProcessingTest, BeforeTheFirstResumeNothingIsRendered)
 {
     mFilter = mUnit.MakeFilter();

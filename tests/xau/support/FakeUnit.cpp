@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <cstring>
+#include <stdexcept>
 
 namespace zebaudiofilterhost::xau
 {
@@ -41,23 +42,32 @@ struct FakeUnit::Calls
 {
     static OSStatus Open(void* self, AudioComponentInstance instance)
     {
-        Of(self).mInstance = instance;
-        return noErr;
+        FakeUnit& unit = Of(self);
+        unit.ThrowIfWanted("open");
+        if (unit.mOpenResult == noErr)
+            unit.mInstance = instance;
+        else
+            delete static_cast<Instance*>(self);
+        return unit.mOpenResult;
     }
     static OSStatus Close(void* self)
     {
-        Of(self).mCalls.emplace_back("close");
+        FakeUnit& unit = Of(self);
+        unit.mCalls.emplace_back("close");
         delete static_cast<Instance*>(self);
+        unit.ThrowIfWanted("close");
         return noErr;
     }
     static OSStatus Initialize(void* self)
     {
         Of(self).mCalls.emplace_back("initialize");
+        Of(self).ThrowIfWanted("initialize");
         return Of(self).mInitializeResult;
     }
     static OSStatus Uninitialize(void* self)
     {
         Of(self).mCalls.emplace_back("uninitialize");
+        Of(self).ThrowIfWanted("uninitialize");
         return noErr;
     }
     static OSStatus GetPropertyInfo(void* self, AudioUnitPropertyID property, AudioUnitScope scope,
@@ -79,7 +89,10 @@ struct FakeUnit::Calls
         const auto found = unit.mProperties.find({property, scope, element});
         if (found == unit.mProperties.end())
             return kAudioUnitErr_InvalidProperty;
-        *size = std::min(*size, static_cast<UInt32>(found->second.size()));
+        if (!unit.mIgnoresAnnouncedSize)
+            *size = std::min(*size, static_cast<UInt32>(found->second.size()));
+        else
+            *size = static_cast<UInt32>(found->second.size());
         std::memcpy(data, found->second.data(), *size);
         return noErr;
     }
@@ -87,6 +100,7 @@ struct FakeUnit::Calls
                                 AudioUnitElement element, const void* data, UInt32 size)
     {
         FakeUnit& unit = Of(self);
+        unit.ThrowIfWanted("set property");
         const Key key(property, scope, element);
         unit.mCalls.push_back("set " + std::to_string(property) + " " + std::to_string(scope) + " " +
                               std::to_string(element));
@@ -98,6 +112,7 @@ struct FakeUnit::Calls
     static OSStatus GetParameter(void* self, AudioUnitParameterID id, AudioUnitScope scope,
                                  AudioUnitElement /*element*/, AudioUnitParameterValue* value)
     {
+        Of(self).ThrowIfWanted("get parameter");
         const auto found = Of(self).mValues.find({scope, id});
         if (found == Of(self).mValues.end())
             return kAudioUnitErr_InvalidParameter;
@@ -107,6 +122,7 @@ struct FakeUnit::Calls
     static OSStatus SetParameter(void* self, AudioUnitParameterID id, AudioUnitScope scope,
                                  AudioUnitElement /*element*/, AudioUnitParameterValue value, UInt32 /*offset*/)
     {
+        Of(self).ThrowIfWanted("set parameter");
         Of(self).mValues[{scope, id}] = value;
         return noErr;
     }
@@ -120,6 +136,7 @@ struct FakeUnit::Calls
     {
         Of(self).mCalls.push_back("render " + std::to_string(frames));
         Of(self).mTimes.push_back(*time);
+        Of(self).ThrowIfWanted("render");
         return Of(self).mRender(frames, *data);
     }
     static AudioComponentMethod Lookup(SInt16 selector)
@@ -166,7 +183,14 @@ AudioComponentPlugInInterface* FakeUnit::Create(const AudioComponentDescription*
     if (found == Units().end() || !found->second->mGivesInstance)
         return nullptr;
     found->second->mCalls.emplace_back("create");
+    found->second->ThrowIfWanted("create");
     return &(new Instance{{Calls::Open, Calls::Close, Calls::Lookup, nullptr}, found->second})->interface;
+}
+
+void FakeUnit::ThrowIfWanted(const char* call) const
+{
+    if (mThrowsIn.count(call) != 0)
+        throw std::runtime_error(call);
 }
 
 UTF16String FakeUnit::GetID() const

@@ -81,11 +81,16 @@ public:
     std::map<std::pair<AudioUnitScope, AudioUnitParameterID>, Float32> mValues;
     std::vector<std::string> mCalls;
     std::vector<AudioTimeStamp> mTimes; // of the renders
+    OSStatus mOpenResult = noErr;
     OSStatus mInitializeResult = noErr;
+    std::set<std::string> mThrowsIn;    // calls: "create", "open", "close", "initialize", "get property" and so on
+    bool mIgnoresAnnouncedSize = false; // writes all that it has, whatever room it was given
     bool mGivesInstance = true;
 
 private:
     struct Calls;
+
+    void ThrowIfWanted(const char* call) const;
 
     static AudioComponentPlugInInterface* Create(const AudioComponentDescription* description);
 

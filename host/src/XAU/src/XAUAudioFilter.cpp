@@ -6,6 +6,7 @@
 #include "host/AudioFilterDescriptor.h"
 #include "host/PluginModuleInfo.h"
 #include "host/XAU/XAUTechnology.h"
+#include "host/src/XAU/src/CallGuarded.h"
 #include "host/src/XAU/src/XAUComponentID.h"
 
 #include <cmath>
@@ -31,6 +32,12 @@ void DumpResultIfFailed(OSStatus code, const char* call)
         ZEB_TRACE("XAUAudioFilter", call << " failed with code " << code);
 }
 
+void DumpRealtimeResultIfFailed(OSStatus code, const char* call)
+{
+    if (code != noErr)
+        ZEB_TRACE_REALTIME("XAUAudioFilter", call << " failed with code " << code);
+}
+
 boost::intrusive_ptr<XAUAudioFilter> XAUAudioFilter::Create(const UTF16String& filterID)
 {
     ZEB_TRACE("XAUAudioFilter", "Create(" << filterID << ")");
@@ -40,15 +47,41 @@ boost::intrusive_ptr<XAUAudioFilter> XAUAudioFilter::Create(const UTF16String& f
     AudioUnit instance = nullptr;
     if (!component || AudioComponentInstanceNew(component, &instance) != noErr || !instance)
         return {};
-    return new XAUAudioFilter(prefixedID, component, instance);
+    try
+    {
+        return new XAUAudioFilter(prefixedID, component, instance);
+    }
+    catch (...) // of the unit's, which is disposed of already
+    {
+        return {};
+    }
 }
 
 XAUAudioFilter::XAUAudioFilter(const UTF16String& filterID, AudioComponent component, AudioUnit instance)
     : AudioFilter(filterID, filterID), mComponent(component), mInstance(instance)
 {
+    try
+    {
+        SetUp();
+    }
+    catch (...)
+    {
+        TakeDown();
+        throw;
+    }
+}
+
+XAUAudioFilter::~XAUAudioFilter()
+{
+    mEditor.reset();
+    TakeDown();
+}
+
+void XAUAudioFilter::SetUp()
+{
     UTF16String name;
     UTF16String vendor;
-    GetNameAndManufacturer(component, name, vendor);
+    GetNameAndManufacturer(mComponent, name, vendor);
     SetDisplayName(name);
     ZEB_TRACE("XAUAudioFilter", "XAUAudioFilter(), vendor: " << vendor << ", effect: " << name);
     UInt32 size = sizeof(CFArrayRef);
@@ -63,16 +96,16 @@ XAUAudioFilter::XAUAudioFilter(const UTF16String& filterID, AudioComponent compo
     ListenToUnit();
 }
 
-XAUAudioFilter::~XAUAudioFilter()
+void XAUAudioFilter::TakeDown() noexcept
 {
-    mEditor.reset();
     if (mListener)
         AUListenerDispose(mListener);
-    UninitializeAU();
+    if (mAUInitialized)
+        CallGuarded([this] { return AudioUnitUninitialize(mInstance); });
     if (mFactoryPresets)
         CFRelease(mFactoryPresets);
     // The infos ask the unit until the last moment; nobody may have kept one.
-    AudioComponentInstanceDispose(mInstance);
+    CallGuarded([this] { return AudioComponentInstanceDispose(mInstance); });
 }
 
 void XAUAudioFilter::SetHostCallbacks()

@@ -25,6 +25,8 @@ namespace zebaudiofilterhost::xau
 
 /// Traces a call of the Audio Unit interface that failed; changes nothing. [any but process]
 void DumpResultIfFailed(OSStatus code, const char* call);
+/// The same. [any]
+void DumpRealtimeResultIfFailed(OSStatus code, const char* call);
 
 /// Frames that a unit is asked for at once at most. Longer blocks are cut.
 inline constexpr int kMaxChunk = 1024;
@@ -43,8 +45,8 @@ public:
     EnumerateFilters(const PluginLocator& locator, int, int,
                      std::vector<boost::intrusive_ptr<AudioFilterDescriptor>>& descriptors);
 
-    /// Owns `instance`, which must not be null, and initialises it. Makes no buses: RequestIOConfiguration does.
-    /// [main]
+    /// Owns `instance`, which must not be null, also if it throws, and initialises it. Makes no buses:
+    /// RequestIOConfiguration does. [main]
     XAUAudioFilter(const UTF16String& filterID, AudioComponent component, AudioUnit instance);
     ~XAUAudioFilter() override;
 
@@ -132,7 +134,8 @@ private:
     };
 
     void BuildParameterInfos();
-    std::vector<AudioUnitParameterID> ReadParameterList(AudioUnitScope scope) const;
+    std::vector<AudioUnitParameterID> ReadParameterList(AudioUnitScope scope,
+                                                        std::vector<AudioUnitParameterID>& room) const;
     void SetHostCallbacks();
     void ListenToUnit();
     void Listen(AudioUnitEventType type, AudioUnitParameterID parameter, const char* call);
@@ -147,8 +150,11 @@ private:
     UTF16String ReadElementName(AudioUnitElement element) const;
     void UpdateRenderCallbacks();
 
+    void SetUp();
+    void TakeDown() noexcept;
     void RenderChunk(float** in, float** out, int offset, int frames);
     void CopyOutputs(float** out, int offset, int frames);
+    void LendInput(std::size_t channel, UInt32 frames, AudioBuffer& buffer);
     bool ReadTempo(utility::Tempo& tempo) const;
 
     AudioComponent mComponent;
@@ -164,6 +170,7 @@ private:
     AudioTimeStamp mRenderTime = {};
     bool mAUInitialized = false;
     std::vector<float*> mInputPointers;
+    std::vector<float> mInputScratch; // a chunk of each input channel
     std::map<int, boost::intrusive_ptr<XAUParameterInfo>> mParameterByIndex;
     std::map<unsigned int, int> mIndexByParameterID;
     AUEventListenerRef mListener = nullptr;

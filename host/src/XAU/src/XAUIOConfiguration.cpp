@@ -8,6 +8,7 @@
 
 #include <algorithm>
 #include <cstring>
+#include <limits>
 
 namespace zebaudiofilterhost::xau
 {
@@ -20,6 +21,9 @@ constexpr UInt32 kMaxElements = 256;
 constexpr UInt32 kMaxChannels = 4096;
 constexpr UInt32 kMaxChannelInfos = 4096;
 constexpr UInt32 kMaxLayoutSize = 1U << 20;
+
+// What is read has so many bytes of room at least: there are units that announce nothing, and then write.
+constexpr std::size_t kMinRoom = 4096;
 
 constexpr std::size_t kLayoutHeader = offsetof(AudioChannelLayout, mChannelDescriptions);
 
@@ -35,6 +39,12 @@ AudioStreamBasicDescription MakeFormat(float sampleRate, UInt32 channels)
     format.mChannelsPerFrame = channels;
     format.mBitsPerChannel = 8 * sizeof(Float32);
     return format;
+}
+
+SInt16 ToChannelCount(std::size_t channels)
+{
+    constexpr std::size_t kMost = std::numeric_limits<SInt16>::max();
+    return static_cast<SInt16>(std::min(channels, kMost));
 }
 
 // False if the bytes do not hold as many descriptions as they say, or none.
@@ -98,12 +108,11 @@ bool XAUAudioFilter::ReadSupportedChannels(std::vector<AUChannelInfo>& supported
     UInt32 size = 0;
     if (AudioUnitGetProperty(mInstance, kProperty, kAudioUnitScope_Global, 0, nullptr, &size) != noErr)
         return false;
-    supported.resize(std::min<std::size_t>(size / sizeof(AUChannelInfo), kMaxChannelInfos));
-    const auto announced = static_cast<UInt32>(supported.size() * sizeof(AUChannelInfo));
-    AUChannelInfo nothing = {};
+    const std::size_t count = std::min<std::size_t>(size / sizeof(AUChannelInfo), kMaxChannelInfos);
+    const auto announced = static_cast<UInt32>(count * sizeof(AUChannelInfo));
+    supported.resize(std::max(count, kMinRoom / sizeof(AUChannelInfo)));
     size = announced;
-    if (AudioUnitGetProperty(mInstance, kProperty, kAudioUnitScope_Global, 0,
-                             supported.empty() ? &nothing : supported.data(), &size) != noErr)
+    if (AudioUnitGetProperty(mInstance, kProperty, kAudioUnitScope_Global, 0, supported.data(), &size) != noErr)
         return false;
     supported.resize(std::min(size, announced) / sizeof(AUChannelInfo));
     return true;
@@ -114,7 +123,7 @@ void XAUAudioFilter::RequestIOConfiguration(const std::vector<ChannelLayout>& in
 {
     if (inputs.size() != 1 || outputs.size() != 1)
         return;
-    ChannelCounts counts = {static_cast<SInt16>(inputs.front().size()), static_cast<SInt16>(outputs.front().size())};
+    ChannelCounts counts = {ToChannelCount(inputs.front().size()), ToChannelCount(outputs.front().size())};
     std::vector<AUChannelInfo> supported;
     if (ReadSupportedChannels(supported))
     {
@@ -154,6 +163,8 @@ OSStatus XAUAudioFilter::RequestChannels(AudioUnitScope scope, UInt32 channels, 
 void XAUAudioFilter::BuildIOConfiguration()
 {
     ClearBusConfiguration();
+    mOutputBuffers.reset(); // Resume makes those that fit the new buses
+    mInputPointers.clear();
     unsigned long offset = 0;
     const UInt32 inputCount = GetElementCount(kAudioUnitScope_Input);
     for (AudioUnitElement element = 0; element < inputCount; ++element)
@@ -211,7 +222,7 @@ bool XAUAudioFilter::ReadChannelLayout(AudioUnitScope scope, AudioUnitElement el
         ZEB_TRACE("XAUAudioFilter", "kAudioUnitProperty_AudioChannelLayout unsupported");
         return false;
     }
-    std::vector<std::byte> bytes(std::max<std::size_t>(std::min(size, kMaxLayoutSize), sizeof(::AudioChannelLayout)));
+    std::vector<std::byte> bytes(std::max<std::size_t>(std::min(size, kMaxLayoutSize), kMinRoom));
     size = std::min(size, kMaxLayoutSize);
     if (AudioUnitGetProperty(mInstance, kProperty, scope, element, bytes.data(), &size) != noErr ||
         size < kLayoutHeader)

@@ -1,5 +1,6 @@
 // Parameters of the unit, and what it tells of them.
 
+#include "host/src/XAU/src/CallGuarded.h"
 #include "host/src/XAU/src/XAUAudioFilter.h"
 
 #include <algorithm>
@@ -12,6 +13,7 @@ namespace
 
 // A list beyond this is a lie of the unit's.
 constexpr UInt32 kMaxParameters = 32768;
+constexpr std::size_t kMinRoom = 1024; // parameters
 
 constexpr float kListenerSeconds = 0.05F; // between two notifications, and between two values of one parameter
 
@@ -21,10 +23,11 @@ void XAUAudioFilter::BuildParameterInfos()
 {
     mParameterByIndex.clear();
     mIndexByParameterID.clear();
+    std::vector<AudioUnitParameterID> room(kMinRoom);
     int index = 0;
     for (AudioUnitScope scope = kAudioUnitScope_Global; scope <= kAudioUnitScope_Note; ++scope)
     {
-        for (const AudioUnitParameterID id : ReadParameterList(scope))
+        for (const AudioUnitParameterID id : ReadParameterList(scope, room))
         {
             mParameterInfos.emplace_back(new XAUParameterInfo(mInstance, scope, id));
             mParameterByIndex.emplace(index, mParameterInfos.back());
@@ -37,22 +40,26 @@ void XAUAudioFilter::BuildParameterInfos()
 // The size is that of the scope, the list that of the global scope, whichever scope is asked for. Units list their
 // parameters there, and one that has more of its own in another scope shows the global ones once more: deliberate,
 // since indices of saved automation depend on it.
-std::vector<AudioUnitParameterID> XAUAudioFilter::ReadParameterList(AudioUnitScope scope) const
+//
+// The room is that of the longest list so far: there are units that announce nothing for a scope, and then write all
+// that the global scope has.
+std::vector<AudioUnitParameterID> XAUAudioFilter::ReadParameterList(AudioUnitScope scope,
+                                                                    std::vector<AudioUnitParameterID>& room) const
 {
     UInt32 size = 0;
     OSStatus result = AudioUnitGetProperty(mInstance, kAudioUnitProperty_ParameterList, scope, 0, nullptr, &size);
     DumpResultIfFailed(result, "XAUAudioFilter::BuildParameterInfos(), AudioUnitGetProperty() 1");
     if (result != noErr)
         return {};
-    std::vector<AudioUnitParameterID> ids(std::min<std::size_t>(size / sizeof(AudioUnitParameterID), kMaxParameters));
-    const auto announced = static_cast<UInt32>(ids.size() * sizeof(AudioUnitParameterID));
+    const std::size_t count = std::min<std::size_t>(size / sizeof(AudioUnitParameterID), kMaxParameters);
+    const auto announced = static_cast<UInt32>(count * sizeof(AudioUnitParameterID));
+    room.assign(std::max(count, room.size()), 0);
     size = announced;
-    AudioUnitParameterID nothing = 0;
-    result = AudioUnitGetProperty(mInstance, kAudioUnitProperty_ParameterList, kAudioUnitScope_Global, 0,
-                                  ids.empty() ? &nothing : ids.data(), &size);
+    result = AudioUnitGetProperty(mInstance, kAudioUnitProperty_ParameterList, kAudioUnitScope_Global, 0, room.data(),
+                                  &size);
     DumpResultIfFailed(result, "XAUAudioFilter::BuildParameterInfos(), AudioUnitGetProperty() 2");
-    ids.resize(result == noErr ? std::min(size, announced) / sizeof(AudioUnitParameterID) : 0);
-    return ids;
+    const std::size_t read = result == noErr ? std::min(size, announced) / sizeof(AudioUnitParameterID) : 0;
+    return {room.begin(), room.begin() + static_cast<std::ptrdiff_t>(read)};
 }
 
 int XAUAudioFilter::GetParameterCount() const
@@ -69,16 +76,21 @@ boost::intrusive_ptr<XAUParameterInfo> XAUAudioFilter::FindParameter(int index) 
 void XAUAudioFilter::NotifyListeners(AudioUnitParameterID parameter, AudioUnitScope scope) const
 {
     const AudioUnitParameter changed = {mInstance, parameter, scope, 0};
-    DumpResultIfFailed(AUParameterListenerNotify(nullptr, nullptr, &changed), "AUParameterListenerNotify()");
+    const OSStatus result = CallGuarded([&] { return AUParameterListenerNotify(nullptr, nullptr, &changed); });
+    DumpRealtimeResultIfFailed(result, "AUParameterListenerNotify()");
 }
 
 void XAUAudioFilter::SetParameter(int index, float value)
 {
     if (const auto info = FindParameter(index))
     {
-        DumpResultIfFailed(AudioUnitSetParameter(mInstance, info->GetParameterID(), info->GetScope(), 0,
-                                                 info->FromNormalized(value), 0),
-                           "AudioUnitSetParameter()");
+        const OSStatus result = CallGuarded(
+            [&]
+            {
+                return AudioUnitSetParameter(mInstance, info->GetParameterID(), info->GetScope(), 0,
+                                             info->FromNormalized(value), 0);
+            });
+        DumpRealtimeResultIfFailed(result, "AudioUnitSetParameter()");
         NotifyListeners(info->GetParameterID(), info->GetScope()); // an open view follows
     }
     AudioFilter::SetParameter(index, value);
@@ -90,8 +102,9 @@ float XAUAudioFilter::GetParameter(int index) const
     if (!info)
         return 0.0F;
     AudioUnitParameterValue value = 0.0F;
-    DumpResultIfFailed(AudioUnitGetParameter(mInstance, info->GetParameterID(), info->GetScope(), 0, &value),
-                       "AudioUnitGetParameter()");
+    const OSStatus result = CallGuarded(
+        [&] { return AudioUnitGetParameter(mInstance, info->GetParameterID(), info->GetScope(), 0, &value); });
+    DumpResultIfFailed(result, "AudioUnitGetParameter()");
     return info->ToNormalized(value);
 }
 

@@ -2,6 +2,7 @@
 
 #include "foundation/zebaccelerate/FloatBuffer.h"
 #include "foundation/zebcore/Trace.h"
+#include "host/src/XAU/src/CallGuarded.h"
 #include "host/src/XAU/src/XAUAudioFilter.h"
 
 #include <algorithm>
@@ -36,8 +37,8 @@ void TraceFirstFailure(OSStatus code)
 void XAUAudioFilter::Process(float** in, float** out, int frames, ChannelFlags /*inFlags*/, ChannelFlags& outFlags)
 {
     outFlags = ChannelFlags();
-    if (!mOutputBuffers)
-        return; // never resumed
+    if (!mOutputBuffers || !mAUInitialized)
+        return; // not resumed since the buses were made, or in vain
     mRenderTime.mRateScalar = 1.0;
     mRenderTime.mFlags =
         kAudioTimeStampSampleTimeValid | kAudioTimeStampHostTimeValid | kAudioTimeStampRateScalarValid;
@@ -55,8 +56,11 @@ void XAUAudioFilter::RenderChunk(float** in, float** out, int offset, int frames
     mCurrentInputs = mInputPointers.data();
     mCurrentFrames = frames;
     AudioUnitRenderActionFlags flags = 0;
-    const OSStatus result =
-        AudioUnitRender(mInstance, &flags, &mRenderTime, 0, static_cast<UInt32>(frames), &mOutputBuffers->Get());
+    const OSStatus result = CallGuarded(
+        [&] {
+            return AudioUnitRender(mInstance, &flags, &mRenderTime, 0, static_cast<UInt32>(frames),
+                                   &mOutputBuffers->Get());
+        });
     if (result == noErr)
         CopyOutputs(out, offset, frames);
     else
@@ -93,7 +97,7 @@ OSStatus XAUAudioFilter::RenderCallback(AudioUnitRenderActionFlags* /*flags*/, c
         if (!buffer.mData)
         {
             // Without the bus's offset, on purpose: a later bus reads the first channels here.
-            buffer.mData = mCurrentInputs[index];
+            LendInput(index, frames, buffer);
             continue;
         }
         auto* target = static_cast<float*>(buffer.mData);
@@ -103,6 +107,24 @@ OSStatus XAUAudioFilter::RenderCallback(AudioUnitRenderActionFlags* /*flags*/, c
         Zero(frames - copied, target + copied);
     }
     return noErr;
+}
+
+// Memory for as many frames as the buffer says: the input itself, or, for a unit that asks for more than it was asked
+// for, a copy with silence behind it. Beyond the largest chunk there is none.
+void XAUAudioFilter::LendInput(std::size_t channel, UInt32 frames, AudioBuffer& buffer)
+{
+    const auto available = static_cast<UInt32>(mCurrentFrames);
+    if (frames <= available)
+    {
+        buffer.mData = mCurrentInputs[channel];
+        return;
+    }
+    const UInt32 lent = std::min(frames, static_cast<UInt32>(kMaxChunk));
+    float* const memory = mInputScratch.data() + channel * static_cast<std::size_t>(kMaxChunk);
+    Copy(available, mCurrentInputs[channel], memory);
+    Zero(lent - available, memory + available);
+    buffer.mData = memory;
+    buffer.mDataByteSize = lent * static_cast<UInt32>(sizeof(float));
 }
 
 OSStatus XAUAudioFilter::StaticRenderCallback(void* refCon, AudioUnitRenderActionFlags* flags,

@@ -68,7 +68,7 @@ void XAUAudioFilter::SetBlockSize(int blockSize)
     AudioFilter::SetBlockSize(blockSize);
     const bool wasInitialized = mAUInitialized;
     UninitializeAU();
-    const auto frames = static_cast<UInt32>(std::min(blockSize, kMaxChunk));
+    const auto frames = static_cast<UInt32>(std::clamp(blockSize, 0, kMaxChunk));
     DumpResultIfFailed(AudioUnitSetProperty(mInstance, kAudioUnitProperty_MaximumFramesPerSlice,
                                             kAudioUnitScope_Global, 0, &frames, sizeof(frames)),
                        "AudioUnitSetProperty(kAudioUnitProperty_MaximumFramesPerSlice)");
@@ -89,6 +89,7 @@ void XAUAudioFilter::Resume()
     InitializeAU();
     mOutputBuffers = std::make_unique<BufferList>(mOutputChannels);
     mInputPointers.resize(mInputChannels);
+    mInputScratch.resize(mInputChannels * static_cast<std::size_t>(kMaxChunk));
     mRenderTime.mSampleTime = 0.0;
     const UInt32 count = GetElementCount(kAudioUnitScope_Input);
     for (AudioUnitElement element = 0; element < count; ++element)

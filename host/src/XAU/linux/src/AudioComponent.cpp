@@ -8,6 +8,28 @@
 using namespace zebaudiofilterhost;
 using namespace zebaudiofilterhost::xau;
 
+namespace
+{
+
+OSStatus Open(AudioComponent component, AudioComponentInstance& instance)
+{
+    AudioComponentFactoryFunction const factory = component->GetFactory();
+    AudioComponentPlugInInterface* unit = factory ? factory(&component->mListing.description) : nullptr;
+    if (!unit)
+        return kAudioComponentErr_InstanceInvalidated;
+
+    auto record = std::make_unique<ComponentInstanceRecord>(component, unit);
+    for (std::size_t selector = 0; unit->Lookup && selector < record->mMethods.size(); ++selector)
+        record->mMethods[selector] = unit->Lookup(static_cast<SInt16>(selector));
+    const OSStatus result = unit->Open ? unit->Open(unit, record.get()) : noErr;
+    if (result != noErr)
+        return result; // without Close: an instance whose Open fails has deleted itself
+    instance = record.release();
+    return noErr;
+}
+
+} // namespace
+
 AudioComponent AudioComponentFindNext(AudioComponent after, const AudioComponentDescription* description)
 {
     ComponentRegistry& registry = ComponentRegistry::GetInstance();
@@ -69,23 +91,14 @@ OSStatus AudioComponentInstanceNew(AudioComponent component, AudioComponentInsta
     if (!component || !instance)
         return kAudio_ParamError;
     *instance = nullptr;
-    AudioComponentFactoryFunction const factory = component->GetFactory();
-    AudioComponentPlugInInterface* unit = factory ? factory(&component->mListing.description) : nullptr;
-    if (!unit)
-        return kAudioComponentErr_InstanceInvalidated;
-
-    auto record = std::make_unique<ComponentInstanceRecord>(component, unit);
-    for (std::size_t selector = 0; unit->Lookup && selector < record->mMethods.size(); ++selector)
-        record->mMethods[selector] = unit->Lookup(static_cast<SInt16>(selector));
-    const OSStatus result = unit->Open ? unit->Open(unit, record.get()) : noErr;
-    if (result != noErr)
+    try
     {
-        if (unit->Close)
-            unit->Close(unit);
-        return result;
+        return Open(component, *instance);
     }
-    *instance = record.release();
-    return noErr;
+    catch (...) // of the unit's
+    {
+        return kAudioComponentErr_InstanceInvalidated;
+    }
 }
 
 OSStatus AudioComponentInstanceDispose(AudioComponentInstance instance)

@@ -49,17 +49,31 @@ public:
     template <typename Visit>
     void ForEach(const Visit& visit) const
     {
-        // In one order with the exchange and the look at the readers in Replace: either this reader is seen there, or
-        // it sees the new array. An acquire-release pair could miss both.
-        mReaders.fetch_add(1, std::memory_order_seq_cst);
+        const Reading reading(mReaders); // also until a unit that is asked for its value throws
         const Rows& rows = *mRows.load(std::memory_order_seq_cst);
         const std::size_t count = rows.mCount.load(std::memory_order_acquire); // with what Append wrote before it
         for (std::size_t index = 0; index < count; ++index)
             visit(rows.mRows[index]);
-        mReaders.fetch_sub(1, std::memory_order_release);
     }
 
 private:
+    // In one order with the exchange and the look at the readers in Replace: either this reader is seen there, or it
+    // sees the new array. An acquire-release pair could miss both.
+    class Reading
+    {
+    public:
+        explicit Reading(std::atomic<int>& readers) : mReaders(readers)
+        {
+            mReaders.fetch_add(1, std::memory_order_seq_cst);
+        }
+        ~Reading() { mReaders.fetch_sub(1, std::memory_order_release); }
+        Reading(const Reading&) = delete;
+        Reading& operator=(const Reading&) = delete;
+
+    private:
+        std::atomic<int>& mReaders;
+    };
+
     struct Rows
     {
         explicit Rows(std::size_t capacity) : mRows(capacity) {}
