@@ -84,6 +84,7 @@ TEST_F(XAUParametersTest, UnitsBecomeLabelsAndSteps)
         EXPECT_EQ(info->GetLabel(), found == labels.end() ? UTF16String() : found->second) << unit;
         EXPECT_EQ(info->GetStepCount(), unit == 1 ? 3 : unit == 2 ? 1 : 0) << unit;
     }
+    EXPECT_EQ(Describe(MakeInfo(kAudioUnitParameterUnit_Indexed, 0.0F, 100000.0F))->GetStepCount(), 100000);
     EXPECT_GE(Describe(MakeInfo(kAudioUnitParameterUnit_Indexed, -3e38F, 3e38F))->GetStepCount(), 0);
 }
 

@@ -44,7 +44,8 @@ NSView* MakeCocoaView(AudioUnit unit)
     if (!info)
         return nil;
     NSView* view = nil;
-    if (AudioUnitGetProperty(unit, kAudioUnitProperty_CocoaUI, kAudioUnitScope_Global, 0, info, &size) == noErr)
+    if (AudioUnitGetProperty(unit, kAudioUnitProperty_CocoaUI, kAudioUnitScope_Global, 0, info, &size) == noErr &&
+        size >= sizeof(AudioUnitCocoaViewInfo))
     {
         NSURL* location = (NSURL*)info->mCocoaAUViewBundleLocation;
         NSString* className = (NSString*)info->mCocoaAUViewClass[0];
@@ -98,6 +99,7 @@ public:
     ~CocoaView() override
     {
         [[NSNotificationCenter defaultCenter] removeObserver:mDelegate];
+        [mContainer removeFromSuperview];
         [mDelegate release];
         [mContainer release];
         [mView release];

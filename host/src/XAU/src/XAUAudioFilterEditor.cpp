@@ -58,11 +58,20 @@ void XAUAudioFilterEditor::OnCocoaViewResized()
 {
     if (!mView || mResizing)
         return;
-    mResizing = true; // the frame's own change comes back here
+    const boost::intrusive_ptr<XAUAudioFilterEditor> self(this); // until whoever hears the signal is done
+    mResizing = true;                                            // the frame's own change comes back here
     mWidth = mView->GetWidth();
     mHeight = mView->GetHeight();
     mView->FitFrame();
-    GetContentSizeChangedSignal()();
+    try
+    {
+        GetContentSizeChangedSignal()();
+    }
+    catch (...)
+    {
+        mResizing = false;
+        throw;
+    }
     mResizing = false;
 }
 

@@ -54,8 +54,8 @@ UTF16String FromAscii(const char* text, std::size_t size)
 
 int CountSteps(float minimum, float maximum)
 {
-    const float range = std::trunc(maximum - minimum);
-    constexpr auto kMost = static_cast<float>(std::numeric_limits<std::int16_t>::max());
+    const double range = std::trunc(static_cast<double>(maximum - minimum));
+    constexpr double kMost = std::numeric_limits<int>::max();
     return std::isnan(range) ? 0 : static_cast<int>(std::clamp(range, -kMost, kMost));
 }
 

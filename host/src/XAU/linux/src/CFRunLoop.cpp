@@ -90,7 +90,7 @@ CFRunLoopRef CFRunLoopGetCurrent()
 SInt32 CFRunLoopRunInMode(CFStringRef /*mode*/, CFTimeInterval seconds, Boolean returnAfterSourceHandled)
 {
     constexpr CFTimeInterval kLongest = 1e6; // Beyond this a clock's numbers would overflow.
-    const std::chrono::duration<double> time(std::clamp(seconds, 0.0, kLongest));
+    const std::chrono::duration<double> time(seconds > 0.0 ? std::min(seconds, kLongest) : 0.0); // also for no number
     return CFRunLoopGetCurrent()->Run(std::chrono::duration_cast<CFOpaqueRunLoop::Clock::duration>(time),
                                       returnAfterSourceHandled != 0);
 }
