@@ -90,10 +90,12 @@ bool GenericView::OpenWindow(xcb_window_t parent)
     mWindow = xcb_generate_id(mConnection);
     const std::uint32_t events = XCB_EVENT_MASK_EXPOSURE | XCB_EVENT_MASK_BUTTON_PRESS |
                                  XCB_EVENT_MASK_BUTTON_RELEASE | XCB_EVENT_MASK_BUTTON_MOTION;
+    // In the order of their bits. A parent of another depth lends neither its border nor its colours.
+    const std::array<std::uint32_t, 3> values = {0, events, screen->default_colormap};
     const auto cookie = xcb_create_window_checked(
-        mConnection, XCB_COPY_FROM_PARENT, mWindow, parent, 0, 0, static_cast<std::uint16_t>(mGeometry.width),
+        mConnection, screen->root_depth, mWindow, parent, 0, 0, static_cast<std::uint16_t>(mGeometry.width),
         static_cast<std::uint16_t>(mGeometry.height), 0, XCB_WINDOW_CLASS_INPUT_OUTPUT, screen->root_visual,
-        XCB_CW_EVENT_MASK, &events);
+        XCB_CW_BORDER_PIXEL | XCB_CW_EVENT_MASK | XCB_CW_COLORMAP, values.data());
     const Reply<xcb_generic_error_t> error(xcb_request_check(mConnection, cookie));
     if (error)
         return false;
