@@ -137,13 +137,13 @@ enum AudioUnitParameterOptions : UInt32
 {
     // Whoever reads the info releases its strings; without the flag the unit keeps them alive until Close.
     kAudioUnitParameterFlag_CFNameRelease = 1U << 4,
+    kAudioUnitParameterFlag_IsHighResolution = 1U << 23, // no difference to this host
     kAudioUnitParameterFlag_NonRealTime = 1U << 24, // not to be automated, and hidden from the application's lists
     kAudioUnitParameterFlag_CanRamp = 1U << 25,
-    kAudioUnitParameterFlag_ExpertMode = 1U << 26,       // no difference to this host
-    kAudioUnitParameterFlag_HasCFNameString = 1U << 27,  // cfNameString counts, and `name` does not
-    kAudioUnitParameterFlag_IsHighResolution = 1U << 29, // no difference to this host
-    kAudioUnitParameterFlag_IsReadable = 1U << 30,       // no difference to this host
-    kAudioUnitParameterFlag_IsWritable = 1U << 31        // without it a view only shows the value
+    kAudioUnitParameterFlag_ExpertMode = 1U << 26,      // no difference to this host
+    kAudioUnitParameterFlag_HasCFNameString = 1U << 27, // cfNameString counts, and `name` does not
+    kAudioUnitParameterFlag_IsReadable = 1U << 30,      // no difference to this host
+    kAudioUnitParameterFlag_IsWritable = 1U << 31       // without it a view only shows the value
 };
 
 /// An indexed parameter has the whole numbers from minValue to maxValue; ParameterValueStrings names them, one string
