@@ -138,6 +138,26 @@ protected:
         xcb_flush(mConnection);
     }
 
+    // Once, with something done in the midst of it.
+    void DragTheCorner(const boost::function<void()>& react)
+    {
+        Open();
+        const auto before = mEditor->GetEditorRect();
+        int told = 0;
+        const boost::signals2::scoped_connection connection = mEditor->GetContentSizeChangedSignal().connect(
+            [&]
+            {
+                ++told;
+                react();
+            });
+        Send(XCB_BUTTON_PRESS, before.right - 2, before.bottom - 2);
+        Send(XCB_MOTION_NOTIFY, 700, before.bottom);
+        Send(XCB_BUTTON_RELEASE, 700, before.bottom);
+        EXPECT_TRUE(WaitFor([&] { return told > 0; }));
+        zebcore::threads::RunMainThreadUntil({}, 50); // whatever is left to do for the view
+        EXPECT_EQ(told, 1);
+    }
+
     Float32 Value(AudioUnitParameterID id) { return mUnit.mValues[{kAudioUnitScope_Global, id}]; }
     int RowMiddle(int row) const { return mEditor->GetEditorRect().bottom / 2 + (row - 1) * 26; }
 
@@ -249,6 +269,22 @@ TEST_F(XAUEditorTest, DraggingTheCornerResizesTheViewAndSaysSo)
         return geometry && geometry->width == 700;
     };
     EXPECT_TRUE(WaitFor(isWide)); // the view's own connection may be served later than this one
+}
+
+TEST_F(XAUEditorTest, WhoHearsOfTheSizeMayOpenTheViewAgain)
+{
+    DragTheCorner([this] { mEditor->Open(reinterpret_cast<void*>(static_cast<std::uintptr_t>(mParent))); });
+    EXPECT_GT(mEditor->GetEditorRect().right, 0);
+}
+
+TEST_F(XAUEditorTest, WhoHearsOfTheSizeMayLetTheFilterGo)
+{
+    DragTheCorner(
+        [this]
+        {
+            mEditor.reset();
+            mFilter.reset();
+        });
 }
 
 TEST_F(XAUEditorTest, TheEditorStaysOneAndOutlivesItsParent)

@@ -67,7 +67,8 @@ SInt32 CFOpaqueRunLoop::Run(Clock::duration time, bool returnAfterSourceHandled)
             lock.lock();
             if (returnAfterSourceHandled)
                 return kCFRunLoopRunHandledSource;
-            continue;
+            if (Clock::now() < end)
+                continue;
         }
         if (Clock::now() >= end)
             return kCFRunLoopRunTimedOut;

@@ -72,6 +72,7 @@ GenericView::GenericView(xcb_connection_t* connection, AudioUnit unit, boost::fu
 
 GenericView::~GenericView()
 {
+    *mIsAlive = false;
     if (mListener)
         AUListenerDispose(mListener);
     zebcore::threads::RemoveDescriptorWatch(mWatch);
@@ -129,8 +130,13 @@ void GenericView::OnParameterChanged(void* userData, void* object, const AudioUn
 
 void GenericView::OnReadable()
 {
+    const std::shared_ptr<bool> isAlive = mIsAlive;
     while (const Reply<xcb_generic_event_t> event{xcb_poll_for_event(mConnection)})
+    {
         OnEvent(*event);
+        if (!*isAlive)
+            return;
+    }
     if (xcb_connection_has_error(mConnection) != 0)
         zebcore::threads::RemoveDescriptorWatch(std::exchange(mWatch, zebcore::threads::kNoWatch));
 }
@@ -215,9 +221,12 @@ void GenericView::Resize(int width)
         return;
     mGeometry = geometry;
     FitFrame();
-    if (mResized)
-        mResized();
-    Paint();
+    const std::shared_ptr<bool> isAlive = mIsAlive;
+    const boost::function<void()> resized = mResized;
+    if (resized)
+        resized(); // may be the end of this view
+    if (*isAlive)
+        Paint();
 }
 
 float GenericView::GetWidth() const

@@ -53,6 +53,7 @@ private:
     boost::function<void()> mResized;
     std::optional<std::size_t> mHeldRow; // under a pressed button
     bool mHoldsGrip = false;
+    std::shared_ptr<bool> mIsAlive = std::make_shared<bool>(true); // for what may end it in the middle of an event
 };
 
 } // namespace zebaudiofilterhost::xau
