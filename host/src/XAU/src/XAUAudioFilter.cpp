@@ -73,6 +73,8 @@ XAUAudioFilter::XAUAudioFilter(const UTF16String& filterID, AudioComponent compo
 
 XAUAudioFilter::~XAUAudioFilter()
 {
+    if (mEditor)
+        mEditor->ReleaseView();
     mEditor.reset();
     TakeDown();
 }

@@ -51,7 +51,13 @@ void XAUAudioFilterEditor::Idle()
 
 bool XAUAudioFilterEditor::CanEmbedView() const
 {
-    return true;
+    return mInstance != nullptr;
+}
+
+void XAUAudioFilterEditor::ReleaseView()
+{
+    mView.reset();
+    mInstance = nullptr;
 }
 
 void XAUAudioFilterEditor::OnCocoaViewResized()

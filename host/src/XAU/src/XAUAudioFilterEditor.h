@@ -26,6 +26,9 @@ public:
     void Idle() override;
     bool CanEmbedView() const override;
 
+    /// Before the unit goes, which the view listens to: an editor that somebody keeps is empty from here on. [main]
+    void ReleaseView();
+
     /// Takes over the view's size, and tells. [main]
     void OnCocoaViewResized();
 
