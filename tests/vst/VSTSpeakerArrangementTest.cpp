@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <bit>
 #include <cstring>
 #include <string>
@@ -20,8 +21,8 @@ const VstSpeakerProperties* Records(const VstSpeakerArrangement& arrangement)
 
 bool IsZero(const void* memory, std::size_t size)
 {
-    const std::vector<char> zeros(size);
-    return std::memcmp(memory, zeros.data(), size) == 0;
+    const auto* bytes = static_cast<const char*>(memory);
+    return std::all_of(bytes, bytes + size, [](char byte) { return byte == 0; });
 }
 
 struct Expected

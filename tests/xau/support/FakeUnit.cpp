@@ -93,7 +93,7 @@ struct FakeUnit::Calls
             *size = std::min(*size, static_cast<UInt32>(found->second.size()));
         else
             *size = static_cast<UInt32>(found->second.size());
-        std::memcpy(data, found->second.data(), *size);
+        std::copy_n(found->second.begin(), *size, static_cast<std::byte*>(data));
         return noErr;
     }
     static OSStatus SetProperty(void* self, AudioUnitPropertyID property, AudioUnitScope scope,
