@@ -57,7 +57,8 @@ TEST_F(AudioUnitTest, AScanFindsEachUnitOnce)
     EXPECT_THAT(Succeed({"scan"}).LastLine(), HasSubstr("nothing to scan"));
     EXPECT_EQ(Succeed({"list", "--names"}).out, "Zeb Unit Delay\nZeb Unit Gain\nZeb Unit Mixer\nZeb Unit Tone\n");
     EXPECT_THAT(Succeed({"list", "--long"}).out, HasSubstr("Audio Unit"));
-    for (const nlohmann::json& filter : Succeed({"list", "--json"}).Json().at("filters"))
+    const nlohmann::json list = Succeed({"list", "--json"}).Json();
+    for (const nlohmann::json& filter : list.at("filters"))
     {
         EXPECT_EQ(filter.at("technology"), "Audio Unit");
         EXPECT_EQ(filter.at("vendor"), "Zeb");
