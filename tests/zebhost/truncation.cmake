@@ -1,4 +1,4 @@
-# A run for each byte of each file.
+# A run for each byte of each file; under sanitizers for some of them.
 
 find_package(nlohmann_json REQUIRED)
 
@@ -6,7 +6,8 @@ add_executable(zebhost_truncation_test TruncationTest.cpp support/Zebhost.cpp)
 target_link_libraries(zebhost_truncation_test PRIVATE
     zeb_options nlohmann_json::nlohmann_json GTest::gtest_main GTest::gmock)
 target_include_directories(zebhost_truncation_test PRIVATE ${PROJECT_SOURCE_DIR})
-target_compile_definitions(zebhost_truncation_test PRIVATE ZEBHOST_PROGRAM="$<TARGET_FILE:zebhost>")
+target_compile_definitions(zebhost_truncation_test PRIVATE ZEBHOST_PROGRAM="$<TARGET_FILE:zebhost>"
+    ZEB_TRUNCATION_STEP=$<IF:$<BOOL:${ZEB_SANITIZE}>,13,1>)
 add_dependencies(zebhost_truncation_test zebhost)
 zeb_use_fixtures(zebhost_truncation_test)
 add_test(NAME zebhost_truncation_test COMMAND zebhost_truncation_test)
