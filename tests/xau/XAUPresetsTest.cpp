@@ -30,7 +30,8 @@ protected:
     TestClock mClock;
     FakeUnit mUnit;
     boost::intrusive_ptr<XAUAudioFilter> mFilter;
-    boost::intrusive_ptr<PresetData> mPreset{new PresetData(new PropList)};
+    PropList mList; // outlives the view of it
+    boost::intrusive_ptr<PresetData> mPreset{new PresetData(&mList)};
 };
 
 TEST_F(XAUPresetsTest, TheClassInfoIsThePresetAndIsNotReleased)

@@ -78,7 +78,9 @@ protected:
         if (!mFilter)
             return;
         mConnection.disconnect();
-        mFilter->FlushMessageQueue();
+        // Messages that nobody has taken keep their filter, and a flush takes no more than the ring holds.
+        for (int flush = 0; flush < 4096; ++flush)
+            mFilter->FlushMessageQueue();
         mFilter->SetAudioFilterHost(nullptr);
     }
 

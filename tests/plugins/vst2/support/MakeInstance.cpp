@@ -35,8 +35,8 @@ const Member* WantedMember(audioMasterCallback host, std::int32_t& id, bool& isK
 // A host that looks at the magic number closes none of those without: they stay where a leak check finds them.
 void KeepUnclosed(const Instance* instance)
 {
-    static std::vector<const Instance*> sKept;
-    sKept.push_back(instance);
+    static auto* sKept = new std::vector<const Instance*>; // to the end of the process
+    sKept->push_back(instance);
 }
 
 } // namespace
