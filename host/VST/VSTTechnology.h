@@ -13,8 +13,8 @@ ZEB_EXPORT Guid GetVSTFactoryGuid();
 // No scan looks there by itself. [main]
 ZEB_EXPORT UTF16String GetPrivateVSTPluginDirectory();
 
-// Whether a search would take what lies at this path for a VST 2 plug-in: a directory that ends in ".vst", or on Linux
-// a file that ends in ".so" and exports an entry point. Reads the file and loads nothing. [main]
+// Whether a search would take what lies at this path for a VST 2 plug-in: a directory that ends in ".vst", or on
+// Linux a file that ends in ".so" and exports an entry point. Reads the file and loads nothing. [main]
 ZEB_EXPORT bool IsVSTPlugin(const UTF16String& path);
 
 } // namespace zebaudiofilterhost::vst

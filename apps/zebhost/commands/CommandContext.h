@@ -9,7 +9,8 @@
 namespace zebhost
 {
 
-// What a command works with. The catalogue is loaded, and nobody else changes its files while a command does that may.
+// What a command works with. The catalogue is loaded, and nobody else changes its files while a command does that
+// may.
 struct CommandContext
 {
     const Arguments& arguments;

@@ -39,9 +39,9 @@ void CheckUsable(const Catalogue::Descriptor& descriptor)
     }
     if (!IsInstalled(descriptor->GetLocator()))
     {
-        throw Failure(ExitCode::NotLoaded,
-                      Title(descriptor) + " is gone: put it back, or run 'zebhost scan' to drop it "
-                                          "from the catalogue");
+        throw Failure(ExitCode::NotLoaded, Title(descriptor) +
+                                               " is gone: put it back, or run 'zebhost scan' to drop it "
+                                               "from the catalogue");
     }
 }
 
