@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <cstring>
+#include <memory>
 #include <stdexcept>
 
 namespace zebaudiofilterhost::xau
@@ -43,12 +44,13 @@ struct FakeUnit::Calls
     static OSStatus Open(void* self, AudioComponentInstance instance)
     {
         FakeUnit& unit = Of(self);
+        std::unique_ptr<Instance> owner(static_cast<Instance*>(self)); // frees itself when it does not open
         unit.ThrowIfWanted("open");
-        if (unit.mOpenResult == noErr)
-            unit.mInstance = instance;
-        else
-            delete static_cast<Instance*>(self);
-        return unit.mOpenResult;
+        if (unit.mOpenResult != noErr)
+            return unit.mOpenResult;
+        unit.mInstance = instance;
+        static_cast<void>(owner.release());
+        return noErr;
     }
     static OSStatus Close(void* self)
     {
