@@ -3,16 +3,10 @@
 #include "foundation/zebcore/StringStreams.h"
 #include "host/TechnologyType.h"
 #include "host/VST/VSTTechnology.h"
+#include "host/src/FilterIDPrefix.h"
 
 namespace zebaudiofilterhost::vst
 {
-
-namespace
-{
-
-constexpr std::size_t kPrefixLength = 2;
-
-} // namespace
 
 UTF16String EncodeFilterID(unsigned int uniqueID, const UTF16String& path)
 {
@@ -23,8 +17,7 @@ UTF16String EncodeFilterID(unsigned int uniqueID, const UTF16String& path)
 
 void DecodeFilterID(const UTF16String& filterID, unsigned int& uniqueID)
 {
-    const bool hasPrefix = filterID.size() > kPrefixLength && filterID[1] == u':';
-    zebcore::utility::iUTF16StringStream stream(hasPrefix ? filterID.substr(kPrefixLength) : filterID);
+    zebcore::utility::iUTF16StringStream stream(WithoutTechnologyPrefix(filterID));
     unsigned int number = 0; // streams write 0 on failure
     if (stream >> number)
         uniqueID = number;

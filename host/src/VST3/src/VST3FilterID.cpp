@@ -3,6 +3,7 @@
 #include "foundation/zebcore/StringStreams.h"
 #include "host/TechnologyType.h"
 #include "host/VST3/VST3Technology.h"
+#include "host/src/FilterIDPrefix.h"
 
 #include <cstdint>
 #include <iomanip>
@@ -12,8 +13,6 @@ namespace zebaudiofilterhost::vst3
 
 namespace
 {
-
-constexpr std::size_t kPrefixLength = 2;
 
 // 0 for what cannot be read.
 std::uint32_t ReadWord(zebcore::utility::iUTF16StringStream& stream)
@@ -36,8 +35,7 @@ UTF16String EncodeFilterID(const Steinberg::TUID classID)
 
 void DecodeFilterID(const UTF16String& filterID, Steinberg::TUID classID)
 {
-    const bool hasPrefix = filterID.size() > kPrefixLength && filterID[1] == u':';
-    zebcore::utility::iUTF16StringStream stream(hasPrefix ? filterID.substr(kPrefixLength) : filterID);
+    zebcore::utility::iUTF16StringStream stream(WithoutTechnologyPrefix(filterID));
     stream >> std::hex;
     const std::uint32_t word1 = ReadWord(stream);
     const std::uint32_t word2 = ReadWord(stream);

@@ -6,6 +6,7 @@
 #include "host/AudioFilterDescriptor.h"
 #include "host/PluginModuleInfo.h"
 #include "host/XAU/XAUTechnology.h"
+#include "host/src/FilterIDPrefix.h"
 #include "host/src/XAU/src/CallGuarded.h"
 #include "host/src/XAU/src/XAUComponentID.h"
 
@@ -21,8 +22,6 @@ namespace
 // What a unit gets until the application says more.
 constexpr float kOpeningSampleRate = 44100.0F;
 constexpr int kOpeningBlockSize = 512;
-
-constexpr std::size_t kPrefixLength = 2;
 
 } // namespace
 
@@ -41,7 +40,7 @@ void DumpRealtimeResultIfFailed(OSStatus code, const char* call)
 boost::intrusive_ptr<XAUAudioFilter> XAUAudioFilter::Create(const UTF16String& filterID)
 {
     ZEB_TRACE("XAUAudioFilter", "Create(" << filterID << ")");
-    const bool lacksPrefix = filterID.size() > kPrefixLength && filterID[1] != u':';
+    const bool lacksPrefix = filterID.size() > 2 && !HasTechnologyPrefix(filterID);
     const UTF16String prefixedID = lacksPrefix ? u"4:" + filterID : filterID;
     auto* const component = FindComponentForDescription(DecodeComponentID(prefixedID));
     AudioUnit instance = nullptr;
@@ -163,8 +162,7 @@ boost::intrusive_ptr<AudioFilterDescriptor> XAUAudioFilter::CreateFilterDescript
     UTF16String vendor;
     GetNameAndManufacturer(mComponent, name, vendor);
     const UTF16String id = GetID();
-    const bool hasPrefix = id.size() > kPrefixLength && id[1] == u':';
-    const PluginLocator locator(kTechnologyAudioUnit, hasPrefix ? id.substr(kPrefixLength) : id);
+    const PluginLocator locator(kTechnologyAudioUnit, WithoutTechnologyPrefix(id));
     const boost::intrusive_ptr<AudioFilterDescriptor> descriptor(
         new AudioFilterDescriptor(locator, name, vendor, 0, kCategoryNone, id, GetXAUFactoryGuid(), false));
     descriptor->SetSupportsMono(IsChannelFormatSupported(zebmediatypes::CreateMonoChannelLayout()));

@@ -2,6 +2,7 @@
 
 #include "foundation/zebcore/StringStreams.h"
 #include "host/XAU/XAUTechnology.h"
+#include "host/src/FilterIDPrefix.h"
 #include "host/src/XAU/src/CFOwner.h"
 
 namespace zebaudiofilterhost::xau
@@ -9,8 +10,6 @@ namespace zebaudiofilterhost::xau
 
 namespace
 {
-
-constexpr std::size_t kPrefixLength = 2;
 
 UTF16String Trim(const UTF16String& text)
 {
@@ -33,8 +32,7 @@ UTF16String EncodeComponentID(const AudioComponentDescription& description)
 
 AudioComponentDescription DecodeComponentID(const UTF16String& id)
 {
-    const bool hasPrefix = id.size() > kPrefixLength && id[1] == u':';
-    zebcore::utility::iUTF16StringStream stream(hasPrefix ? id.substr(kPrefixLength) : id);
+    zebcore::utility::iUTF16StringStream stream(WithoutTechnologyPrefix(id));
     AudioComponentDescription description = {};
     for (OSType* code :
          {&description.componentType, &description.componentSubType, &description.componentManufacturer})
