@@ -2,6 +2,7 @@
 
 #include <atomic>
 #include <memory>
+#include <thread>
 #include <utility>
 
 namespace zebaudiofilterhost
@@ -68,6 +69,14 @@ public:
             Free(retired);
         else
             RetireAll(retired);
+    }
+
+    /// Returns when nobody reads any more what was replaced before the call. A reader that waits for the caller
+    /// meanwhile never lets it return. [any but process]
+    void AwaitReaders() const
+    {
+        while (mReaders.load(std::memory_order_seq_cst) != 0)
+            std::this_thread::yield();
     }
 
 private:

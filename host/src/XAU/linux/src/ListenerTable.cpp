@@ -1,7 +1,7 @@
 #include "host/src/XAU/linux/src/ListenerTable.h"
 
 #include <memory>
-#include <thread>
+#include <utility>
 
 namespace zebaudiofilterhost::xau
 {
@@ -27,22 +27,18 @@ bool Interest::operator==(const Interest& other) const
     return mObject == other.mObject && IsSameEvent(mEvent, other.mEvent);
 }
 
-ListenerTable::ListenerTable() : mRows(new Rows(kFirstCapacity))
+ListenerTable::ListenerTable()
 {
-}
-
-ListenerTable::~ListenerTable()
-{
-    const std::unique_ptr<const Rows> rows(mRows.load(std::memory_order_acquire));
+    mRows.Publish(std::make_shared<Rows>(kFirstCapacity));
 }
 
 void ListenerTable::Append(AUListenerBase* listener, const Interest& interest)
 {
     const std::lock_guard lock(mChanging);
-    const std::size_t count = mRows.load(std::memory_order_relaxed)->mCount.load(std::memory_order_relaxed);
-    if (count == mRows.load(std::memory_order_relaxed)->mRows.size())
+    const std::size_t count = GetRows().mCount.load(std::memory_order_relaxed);
+    if (count == GetRows().mRows.size())
         Replace(2 * count, [](const Row&) { return false; });
-    Rows& rows = *mRows.load(std::memory_order_relaxed); // only this side, under the lock, replaces or adds
+    Rows& rows = GetRows();
     rows.mRows[count] = {listener, interest};
     rows.mCount.store(count + 1, std::memory_order_release);
 }
@@ -50,23 +46,23 @@ void ListenerTable::Append(AUListenerBase* listener, const Interest& interest)
 void ListenerTable::Remove(const std::function<bool(const Row&)>& isOut)
 {
     const std::lock_guard lock(mChanging);
-    Replace(mRows.load(std::memory_order_relaxed)->mRows.size(), isOut);
+    Replace(GetRows().mRows.size(), isOut);
 }
 
 void ListenerTable::Replace(std::size_t capacity, const std::function<bool(const Row&)>& isOut)
 {
-    auto rows = std::make_unique<Rows>(capacity);
-    const Rows& from = *mRows.load(std::memory_order_relaxed);
+    auto rows = std::make_shared<Rows>(capacity);
+    const Rows& from = GetRows();
     std::size_t count = 0;
     for (std::size_t index = 0; index < from.mCount.load(std::memory_order_relaxed); ++index)
     {
         if (!isOut(from.mRows[index]))
             rows->mRows[count++] = from.mRows[index];
     }
-    rows->mCount.store(count, std::memory_order_relaxed); // the exchange below publishes it
-    const std::unique_ptr<const Rows> old(mRows.exchange(rows.release(), std::memory_order_seq_cst));
-    while (mReaders.load(std::memory_order_seq_cst) != 0)
-        std::this_thread::yield();
+    rows->mCount.store(count, std::memory_order_relaxed); // publishing comes behind it
+    mRows.Publish(std::move(rows));
+    mRows.AwaitReaders();
+    mRows.FreeRetired();
 }
 
 } // namespace zebaudiofilterhost::xau

@@ -1,10 +1,12 @@
 #pragma once
 
 #include "AudioToolbox/AudioUnitUtilities.h"
+#include "utility/src/Published.h"
 
 #include <atomic>
 #include <cstddef>
 #include <functional>
+#include <memory>
 #include <mutex>
 #include <vector>
 
@@ -36,9 +38,6 @@ public:
     };
 
     ListenerTable();
-    ~ListenerTable();
-    ListenerTable(const ListenerTable&) = delete;
-    ListenerTable& operator=(const ListenerTable&) = delete;
 
     /// [any but process]
     void Append(AUListenerBase* listener, const Interest& interest);
@@ -49,31 +48,14 @@ public:
     template <typename Visit>
     void ForEach(const Visit& visit) const
     {
-        const Reading reading(mReaders); // also until a unit that is asked for its value throws
-        const Rows& rows = *mRows.load(std::memory_order_seq_cst);
+        const Published<RowsPtr>::Reader reader(mRows); // also until a unit that is asked for its value throws
+        const Rows& rows = **reader;
         const std::size_t count = rows.mCount.load(std::memory_order_acquire); // with what Append wrote before it
         for (std::size_t index = 0; index < count; ++index)
             visit(rows.mRows[index]);
     }
 
 private:
-    // In one order with the exchange and the look at the readers in Replace: either this reader is seen there, or it
-    // sees the new array. An acquire-release pair could miss both.
-    class Reading
-    {
-    public:
-        explicit Reading(std::atomic<int>& readers) : mReaders(readers)
-        {
-            mReaders.fetch_add(1, std::memory_order_seq_cst);
-        }
-        ~Reading() { mReaders.fetch_sub(1, std::memory_order_release); }
-        Reading(const Reading&) = delete;
-        Reading& operator=(const Reading&) = delete;
-
-    private:
-        std::atomic<int>& mReaders;
-    };
-
     struct Rows
     {
         explicit Rows(std::size_t capacity) : mRows(capacity) {}
@@ -82,10 +64,13 @@ private:
         std::atomic<std::size_t> mCount = 0;
     };
 
+    using RowsPtr = std::shared_ptr<Rows>;
+
+    /// Of whoever holds the lock: only that side replaces or adds.
+    Rows& GetRows() const { return **Published<RowsPtr>::Reader(mRows); }
     void Replace(std::size_t capacity, const std::function<bool(const Row&)>& isOut);
 
-    mutable std::atomic<int> mReaders = 0;
-    std::atomic<Rows*> mRows;
+    Published<RowsPtr> mRows;
     std::mutex mChanging; // one at a time
 };
 
