@@ -103,20 +103,20 @@ protected:
     std::set<std::string> mAll;
 };
 
-unsigned int Seed()
+unsigned int RandomStart()
 {
-    const char* const given = std::getenv("ZEB_SEED");
-    const unsigned int seed =
+    const char* const given = std::getenv("ZEB_RANDOM_START");
+    const unsigned int start =
         given != nullptr ? static_cast<unsigned int>(std::stoul(given)) : std::random_device()();
-    std::cout << "ZEB_SEED=" << seed << "\n";
-    return seed;
+    std::cout << "ZEB_RANDOM_START=" << start << "\n";
+    return start;
 }
 
 // The kill falls anywhere between the start of the program and a time at which some plug-ins are done.
 TEST_F(ScanKillTest, FiveHundredKillsLoseNothing)
 {
     const unsigned int kills = Slowness() > 1 ? 60 : 500;
-    std::mt19937 random(Seed());
+    std::mt19937 random(RandomStart());
     std::uniform_int_distribution<int> microseconds(0, static_cast<int>(60000 * Slowness()));
     std::size_t blocksMade = 0;
     std::size_t recordsMade = 0;

@@ -1,12 +1,10 @@
 // The example editor in a real X11 window: what it draws, how it answers the mouse, how it resizes.
+#include "tests/plugins/ChildWindow.h"
 #include "tests/plugins/FixturePaths.h"
 #include "tests/plugins/direct/DirectPlugin.h"
 
 #include <gtest/gtest.h>
 #include <poll.h>
-
-#include <X11/Xlib.h>
-#include <X11/Xutil.h>
 
 namespace
 {
@@ -32,7 +30,7 @@ protected:
         ASSERT_EQ(mView->attached(reinterpret_cast<void*>(mParent), "X11EmbedWindowID"), kResultOk);
         ASSERT_NE(mPlugin.host->eventHandler, nullptr);
         ASSERT_NE(mPlugin.host->timerHandler, nullptr);
-        mChild = FindChild();
+        mChild = FindChildWindow(mDisplay, mParent);
         ASSERT_TRUE(RunUntil([&] { return PixelAt(160, 40) == kKnobColour; }));
     }
 
@@ -48,30 +46,7 @@ protected:
         XCloseDisplay(mDisplay);
     }
 
-    Window FindChild()
-    {
-        Window root = 0;
-        Window parent = 0;
-        Window* children = nullptr;
-        unsigned int count = 0;
-        XQueryTree(mDisplay, mParent, &root, &parent, &children, &count);
-        const Window first = count == 1 ? children[0] : 0;
-        XFree(children);
-        return first;
-    }
-
-    // A window has no pixels before it is on the screen: the plug-in maps it by a connection of its own.
-    unsigned long PixelAt(int x, int y)
-    {
-        XWindowAttributes attributes{};
-        if (XGetWindowAttributes(mDisplay, mChild, &attributes) == 0 || attributes.map_state != IsViewable)
-            return 0;
-        XImage* image = XGetImage(mDisplay, mChild, x, y, 1, 1, AllPlanes, ZPixmap);
-        const unsigned long pixel = image != nullptr ? XGetPixel(image, 0, 0) & 0xffffff : 0;
-        if (image != nullptr)
-            XDestroyImage(image);
-        return pixel;
-    }
+    unsigned long PixelAt(int x, int y) { return WindowPixelAt(mDisplay, mChild, x, y); }
 
     // Serves the view's descriptor and timer as a host's run loop does: events that Xlib has read while it waited for
     // an answer wake no descriptor.
@@ -89,20 +64,7 @@ protected:
         return done();
     }
 
-    void SendMouse(int type, int x, int y)
-    {
-        XEvent event{};
-        event.type = type;
-        event.xbutton.window = mChild;
-        event.xbutton.x = x;
-        event.xbutton.y = y;
-        if (type == MotionNotify)
-            event.xmotion.state = Button1Mask;
-        else
-            event.xbutton.button = Button1;
-        XSendEvent(mDisplay, mChild, False, NoEventMask, &event);
-        XSync(mDisplay, False);
-    }
+    void SendMouse(int type, int x, int y) { SendMouseTo(mDisplay, mChild, type, x, y); }
 
     DirectPlugin mPlugin{EffectBundle("ZebView")};
     Display* mDisplay = nullptr;
@@ -153,7 +115,7 @@ TEST_F(ZebViewInAWindow, EndsAGestureThatClosingCutsShort)
     ASSERT_TRUE(RunUntil([&] { return mPlugin.host->told.size() == 2; }));
     EXPECT_EQ(mView->removed(), kResultOk);
     EXPECT_EQ(mPlugin.host->told.back(), "end 0");
-    EXPECT_EQ(FindChild(), 0U);
+    EXPECT_EQ(FindChildWindow(mDisplay, mParent), 0U);
 }
 
 } // namespace

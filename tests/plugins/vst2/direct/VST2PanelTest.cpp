@@ -1,13 +1,11 @@
 // The editor of ZebPanel2 in a window of an X server.
+#include "tests/plugins/ChildWindow.h"
 #include "tests/plugins/FixturePaths.h"
 #include "tests/plugins/vst2/direct/DirectVST2.h"
 
 #include <chrono>
 #include <gtest/gtest.h>
 #include <thread>
-
-#include <X11/Xlib.h>
-#include <X11/Xutil.h>
 
 namespace
 {
@@ -33,7 +31,7 @@ protected:
         XSync(mDisplay, False);
         // A window ID travels as a pointer.
         ASSERT_EQ(mPlugin.Call(effEditOpen, 0, 0, reinterpret_cast<void*>(mParent)), 1);
-        mChild = FindChild();
+        mChild = FindChildWindow(mDisplay, mParent);
         ASSERT_NE(mChild, 0U);
         ASSERT_TRUE(IdleUntil([&] { return PixelAt(180, 70) == kKnobColour; }));
     }
@@ -53,30 +51,7 @@ protected:
         return rect != nullptr ? *rect : ERect{};
     }
 
-    Window FindChild()
-    {
-        Window root = 0;
-        Window parent = 0;
-        Window* children = nullptr;
-        unsigned int count = 0;
-        XQueryTree(mDisplay, mParent, &root, &parent, &children, &count);
-        const Window first = count == 1 ? children[0] : 0;
-        XFree(children);
-        return first;
-    }
-
-    // A window has no pixels before it is on the screen: the plug-in maps it by a connection of its own.
-    unsigned long PixelAt(int x, int y)
-    {
-        XWindowAttributes attributes{};
-        if (XGetWindowAttributes(mDisplay, mChild, &attributes) == 0 || attributes.map_state != IsViewable)
-            return 0;
-        XImage* image = XGetImage(mDisplay, mChild, x, y, 1, 1, AllPlanes, ZPixmap);
-        const unsigned long pixel = image != nullptr ? XGetPixel(image, 0, 0) & 0xffffff : 0;
-        if (image != nullptr)
-            XDestroyImage(image);
-        return pixel;
-    }
+    unsigned long PixelAt(int x, int y) { return WindowPixelAt(mDisplay, mChild, x, y); }
 
     // Idles at the pace of a host.
     template <class Done>
@@ -91,20 +66,7 @@ protected:
         return done();
     }
 
-    void SendMouse(int type, int x, int y)
-    {
-        XEvent event{};
-        event.type = type;
-        event.xbutton.window = mChild;
-        event.xbutton.x = x;
-        event.xbutton.y = y;
-        if (type == MotionNotify)
-            event.xmotion.state = Button1Mask;
-        else
-            event.xbutton.button = Button1;
-        XSendEvent(mDisplay, mChild, False, NoEventMask, &event);
-        XSync(mDisplay, False);
-    }
+    void SendMouse(int type, int x, int y) { SendMouseTo(mDisplay, mChild, type, x, y); }
 
     DirectVST2 mPlugin{VST2Effect("ZebPanel2")};
     Display* mDisplay = nullptr;
@@ -155,7 +117,7 @@ TEST_F(ZebPanel2InAWindow, EndsAGestureThatClosingCutsShort)
     ASSERT_TRUE(IdleUntil([&] { return mPlugin.told.size() == 2; }));
     mPlugin.Call(effEditClose);
     EXPECT_EQ(mPlugin.told.back(), "end 0");
-    EXPECT_EQ(FindChild(), 0U);
+    EXPECT_EQ(FindChildWindow(mDisplay, mParent), 0U);
     mPlugin.Call(effEditIdle);
 }
 
