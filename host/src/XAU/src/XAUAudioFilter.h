@@ -139,7 +139,8 @@ private:
     void SetHostCallbacks();
     void ListenToUnit();
     void Listen(AudioUnitEventType type, AudioUnitParameterID parameter, const char* call);
-    boost::intrusive_ptr<XAUParameterInfo> FindParameter(int index) const;
+    /// Null for an unknown index; lives as long as the filter. [any]
+    XAUParameterInfo* FindParameter(int index) const;
     void NotifyListeners(AudioUnitParameterID parameter, AudioUnitScope scope) const;
     const AUPreset* GetFactoryPreset(int index) const;
 

@@ -49,6 +49,7 @@ void XAUAudioFilterEditor::Idle()
 {
 }
 
+// Always, while there is a unit to show.
 bool XAUAudioFilterEditor::CanEmbedView() const
 {
     return mInstance != nullptr;

@@ -61,6 +61,16 @@ int CountSteps(float minimum, float maximum)
 
 } // namespace
 
+// Texts that the unit has made for the reader alone are released with the record.
+ParameterRecord::ParameterRecord(AudioUnit instance, AudioUnitScope scope, AudioUnitParameterID id)
+{
+    UInt32 size = sizeof(mInfo);
+    mIsKnown = AudioUnitGetProperty(instance, kAudioUnitProperty_ParameterInfo, scope, id, &mInfo, &size) == noErr;
+    const bool releases = mIsKnown && (mInfo.flags & kAudioUnitParameterFlag_CFNameRelease) != 0;
+    mName.reset(releases && HasName() ? mInfo.cfNameString : nullptr);
+    mUnitName.reset(releases && HasUnitName() ? mInfo.unitName : nullptr);
+}
+
 XAUParameterInfo::XAUParameterInfo(AudioUnit instance, AudioUnitScope scope, AudioUnitParameterID id)
     : mInstance(instance), mScope(scope), mParameterID(id)
 {
@@ -70,14 +80,13 @@ XAUParameterInfo::XAUParameterInfo(AudioUnit instance, AudioUnitScope scope, Aud
 
 void XAUParameterInfo::ReadInfo()
 {
-    AudioUnitParameterInfo info = {};
-    UInt32 size = sizeof(info);
-    if (AudioUnitGetProperty(mInstance, kAudioUnitProperty_ParameterInfo, mScope, mParameterID, &info, &size) !=
-        noErr)
+    const ParameterRecord record(mInstance, mScope, mParameterID);
+    if (!record.IsKnown())
         return;
+    const AudioUnitParameterInfo& info = record.mInfo;
     mMinimum = info.minValue;
     mMaximum = info.maxValue;
-    ReadTexts(info);
+    ReadTexts(record);
     mCanRamp = (info.flags & kAudioUnitParameterFlag_CanRamp) != 0;
     if (info.unit == kAudioUnitParameterUnit_Indexed)
         mStepCount = CountSteps(mMinimum, mMaximum);
@@ -86,16 +95,11 @@ void XAUParameterInfo::ReadInfo()
     mFlags = info.flags;
 }
 
-// Strings that the unit has made for the reader alone are released here.
-void XAUParameterInfo::ReadTexts(const AudioUnitParameterInfo& info)
+void XAUParameterInfo::ReadTexts(const ParameterRecord& record)
 {
-    const bool releases = (info.flags & kAudioUnitParameterFlag_CFNameRelease) != 0;
-    const bool hasName = (info.flags & kAudioUnitParameterFlag_HasCFNameString) != 0;
-    const bool hasUnitName = info.unit == kAudioUnitParameterUnit_CustomUnit;
-    const CFOwner name(releases && hasName ? info.cfNameString : nullptr);
-    const CFOwner unitName(releases && hasUnitName ? info.unitName : nullptr);
-    SetName(hasName ? MACtoZEB(info.cfNameString) : FromAscii(std::data(info.name), std::size(info.name)));
-    SetLabel(hasUnitName ? MACtoZEB(info.unitName) : LabelOf(info.unit));
+    const AudioUnitParameterInfo& info = record.mInfo;
+    SetName(record.HasName() ? MACtoZEB(info.cfNameString) : FromAscii(std::data(info.name), std::size(info.name)));
+    SetLabel(record.HasUnitName() ? MACtoZEB(info.unitName) : LabelOf(info.unit));
 }
 
 float XAUParameterInfo::GetRange() const

@@ -1,11 +1,30 @@
 #pragma once
 
 #include "audiofilter/AudioFilterParameterInfo.h"
+#include "host/src/XAU/src/CFOwner.h"
 
 #include <AudioToolbox/AudioToolbox.h>
 
 namespace zebaudiofilterhost::xau
 {
+
+/// What a unit says of a parameter, with the references on its texts that it hands over; all zero if it says nothing.
+struct ParameterRecord
+{
+    /// [main]
+    ParameterRecord(AudioUnit instance, AudioUnitScope scope, AudioUnitParameterID id);
+
+    bool IsKnown() const { return mIsKnown; }
+    bool HasName() const { return (mInfo.flags & kAudioUnitParameterFlag_HasCFNameString) != 0; }
+    bool HasUnitName() const { return mInfo.unit == kAudioUnitParameterUnit_CustomUnit; }
+
+    AudioUnitParameterInfo mInfo = {};
+
+private:
+    bool mIsKnown;
+    CFOwner mName;
+    CFOwner mUnitName;
+};
 
 /// A unit's description of one of its parameters. Values of the unit are linear in normalised ones. Uses the unit
 /// without owning it, and must not outlive it.
@@ -28,7 +47,7 @@ public:
 
 private:
     void ReadInfo();
-    void ReadTexts(const AudioUnitParameterInfo& info);
+    void ReadTexts(const ParameterRecord& record);
     float GetRange() const;
 
     AudioUnit mInstance;

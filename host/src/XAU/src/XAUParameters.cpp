@@ -67,10 +67,10 @@ int XAUAudioFilter::GetParameterCount() const
     return static_cast<int>(mParameterInfos.size());
 }
 
-boost::intrusive_ptr<XAUParameterInfo> XAUAudioFilter::FindParameter(int index) const
+XAUParameterInfo* XAUAudioFilter::FindParameter(int index) const
 {
     const auto found = mParameterByIndex.find(index);
-    return found == mParameterByIndex.end() ? nullptr : found->second;
+    return found == mParameterByIndex.end() ? nullptr : found->second.get();
 }
 
 void XAUAudioFilter::NotifyListeners(AudioUnitParameterID parameter, AudioUnitScope scope) const
@@ -82,7 +82,7 @@ void XAUAudioFilter::NotifyListeners(AudioUnitParameterID parameter, AudioUnitSc
 
 void XAUAudioFilter::SetParameter(int index, float value)
 {
-    if (const auto info = FindParameter(index))
+    if (const XAUParameterInfo* info = FindParameter(index))
     {
         const OSStatus result = CallGuarded(
             [&]
@@ -98,7 +98,7 @@ void XAUAudioFilter::SetParameter(int index, float value)
 
 float XAUAudioFilter::GetParameter(int index) const
 {
-    const auto info = FindParameter(index);
+    const XAUParameterInfo* info = FindParameter(index);
     if (!info)
         return 0.0F;
     AudioUnitParameterValue value = 0.0F;
@@ -115,7 +115,7 @@ boost::intrusive_ptr<AudioFilterParameterInfo> XAUAudioFilter::GetParameterInfo(
 
 UTF16String XAUAudioFilter::GetParameterString(int index) const
 {
-    const auto info = FindParameter(index);
+    const XAUParameterInfo* info = FindParameter(index);
     return info ? info->GetParameterString(GetParameter(index)) : UTF16String();
 }
 
@@ -127,6 +127,7 @@ void XAUAudioFilter::ListenToUnit()
         mListener = nullptr;
         return;
     }
+    // Deliberately with parameter 0 alone: gestures of other parameters start no editing.
     Listen(kAudioUnitEvent_BeginParameterChangeGesture, 0,
            "AUEventListenerAddEventType(), kAudioUnitEvent_BeginParameterChangeGesture");
     Listen(kAudioUnitEvent_EndParameterChangeGesture, 0,

@@ -3,6 +3,7 @@
 #include "CoreFoundation/CFBase.h"
 
 #include <atomic>
+#include <memory>
 
 namespace zebaudiofilterhost::xau::cf
 {
@@ -58,6 +59,14 @@ inline const Object& ToObject(CFTypeRef object)
 {
     return *static_cast<const Object*>(object);
 }
+
+struct ReleaseObject
+{
+    void operator()(const void* object) const { CFRelease(object); }
+};
+
+/// One reference, released at the end.
+using ObjectPtr = std::unique_ptr<const void, ReleaseObject>;
 
 /// Null unless the object is of that type. Null gives null.
 template <typename T>

@@ -20,12 +20,7 @@ namespace zebaudiofilterhost::xau
 namespace
 {
 
-struct ReleaseObject
-{
-    void operator()(const void* object) const { CFRelease(object); }
-};
-
-using ObjectPtr = std::unique_ptr<const void, ReleaseObject>;
+using cf::ObjectPtr;
 
 constexpr std::u16string_view kBundleExtension = u".component";
 

@@ -3,6 +3,7 @@
 #include "CoreFoundation/CFDictionary.h"
 #include "CoreFoundation/CFNumber.h"
 #include "CoreFoundation/CFString.h"
+#include "host/src/XAU/linux/src/CFObject.h"
 #include "host/src/XAU/linux/src/PropertyListNodes.h"
 
 #include <cstdlib>
@@ -20,13 +21,6 @@ struct FreeBytes
 
 template <typename T>
 using Bytes = std::unique_ptr<T, FreeBytes>;
-
-struct ReleaseObject
-{
-    void operator()(const void* object) const { CFRelease(object); }
-};
-
-using ObjectPtr = std::unique_ptr<const void, ReleaseObject>;
 
 CFTypeRef MakeString(plist_t node)
 {

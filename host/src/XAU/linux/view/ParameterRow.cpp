@@ -37,8 +37,8 @@ ParameterRow::ParameterRow(AudioUnit unit, AudioUnitScope scope, AudioUnitParame
     const boost::intrusive_ptr<XAUParameterInfo> names(new XAUParameterInfo(unit, scope, id));
     mName = ToNarrow(names->GetName());
     mLabel = ToNarrow(names->GetLabel());
-    AudioUnitParameterInfo info = {};
-    ReadInfo(info);
+    const ParameterRecord record(unit, scope, id);
+    const AudioUnitParameterInfo& info = record.mInfo;
     mMinimum = static_cast<double>(info.minValue);
     mMaximum = static_cast<double>(info.maxValue);
     mDefault = static_cast<double>(info.defaultValue);
@@ -48,16 +48,6 @@ ParameterRow::ParameterRow(AudioUnit unit, AudioUnitScope scope, AudioUnitParame
     else if (info.unit == kAudioUnitParameterUnit_Indexed)
         ReadSteps();
     Refresh();
-}
-
-void ParameterRow::ReadInfo(AudioUnitParameterInfo& info) const
-{
-    UInt32 size = sizeof(info);
-    AudioUnitGetProperty(mUnit, kAudioUnitProperty_ParameterInfo, mScope, mID, &info, &size);
-    const bool releases = (info.flags & kAudioUnitParameterFlag_CFNameRelease) != 0;
-    const bool hasName = (info.flags & kAudioUnitParameterFlag_HasCFNameString) != 0;
-    const CFOwner name(releases && hasName ? info.cfNameString : nullptr);
-    const CFOwner unitName(releases && info.unit == kAudioUnitParameterUnit_CustomUnit ? info.unitName : nullptr);
 }
 
 void ParameterRow::ReadSteps()

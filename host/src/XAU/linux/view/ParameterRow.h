@@ -48,7 +48,6 @@ public:
     AudioUnitParameter GetParameter() const { return {mUnit, mID, mScope, 0}; }
 
 private:
-    void ReadInfo(AudioUnitParameterInfo& info) const;
     void ReadSteps();
     std::string ReadText(AudioUnitParameterValue value) const;
     std::string MakeText(double value) const;
