@@ -24,7 +24,6 @@ constexpr std::size_t kTableOffsetAt = 24;
 
 // Kinds of objects.
 constexpr unsigned int kData = 4;
-constexpr unsigned int kAsciiText = 5;
 constexpr unsigned int kWideText = 6;
 constexpr unsigned int kArray = 10;
 constexpr unsigned int kDictionary = 13;
