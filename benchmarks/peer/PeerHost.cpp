@@ -1,1 +1,0 @@
-#include <juce_audio_processors/juce_audio_processors.h>
