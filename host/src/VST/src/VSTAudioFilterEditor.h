@@ -40,7 +40,8 @@ public:
     long long AudioMasterCallback(int opcode, int index, long long value, void* ptr, float opt);
 
 private:
-    struct Size
+    // Aligned as a whole: clang calls a function for an atomic whose type could lie across words.
+    struct alignas(std::int64_t) Size
     {
         std::int32_t mWidth; // in pixels, 0 until the plug-in asks for a size
         std::int32_t mHeight;
