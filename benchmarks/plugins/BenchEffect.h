@@ -11,8 +11,8 @@ namespace effects::bench
 
 using zebaudiofilterhost::benchmarks::BenchSide;
 
-// Stereo, a fixed gain, and parameters that do nothing but keep their values: next to no work, so that what a host
-// adds to it shows. One object, whose IDs are the indices, so that no look-up of its own is measured.
+// Stereo, a turn of the sign, and parameters that do nothing but keep their values: next to no work, so that what a
+// host adds to it shows. One object, whose IDs are the indices, so that no look-up of its own is measured.
 class BenchEffect : public ProcessorPart<Implements<IComponent, IAudioProcessor, IEditController>>, private BenchSide
 {
 public:
