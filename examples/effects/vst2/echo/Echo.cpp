@@ -37,10 +37,12 @@ void Echo::TakeValues()
         SetParameter(i, values[static_cast<std::size_t>(i)]);
 }
 
-void Echo::SetParameter(std::int32_t index, float value)
+// The other way round, ahead of whatever looks at the programs: parameters may be set on the audio thread at any time.
+void Echo::KeepValues()
 {
-    Effect::SetParameter(index, value);
-    mPrograms[static_cast<std::size_t>(mProgram)][static_cast<std::size_t>(index)] = value;
+    EchoValues& values = mPrograms[static_cast<std::size_t>(mProgram)];
+    for (std::int32_t i = 0; i < kEchoParameterCount; ++i)
+        values[static_cast<std::size_t>(i)] = Get(i);
 }
 
 std::string Echo::Display(std::int32_t index) const
@@ -114,12 +116,14 @@ void Echo::SelectProgram(long long program)
 {
     if (program < 0 || program >= static_cast<long long>(mPrograms.size()))
         return;
+    KeepValues();
     mProgram = static_cast<std::int32_t>(program);
     TakeValues();
 }
 
 long long Echo::GetChunk(bool isProgram, void** chunk)
 {
+    KeepValues();
     const std::span<const EchoValues> all(mPrograms);
     mChunk = WriteEchoChunk(isProgram ? all.subspan(static_cast<std::size_t>(mProgram), 1) : all, mProgram);
     *chunk = mChunk.data();
@@ -129,6 +133,7 @@ long long Echo::GetChunk(bool isProgram, void** chunk)
 // A program's chunk goes into the program that is current here, whichever it was taken from.
 long long Echo::SetChunk(bool isProgram, std::span<const std::byte> chunk)
 {
+    KeepValues();
     std::int32_t current = 0;
     const std::span<EchoValues> all(mPrograms);
     const std::span<EchoValues> target = isProgram ? all.subspan(static_cast<std::size_t>(mProgram), 1) : all;

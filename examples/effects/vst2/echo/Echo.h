@@ -19,7 +19,6 @@ protected:
     void Start() override;
     std::string Display(std::int32_t index) const override;
     std::optional<float> Read(std::int32_t index, const std::string& text) const override;
-    void SetParameter(std::int32_t index, float value) override;
     long long Answer(const Call& call) override;
 
 private:
@@ -27,12 +26,13 @@ private:
     long long NameProgram(long long program, void* name) const;
     void SelectProgram(long long program);
     void TakeValues();
+    void KeepValues();
     long long GetChunk(bool isProgram, void** chunk);
     long long SetChunk(bool isProgram, std::span<const std::byte> chunk);
     std::size_t DelayFrames() const;
     long long TailFrames() const;
 
-    std::vector<EchoValues> mPrograms;
+    std::vector<EchoValues> mPrograms; // the main thread's alone; that of the current one lags behind the parameters
     std::int32_t mProgram = 0;
     std::vector<std::byte> mChunk; // what the host was given last; it copies it
     std::array<std::vector<float>, 2> mLines;
