@@ -22,11 +22,13 @@ public:
 protected:
     void Process(const std::vector<Channels>& inputs, const Channels& outputs, UInt32 frames) override
     {
+        const float levelA = GetValue(kLevelA);
+        const float levelB = GetValue(kLevelB);
         for (std::size_t channel = 0; channel < outputs.size(); ++channel)
         {
             for (UInt32 frame = 0; frame < frames; ++frame)
-                outputs[channel][frame] = GetValue(kLevelA) * Sample(inputs[0], channel, frame) +
-                                          GetValue(kLevelB) * Sample(inputs[1], channel, frame);
+                outputs[channel][frame] =
+                    levelA * Sample(inputs[0], channel, frame) + levelB * Sample(inputs[1], channel, frame);
         }
     }
 

@@ -33,9 +33,10 @@ protected:
     void Process(const std::vector<Channels>& /*inputs*/, const Channels& outputs, UInt32 frames) override
     {
         const double step = 2.0 * kPi * static_cast<double>(GetValue(kFrequency)) / GetSampleRate();
+        const float level = GetValue(kLevel);
         for (UInt32 frame = 0; frame < frames; ++frame)
         {
-            const float sample = GetValue(kLevel) * static_cast<float>(std::sin(mPhase));
+            const float sample = level * static_cast<float>(std::sin(mPhase));
             for (float* output : outputs)
                 output[frame] = sample;
             mPhase = std::fmod(mPhase + step, 2.0 * kPi);
