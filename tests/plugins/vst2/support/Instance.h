@@ -6,6 +6,7 @@
 #include "tests/plugins/vst2/support/OwnThread.h"
 
 #include <array>
+#include <atomic>
 #include <string>
 #include <vector>
 
@@ -73,7 +74,7 @@ private:
     audioMasterCallback mHost;
     const Member* mMember;
     std::vector<Values> mPrograms; // one at least
-    std::size_t mProgram = 0;
+    std::atomic<std::size_t> mProgram = 0; // set while audio runs, as values are
     std::vector<char> mChunk;
     std::array<Arrangement, 2> mArrangements;
     bool mIsArranged = false;

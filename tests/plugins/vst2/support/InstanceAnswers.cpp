@@ -33,7 +33,7 @@ long long Instance::AnswerText(const Call& call) const
         return 1;
     default:
     {
-        const std::size_t index = call.opcode == effGetProgramName ? mProgram : static_cast<std::size_t>(call.index);
+        const std::size_t index = call.opcode == effGetProgramName ? mProgram.load() : static_cast<std::size_t>(call.index);
         if (index >= behaviour.programs.size())
             return 0;
         GiveText(call.ptr, behaviour.programs[index], kProgramRoom);
@@ -51,7 +51,7 @@ long long Instance::AnswerState(const Call& call)
             mProgram = static_cast<std::size_t>(call.value);
         return 0;
     case effGetProgram:
-        return static_cast<long long>(mProgram);
+        return static_cast<long long>(mProgram.load());
     case effGetChunk:
         return GetChunk(static_cast<void**>(call.ptr));
     default:

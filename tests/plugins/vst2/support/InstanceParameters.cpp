@@ -1,6 +1,7 @@
 #include "tests/plugins/support/Recorder.h"
 #include "tests/plugins/vst2/support/Instance.h"
 
+#include <atomic>
 #include <cstdio>
 #include <cstring>
 
@@ -36,15 +37,15 @@ void Instance::SetParameterProc(AEffect* effect, std::int32_t index, float value
     fixture::Record("setParameter", index, value);
     ThrowIf(GetInt(Knob::kParameterThrows));
     if (float* place = Of(effect).ValueAt(index))
-        *place = value;
+        std::atomic_ref<float>(*place).store(value, std::memory_order_relaxed);
 }
 
 float Instance::GetParameterProc(AEffect* effect, std::int32_t index)
 {
     fixture::Record("getParameter", index);
     ThrowIf(GetInt(Knob::kParameterThrows));
-    const float* place = Of(effect).ValueAt(index);
-    return place != nullptr ? *place : 0.0F;
+    float* place = Of(effect).ValueAt(index);
+    return place != nullptr ? std::atomic_ref<float>(*place).load(std::memory_order_relaxed) : 0.0F;
 }
 
 long long Instance::AnswerParameter(const Call& call)
