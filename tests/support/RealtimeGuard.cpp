@@ -15,7 +15,7 @@ namespace realtimeguard
 namespace
 {
 
-constexpr std::size_t kKinds = 4;
+constexpr std::size_t kKinds = 6;
 constexpr std::size_t kMaxStacks = 6;
 constexpr int kMaxFrames = 24;
 
@@ -42,7 +42,8 @@ constinit thread_local bool sRecording = false; // The stack walk must not repor
 
 const char* NameOf(Violation violation)
 {
-    constexpr std::array<const char*, kKinds> kNames{"allocation", "free", "lock", "system call"};
+    constexpr std::array<const char*, kKinds> kNames{"allocation",  "free",       "lock",
+                                                     "system call", "page fault", "voluntary switch"};
     return kNames[static_cast<std::size_t>(violation)];
 }
 
@@ -88,6 +89,12 @@ void Record(Violation violation) noexcept
     sCounts[static_cast<std::size_t>(violation)].fetch_add(1, std::memory_order_relaxed);
     KeepStack(violation);
     sRecording = false;
+}
+
+void RecordUsage(Violation violation, long count) noexcept
+{
+    sCounts[static_cast<std::size_t>(violation)].fetch_add(static_cast<unsigned long>(count),
+                                                           std::memory_order_relaxed);
 }
 
 bool IsActive()

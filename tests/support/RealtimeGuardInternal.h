@@ -24,6 +24,9 @@ namespace realtimeguard
 /// Counts a violation if the calling thread is in a section. Safe anywhere: neither allocates nor locks.
 void Record(Violation violation) noexcept;
 
+/// Counts what the kernel has counted on the calling thread.
+void RecordUsage(Violation violation, long count) noexcept;
+
 /// Arms and disarms the net for the system calls of the calling thread.
 void ArmSystemCallTrap() noexcept;
 void DisarmSystemCallTrap() noexcept;

@@ -9,6 +9,7 @@
 #include <dlfcn.h>
 #include <pthread.h>
 #include <semaphore.h>
+#include <threads.h>
 
 // The allocator behind the public names.
 extern "C" void* __libc_malloc(std::size_t size);
@@ -59,6 +60,15 @@ ZEB_INTERPOSE void* realloc(void* block, std::size_t size) noexcept
     return __libc_realloc(block, size);
 }
 
+ZEB_INTERPOSE void* reallocarray(void* block, std::size_t count, std::size_t size) noexcept
+{
+    std::size_t bytes = 0;
+    if (!__builtin_mul_overflow(count, size, &bytes))
+        return realloc(block, bytes);
+    errno = ENOMEM;
+    return nullptr;
+}
+
 ZEB_INTERPOSE void* memalign(std::size_t alignment, std::size_t size) noexcept
 {
     Record(Violation::Allocation);
@@ -99,6 +109,10 @@ ZEB_INTERPOSE_LOCK(pthread_mutex_lock, (pthread_mutex_t * mutex), (mutex), noexc
 ZEB_INTERPOSE_LOCK(pthread_mutex_trylock, (pthread_mutex_t * mutex), (mutex), noexcept)
 ZEB_INTERPOSE_LOCK(pthread_mutex_timedlock, (pthread_mutex_t * mutex, const timespec* until), (mutex, until),
                    noexcept)
+ZEB_INTERPOSE_LOCK(pthread_mutex_clocklock, (pthread_mutex_t * mutex, clockid_t clock, const timespec* until),
+                   (mutex, clock, until), noexcept)
+ZEB_INTERPOSE_LOCK(mtx_lock, (mtx_t * mutex), (mutex), )
+ZEB_INTERPOSE_LOCK(mtx_trylock, (mtx_t * mutex), (mutex), )
 ZEB_INTERPOSE_LOCK(pthread_rwlock_rdlock, (pthread_rwlock_t * lock), (lock), noexcept)
 ZEB_INTERPOSE_LOCK(pthread_rwlock_tryrdlock, (pthread_rwlock_t * lock), (lock), noexcept)
 ZEB_INTERPOSE_LOCK(pthread_rwlock_wrlock, (pthread_rwlock_t * lock), (lock), noexcept)
@@ -110,7 +124,12 @@ ZEB_INTERPOSE_LOCK(pthread_cond_wait, (pthread_cond_t * condition, pthread_mutex
 ZEB_INTERPOSE_LOCK(pthread_cond_timedwait,
                    (pthread_cond_t * condition, pthread_mutex_t* mutex, const timespec* until),
                    (condition, mutex, until), )
+ZEB_INTERPOSE_LOCK(pthread_cond_clockwait,
+                   (pthread_cond_t * condition, pthread_mutex_t* mutex, clockid_t clock, const timespec* until),
+                   (condition, mutex, clock, until), )
 ZEB_INTERPOSE_LOCK(sem_wait, (sem_t * semaphore), (semaphore), )
+ZEB_INTERPOSE_LOCK(sem_trywait, (sem_t * semaphore), (semaphore), noexcept)
+ZEB_INTERPOSE_LOCK(sem_timedwait, (sem_t * semaphore, const timespec* until), (semaphore, until), )
 ZEB_INTERPOSE_LOCK(sem_post, (sem_t * semaphore), (semaphore), noexcept)
 
 #endif

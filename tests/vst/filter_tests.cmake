@@ -8,10 +8,9 @@ set(ZEB_VST_FILTER_TESTS
     VSTProcessingTest.cpp
     VSTTimeInfoTest.cpp)
 
-# Real plug-ins under the guard of the process thread.
+# A plug-in's questions under the guard of the process thread.
 zeb_add_test(vst_process_path_test UP_TO zeb_vst
     SOURCES VSTProcessPathTest.cpp LIBRARIES zeb_realtime_guard)
-zeb_use_vst2_fixtures(vst_process_path_test)
 
 # The fixtures' binaries as filters.
 zeb_add_test(vst_filter_fixtures_test UP_TO zeb_vst
