@@ -3,12 +3,11 @@
 
 #include "foundation/zebcore/Export.h"
 #include "utility/Message.h"
+#include "utility/MessageRing.h"
 
 #include <boost/smart_ptr/intrusive_ptr.hpp>
 
-#include <array>
 #include <atomic>
-#include <cstddef>
 #include <vector>
 
 namespace zebaudiofilterhost
@@ -59,15 +58,9 @@ protected:
 private:
     using MessageList = std::vector<boost::intrusive_ptr<Message>>;
 
-    static constexpr std::size_t kRingSize = 33; // One place stays free, which tells a full ring from an empty one
-    static constexpr std::size_t kCacheLine = 64;
-
-    bool PushToRing(const boost::intrusive_ptr<Message>& message);
     void RunMainStages();
 
-    alignas(kCacheLine) std::atomic<std::size_t> mWriteIndex; // Written by the main thread only
-    alignas(kCacheLine) std::atomic<std::size_t> mReadIndex;  // Written by the consumer only
-    std::array<boost::intrusive_ptr<Message>, kRingSize> mRing;
+    MessageRing mRing;
     MessageList mMessages; // All living messages, in order of posting; main thread only
     std::atomic<bool> mProcessing;
     bool mRunningMainStages = false; // Main thread only

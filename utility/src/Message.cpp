@@ -1,5 +1,7 @@
 #include "utility/Message.h"
 
+#include "utility/src/MemoryOrder.h"
+
 namespace zebaudiofilterhost
 {
 
@@ -23,7 +25,8 @@ Message::State Message::GetState() const
 {
     std::int32_t state = mState.load(std::memory_order_relaxed);
     // A swap with itself reads under a full barrier, which a plain load is not.
-    while (!mState.compare_exchange_weak(state, state, std::memory_order_seq_cst))
+    while (!mState.compare_exchange_weak(
+        state, state, OrderAt(OrderSite::kMessageGetState, std::memory_order_seq_cst), std::memory_order_relaxed))
     {
     }
     return static_cast<State>(state);
@@ -31,7 +34,7 @@ Message::State Message::GetState() const
 
 void Message::SetState(State state)
 {
-    mState.exchange(state, std::memory_order_seq_cst);
+    mState.exchange(state, OrderAt(OrderSite::kMessageSetState, std::memory_order_seq_cst));
 }
 
 } // namespace zebaudiofilterhost

@@ -1,6 +1,7 @@
 #include "utility/ProcessMessageHandler.h"
 
 #include "utility/ThreadUtils.h"
+#include "utility/src/MessageRingAccess.h"
 
 #include <algorithm>
 #include <iterator>
@@ -27,7 +28,7 @@ private:
 
 } // namespace
 
-ProcessMessageHandler::ProcessMessageHandler() : mWriteIndex(0), mReadIndex(0), mProcessing(false)
+ProcessMessageHandler::ProcessMessageHandler() : mProcessing(false)
 {
 }
 
@@ -69,24 +70,12 @@ void ProcessMessageHandler::TransferMessagesToQueue()
         if (message->GetState() != Message::kState_Pending)
             continue;
         message->SetState(Message::kState_Queued); // First, since the consumer may finish it at once
-        if (!PushToRing(message))
+        if (!mRing.Push(message))
         {
             message->SetState(Message::kState_Pending);
             return; // Later messages wait too, so that the order of posting holds
         }
     }
-}
-
-bool ProcessMessageHandler::PushToRing(const boost::intrusive_ptr<Message>& message)
-{
-    const std::size_t write = mWriteIndex.load(std::memory_order_relaxed); // Our own
-    const std::size_t next = (write + 1) % kRingSize;
-    // Acquire: the consumer has emptied the place before it moved the read index on.
-    if (next == mReadIndex.load(std::memory_order_acquire))
-        return false;
-    mRing[write] = message;
-    mWriteIndex.store(next, std::memory_order_release); // Publishes the place
-    return true;
 }
 
 void ProcessMessageHandler::RunMainStages()

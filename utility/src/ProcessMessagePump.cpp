@@ -1,24 +1,15 @@
 // The consumer's side of the ring: runs on the process thread.
 #include "utility/ProcessMessageHandler.h"
-
-#include <utility>
+#include "utility/src/MessageRingAccess.h"
 
 namespace zebaudiofilterhost
 {
 
 void ProcessMessageHandler::PumpFromProcessThread()
 {
-    for (;;)
+    // The message list holds a reference until after this one is gone, so nothing is freed here.
+    while (const boost::intrusive_ptr<Message> message = mRing.Pop())
     {
-        // Read anew each time: while the main thread is the consumer, a message may pump from inside.
-        const std::size_t read = mReadIndex.load(std::memory_order_relaxed); // Our own
-        // Acquire: sees the place that the producer filled before it published the index.
-        if (read == mWriteIndex.load(std::memory_order_acquire))
-            return;
-
-        // The message list holds a reference until after this one is gone, so nothing is freed here.
-        const boost::intrusive_ptr<Message> message = std::move(mRing[read]);
-        mReadIndex.store((read + 1) % kRingSize, std::memory_order_release); // Gives the empty place back
         bool done = true;
         try
         {

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "utility/src/MemoryOrder.h"
+
 #include <atomic>
 #include <memory>
 #include <thread>
@@ -30,10 +32,14 @@ public:
         {
             // Both in the one total order: whoever finds no reader after unlinking a value knows that all later ones
             // load a newer pointer.
-            mReaders.fetch_add(1, std::memory_order_seq_cst);
-            mValue = &published.mCurrent.load(std::memory_order_seq_cst)->value;
+            mReaders.fetch_add(1, OrderAt(OrderSite::kPublishedEnter, std::memory_order_seq_cst));
+            mValue = &published.mCurrent.load(OrderAt(OrderSite::kPublishedLoad, std::memory_order_seq_cst))->value;
         }
-        ~Reader() { mReaders.fetch_sub(1, std::memory_order_seq_cst); }
+        ~Reader()
+        {
+            // Release: what was read here comes before what is done by whoever finds no reader.
+            mReaders.fetch_sub(1, OrderAt(OrderSite::kPublishedLeave, std::memory_order_release));
+        }
         Reader(const Reader&) = delete;
         Reader& operator=(const Reader&) = delete;
 
@@ -48,8 +54,9 @@ public:
     Published() : mCurrent(new Node{T(), nullptr}) {}
     ~Published()
     {
-        Free(mRetired.load(std::memory_order_acquire));
-        Free(mCurrent.load(std::memory_order_acquire));
+        // Acquire: whoever made a value current has retired another after that.
+        Free(mRetired.load(OrderAt(OrderSite::kPublishedDestroy, std::memory_order_acquire)));
+        Free(mCurrent.load(std::memory_order_relaxed));
     }
     Published(const Published&) = delete;
     Published& operator=(const Published&) = delete;
@@ -58,14 +65,16 @@ public:
     void Publish(T value)
     {
         auto* node = new Node{std::move(value), nullptr};
-        Retire(mCurrent.exchange(node, std::memory_order_seq_cst));
+        Retire(mCurrent.exchange(node, OrderAt(OrderSite::kPublishedPublish, std::memory_order_seq_cst)));
     }
 
     /// Destroys what was replaced, unless somebody reads just now: then a later call does. [any but process]
     void FreeRetired()
     {
-        Node* retired = mRetired.exchange(nullptr, std::memory_order_seq_cst);
-        if (mReaders.load(std::memory_order_seq_cst) == 0)
+        // Acquire: these values were unlinked before the readers are counted.
+        Node* retired =
+            mRetired.exchange(nullptr, OrderAt(OrderSite::kPublishedTakeRetired, std::memory_order_acquire));
+        if (mReaders.load(OrderAt(OrderSite::kPublishedAskReaders, std::memory_order_seq_cst)) == 0)
             Free(retired);
         else
             RetireAll(retired);
@@ -75,7 +84,7 @@ public:
     /// meanwhile never lets it return. [any but process]
     void AwaitReaders() const
     {
-        while (mReaders.load(std::memory_order_seq_cst) != 0)
+        while (mReaders.load(OrderAt(OrderSite::kPublishedAwaitReaders, std::memory_order_seq_cst)) != 0)
             std::this_thread::yield();
     }
 
@@ -83,7 +92,10 @@ private:
     void Retire(Node* node)
     {
         node->next = mRetired.load(std::memory_order_relaxed);
-        while (!mRetired.compare_exchange_weak(node->next, node, std::memory_order_seq_cst))
+        // Release: with the value and with what was unlinked. Nobody looks into the next one here.
+        while (!mRetired.compare_exchange_weak(node->next, node,
+                                               OrderAt(OrderSite::kPublishedRetire, std::memory_order_release),
+                                               std::memory_order_relaxed))
         {
         }
     }

@@ -22,7 +22,8 @@ void DirtySet::AddAbove(std::size_t level, std::size_t number)
 {
     // Release at every level: the bit above is not seen before the bit below, nor before what the caller wrote.
     for (; level < mLevels.size(); ++level, number /= kBits)
-        mLevels[level][number / kBits].fetch_or(BitOf(number), std::memory_order_acq_rel);
+        mLevels[level][number / kBits].fetch_or(BitOf(number),
+                                                OrderAt(OrderSite::kDirtySetAdd, std::memory_order_release));
 }
 
 void DirtySet::Remove(std::size_t number)
@@ -30,9 +31,12 @@ void DirtySet::Remove(std::size_t number)
     for (std::size_t level = 0; level < mLevels.size(); ++level, number /= kBits)
     {
         const std::uint64_t bit = BitOf(number);
-        const std::uint64_t others = mLevels[level][number / kBits].fetch_and(~bit, std::memory_order_acq_rel) & ~bit;
+        // Acquire: with a bit, everything that its setter did before, in the word below too.
+        const std::uint64_t others = mLevels[level][number / kBits].fetch_and(
+                                         ~bit, OrderAt(OrderSite::kDirtySetRemove, std::memory_order_acquire)) &
+                                     ~bit;
         // Asked ahead of the others: whoever added below saw the bit still set, or sets it again.
-        const bool addedMeanwhile = level > 0 && mLevels[level - 1][number].load(std::memory_order_acquire) != 0;
+        const bool addedMeanwhile = level > 0 && mLevels[level - 1][number].load(std::memory_order_relaxed) != 0;
         if (addedMeanwhile)
         {
             AddAbove(level, number);

@@ -1,6 +1,7 @@
 #pragma once
 
-#include <array>
+#include "utility/src/MemoryOrder.h"
+
 #include <atomic>
 #include <bit>
 #include <cstddef>
@@ -24,7 +25,8 @@ public:
     /// [any]
     void Add(std::size_t number);
 
-    /// Takes one number out, unless it is added at the same time. Others can be out of sight meanwhile. [any]
+    /// Takes one number out, unless it is added at the same time. Others can be out of sight meanwhile. After that
+    /// the caller sees what came before the additions that were undone. [any]
     void Remove(std::size_t number);
 
     /// False means empty. [any]
@@ -51,8 +53,9 @@ private:
     template <class Visit>
     void TakeWord(std::size_t level, std::size_t index, const Visit& visit)
     {
-        /// Acquire: after a bit is seen, so is everything that its setter did before, in the words below too.
-        std::uint64_t bits = mLevels[level][index].exchange(0, std::memory_order_acq_rel);
+        // Acquire: after a bit is seen, so is everything that its setter did before, in the words below too.
+        std::uint64_t bits =
+            mLevels[level][index].exchange(0, OrderAt(OrderSite::kDirtySetTake, std::memory_order_acquire));
         for (; bits != 0; bits &= bits - 1)
         {
             const std::size_t number = index * kBits + static_cast<std::size_t>(std::countr_zero(bits));

@@ -1,6 +1,7 @@
 #include "host/src/VST3/src/ParameterRing.h"
 
-#include <algorithm>
+#include "utility/src/MemoryOrder.h"
+
 #include <bit>
 
 namespace zebaudiofilterhost::vst3
@@ -25,7 +26,8 @@ void PutIfNewer(std::atomic<std::uint64_t>& place, std::uint64_t ticket, std::ui
     std::uint64_t present = place.load(std::memory_order_relaxed);
     // Release: who reads the change also sees what its writer did before. Each failure is another writer's success.
     while (AgeAgainst(present, ticket) < 0 &&
-           !place.compare_exchange_weak(present, word, std::memory_order_release, std::memory_order_relaxed))
+           !place.compare_exchange_weak(present, word, OrderAt(OrderSite::kParameterPut, std::memory_order_release),
+                                        std::memory_order_relaxed))
     {
     }
 }
@@ -34,7 +36,7 @@ void PutIfNewer(std::atomic<std::uint64_t>& place, std::uint64_t ticket, std::ui
 
 void ParameterRing::Write(const ParameterQueueValue& value)
 {
-    const std::uint64_t ticket = mNextWrite.fetch_add(1, std::memory_order_acq_rel);
+    const std::uint64_t ticket = mNextWrite.fetch_add(1, std::memory_order_relaxed);
     const auto bits = std::bit_cast<std::uint64_t>(value.mValue);
     Words& words = mPlaces[ticket % kCapacity];
     PutIfNewer(words[0], ticket, static_cast<std::uint32_t>(bits >> kTagShift));
@@ -49,7 +51,8 @@ ParameterRing::Place ParameterRing::ReadPlace(std::uint64_t ticket, ParameterQue
     Place place = Place::kComplete;
     for (std::size_t index = 0; index < words.size(); ++index)
     {
-        const std::uint64_t word = words[index].load(std::memory_order_acquire);
+        // Acquire: also sees what the writer did before the change, and that the tickets have moved on.
+        const std::uint64_t word = words[index].load(OrderAt(OrderSite::kParameterTake, std::memory_order_acquire));
         const std::int32_t age = AgeAgainst(word, ticket);
         if (age > 0)
             return Place::kOverwritten;
@@ -65,40 +68,30 @@ ParameterRing::Place ParameterRing::ReadPlace(std::uint64_t ticket, ParameterQue
     return place;
 }
 
-std::uint64_t ParameterRing::OldestKept(std::uint64_t nextRead) const
+bool ParameterRing::ReadFrom(std::uint64_t ticket, ParameterQueueValue& value, std::uint64_t end)
 {
-    return std::max(nextRead, GetEnd() - kCapacity);
-}
-
-bool ParameterRing::Read(ParameterQueueValue& value, std::uint64_t end)
-{
-    std::uint64_t nextRead = mNextRead.load(std::memory_order_acquire);
-    for (;;)
+    for (; ticket < end; ticket = OldestKept())
     {
-        const std::uint64_t ticket = OldestKept(nextRead);
-        if (ticket >= end)
-            return false;
         ParameterQueueValue read;
         const Place place = ReadPlace(ticket, read);
         if (place == Place::kInTheMaking)
             return false;
         // A place that was overwritten means that the oldest kept has moved on by now.
-        if (place == Place::kComplete &&
-            mNextRead.compare_exchange_strong(nextRead, ticket + 1, std::memory_order_acq_rel,
-                                              std::memory_order_acquire))
+        if (place == Place::kComplete)
         {
+            mNextRead.store(ticket + 1, std::memory_order_relaxed);
             value = read;
             return true;
         }
     }
+    return false;
 }
 
 void ParameterRing::Discard()
 {
     const std::uint64_t end = GetEnd();
-    std::uint64_t nextRead = mNextRead.load(std::memory_order_acquire);
-    while (nextRead < end &&
-           !mNextRead.compare_exchange_weak(nextRead, end, std::memory_order_acq_rel, std::memory_order_acquire))
+    std::uint64_t discarded = mDiscarded.load(std::memory_order_relaxed);
+    while (discarded < end && !mDiscarded.compare_exchange_weak(discarded, end, std::memory_order_relaxed))
     {
     }
 }
@@ -106,7 +99,7 @@ void ParameterRing::Discard()
 void ParameterRing::CopyTo(ParameterRing& other) const
 {
     const std::uint64_t end = GetEnd();
-    for (std::uint64_t ticket = OldestKept(mNextRead.load(std::memory_order_acquire)); ticket < end; ++ticket)
+    for (std::uint64_t ticket = OldestKept(); ticket < end; ++ticket)
     {
         ParameterQueueValue value;
         if (ReadPlace(ticket, value) == Place::kComplete)

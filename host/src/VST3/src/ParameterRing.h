@@ -2,6 +2,7 @@
 
 #include "host/src/VST3/src/ParameterQueueValue.h"
 
+#include <algorithm>
 #include <array>
 #include <atomic>
 #include <cstddef>
@@ -10,8 +11,8 @@
 namespace zebaudiofilterhost::vst3
 {
 
-/// The newest kMaxPointsPerParameter changes of one parameter. Any number of writers; who reads may change, and two
-/// who read at once never get the same change. No lock, no allocation, and nobody waits for anybody. [any]
+/// The newest kMaxPointsPerParameter changes of one parameter. Any number of writers, one reader at a time, who may
+/// change. No lock, no allocation, and nobody waits for anybody. [any]
 //
 /// A writer takes a ticket, which fixes the place and the order, and then puts three words into the place, each of
 /// which holds a third of the change and the ticket. A word is only replaced by one with a newer ticket, so a writer
@@ -25,14 +26,20 @@ public:
 
     /// The ticket that the next writer gets: what Read takes as its limit, so that busy writers cannot keep it for
     /// ever.
-    std::uint64_t GetEnd() const { return mNextWrite.load(std::memory_order_acquire); }
+    std::uint64_t GetEnd() const { return mNextWrite.load(std::memory_order_relaxed); }
 
     /// Takes the oldest change out, if it was written before `end`. False, with nothing written, if there is none.
-    bool Read(ParameterQueueValue& value, std::uint64_t end);
+    /// The reader's.
+    bool Read(ParameterQueueValue& value, std::uint64_t end)
+    {
+        const std::uint64_t ticket = OldestKept();
+        return ticket < end && ReadFrom(ticket, value, end);
+    }
 
     /// Changes in the making count.
-    bool IsEmpty() const { return mNextRead.load(std::memory_order_acquire) >= GetEnd(); }
+    bool IsEmpty() const { return GetNextRead() >= GetEnd(); }
 
+    /// Drops what is pending. A change that is being read meanwhile can still be read.
     void Discard();
 
     /// Writes what is pending here to `other`, and leaves it here.
@@ -51,11 +58,19 @@ private:
     using Words = std::array<std::atomic<std::uint64_t>, 3>;
 
     Place ReadPlace(std::uint64_t ticket, ParameterQueueValue& value) const;
-    std::uint64_t OldestKept(std::uint64_t nextRead) const;
+    bool ReadFrom(std::uint64_t ticket, ParameterQueueValue& value, std::uint64_t end);
+
+    std::uint64_t GetNextRead() const
+    {
+        return std::max(mNextRead.load(std::memory_order_relaxed), mDiscarded.load(std::memory_order_relaxed));
+    }
+    std::uint64_t OldestKept() const { return std::max(GetNextRead(), GetEnd() - kCapacity); }
 
     /// Tickets begin after the first round, so that the zeros of a place that was never written count as older.
+    /// Tickets alone say nothing of what is in a place, hence need no order: the words tell.
     std::atomic<std::uint64_t> mNextWrite{kCapacity};
-    std::atomic<std::uint64_t> mNextRead{kCapacity};
+    std::atomic<std::uint64_t> mNextRead{kCapacity};  // written by the reader only
+    std::atomic<std::uint64_t> mDiscarded{kCapacity}; // tickets below it are not read any more
     std::array<Words, kCapacity> mPlaces{};
 };
 
