@@ -4,7 +4,11 @@
 
 #include <gmock/gmock.h>
 
+#include <array>
 #include <atomic>
+#include <chrono>
+#include <memory>
+#include <stdexcept>
 #include <thread>
 
 namespace zebaudiofilterhost::xau
@@ -46,6 +50,8 @@ public:
         ear.mHeard.push_back(event->mEventType == kAudioUnitEvent_ParameterValueChange          ? id + "=" + number
                              : event->mEventType == kAudioUnitEvent_BeginParameterChangeGesture ? "begin " + id
                                                                                                 : "end " + id);
+        if (ear.mThrows)
+            throw std::runtime_error("callback");
         if (ear.mDisposesOfItself)
             ear.Dispose();
     }
@@ -53,6 +59,7 @@ public:
     AUEventListenerRef mListener = nullptr;
     std::vector<std::string> mHeard;
     bool mDisposesOfItself = false;
+    bool mThrows = false;
     std::thread::id mThread;
 };
 
@@ -184,21 +191,144 @@ TEST_F(ListenersTest, AListenerMayGoInItsCallback)
     EXPECT_THAT(other.mHeard, testing::ElementsAre("1=3", "1=4", "1=5"));
 }
 
-TEST_F(ListenersTest, WhatIsLostInAFloodIsHeardByItsLastValue)
+// Far more than the queues hold.
+TEST_F(ListenersTest, InAFloodNoGestureIsLostNorTheLastValueOfAnyParameter)
 {
-    Ear ear;
-    ear.Listen(Change(1));
-    ear.Listen(Change(2));
-    for (int round = 0; round < 5000; ++round)
+    constexpr int kFlood = 5000;
+    Ear ear(0.0F);
+    for (const AudioUnitParameterID id : {1U, 2U})
+    {
+        ear.Listen(Change(id));
+        ear.Listen(Begin(id));
+        ear.Listen(End(id));
+    }
+    for (int round = 0; round < kFlood; ++round)
+        Set(1, static_cast<Float32>(round % 7));
+    Notify(Begin(1));
+    for (int round = 0; round < kFlood; ++round)
         Set(1, static_cast<Float32>(round % 7));
     Set(2, 8.0F);
     Set(1, 9.0F);
+    Notify(End(1));
+    for (int round = 0; round < kFlood; ++round)
+    {
+        Notify(Begin(2));
+        Notify(End(2));
+    }
     mClock.Pass(kInterval);
-    ASSERT_FALSE(ear.mHeard.empty());
-    EXPECT_THAT(ear.mHeard, testing::Contains("2=8"));
-    EXPECT_EQ(*std::find_if(ear.mHeard.rbegin(), ear.mHeard.rend(),
-                            [](const std::string& heard) { return heard[0] == '1'; }),
-              "1=9");
+    const auto count = [&](const char* what)
+    {
+        return std::count(ear.mHeard.begin(), ear.mHeard.end(), what);
+    };
+    EXPECT_EQ(count("begin 1"), 1);
+    EXPECT_EQ(count("end 1"), 1);
+    EXPECT_EQ(count("begin 2"), kFlood);
+    EXPECT_EQ(count("end 2"), kFlood);
+    EXPECT_EQ(count("2=8"), 1);
+    EXPECT_EQ(ear.mHeard.back(), "end 2");
+    const auto begin = std::find(ear.mHeard.begin(), ear.mHeard.end(), "begin 1");
+    const auto end = std::find(begin, ear.mHeard.end(), "end 1");
+    EXPECT_NE(std::find(begin, end, "1=9"), end) << "the last value belongs into its gesture";
+    const std::size_t heard = ear.mHeard.size();
+    mClock.Pass(kInterval);
+    EXPECT_EQ(ear.mHeard.size(), heard) << "nothing is heard twice";
+}
+
+TEST_F(ListenersTest, WhatIsLeftWhenACallbackThrowsIsHeardLater)
+{
+    Ear ear(0.0F);
+    ear.Listen(Change(1));
+    ear.mThrows = true;
+    Set(1, 3.0F);
+    Set(1, 4.0F);
+    EXPECT_THROW(mClock.Pass(kInterval), std::runtime_error);
+    ear.mThrows = false;
+    mClock.Pass(kInterval);
+    EXPECT_THAT(ear.mHeard, testing::ElementsAre("1=3", "1=4"));
+}
+
+TEST_F(ListenersTest, AUnitMayGoBeforeItsListeners)
+{
+    FakeUnit other;
+    other.SetParameters({1}, 0.0F, 10.0F);
+    AudioUnit gone = nullptr;
+    ASSERT_EQ(AudioComponentInstanceNew(other.GetComponent(), &gone), noErr);
+    Ear ear;
+    AudioUnitEvent event = Change(1);
+    ear.Listen(event);
+    event.mArgument.mParameter.mAudioUnit = gone;
+    ear.Listen(event);
+    Notify(event);
+    const AudioUnitParameter all = {gone, kAUParameterListener_AnyParameter, kAudioUnitScope_Global, 0};
+    EXPECT_EQ(AUParameterListenerNotify(nullptr, nullptr, &all), noErr);
+    AudioComponentInstanceDispose(gone);
+    other.mThrowsIn = {"get parameter"};
+    Set(1, 3.0F);
+    mClock.Pass(kInterval);
+    EXPECT_THAT(ear.mHeard, testing::ElementsAre("1=3")) << "the unit that is there";
+
+    // Another one, which may lie where the first one lay.
+    ASSERT_EQ(AudioComponentInstanceNew(other.GetComponent(), &gone), noErr);
+    event.mArgument.mParameter.mAudioUnit = gone;
+    Notify(event);
+    mClock.Pass(kInterval);
+    EXPECT_EQ(ear.mHeard.size(), 1U) << "nobody listens to it";
+    ear.Listen(event);
+    other.mThrowsIn.clear();
+    Notify(event);
+    mClock.Pass(kInterval);
+    EXPECT_THAT(ear.mHeard, testing::ElementsAre("1=3", "1=0"));
+    AudioComponentInstanceDispose(gone);
+    mClock.Pass(kInterval);
+    ear.Dispose();
+}
+
+// Nanoseconds of one call, among units that are listened to in so many parameters.
+class ListenersCostTest : public ListenersTest
+{
+protected:
+    struct Cost
+    {
+        double add;
+        double tell;
+    };
+
+    Cost Measure(AudioUnitParameterID parameters)
+    {
+        Ear ear;
+        Cost cost = {};
+        cost.add = Time(parameters, [&](AudioUnitParameterID id) { ear.Listen(Change(id)); });
+        mClock.Pass(kInterval);
+        cost.tell = Time(1000, [&](AudioUnitParameterID) { Notify(Change(1)); });
+        return cost;
+    }
+
+    template <typename Call>
+    static double Time(AudioUnitParameterID rounds, const Call& call)
+    {
+        const auto start = std::chrono::steady_clock::now();
+        for (AudioUnitParameterID round = 0; round < rounds; ++round)
+            call(round);
+        return std::chrono::duration<double, std::nano>(std::chrono::steady_clock::now() - start).count() / rounds;
+    }
+};
+
+// A look at every row would make the large ones a hundred times as expensive and more.
+TEST_F(ListenersCostTest, ListeningAndTellingDoNotGetExpensiveWithManyParameters)
+{
+    constexpr double kMost = 25.0;
+    constexpr int kTries = 5; // somebody else may be busy
+    Cost ratio = {};
+    for (int round = 0; round < kTries; ++round)
+    {
+        const Cost few = Measure(128);
+        const Cost many = Measure(32768);
+        ratio = {many.add / few.add, many.tell / few.tell};
+        if (ratio.add < kMost && ratio.tell < kMost)
+            break;
+    }
+    EXPECT_LT(ratio.add, kMost);
+    EXPECT_LT(ratio.tell, kMost);
 }
 
 TEST_F(ListenersTest, ChangesOfOtherThreadsAreHeardOnTheListenersOwn)
@@ -229,54 +359,81 @@ TEST_F(ListenersTest, AForeignThreadHearsInItsOwnLoop)
 }
 
 // Rows come and go on one thread while others tell of changes: nobody may see a row that has gone.
-TEST(ListenerTable, ReadersSeeWholeRowsOfListenersThatAreThere)
+class ListenerTableTest : public testing::Test
 {
-    constexpr int kRounds = 2000;
-    ListenerTable table;
-    std::array<std::atomic<bool>, 4> isThere = {};
-    std::atomic<bool> isOver = false;
-    std::atomic<long> wrong = 0;
-    std::atomic<long> seen = 0;
-    const auto listenerOf = [&](std::size_t index)
+protected:
+    static constexpr std::size_t kThings = 40; // more than the first array holds
+
+    struct Slot
     {
-        return reinterpret_cast<AUListenerBase*>(&isThere[index]);
+        std::unique_ptr<ListenerRow> mRow;
+        std::atomic<bool> mIsThere = false;
     };
-    const auto read = [&]
+
+    static AudioUnitEvent EventOf(std::size_t thing)
     {
-        while (!isOver)
+        AudioUnitEvent event = {};
+        event.mArgument.mParameter.mParameterID = static_cast<AudioUnitParameterID>(thing);
+        return event;
+    }
+
+    void Read()
+    {
+        const auto look = [this](const ListenerRow& row)
         {
-            table.ForEach(
-                [&](const ListenerTable::Row& row)
-                {
-                    ++seen;
-                    if (row.mInterest.mObject != row.mListener ||
-                        !*reinterpret_cast<const std::atomic<bool>*>(row.mListener))
-                        ++wrong;
-                });
+            ++mSeen;
+            if (!static_cast<const Slot*>(row.mObject)->mIsThere)
+                ++mWrong;
+        };
+        for (std::size_t thing = 0; !mIsOver; thing = (thing + 1) % kThings)
+        {
+            mTable->ForEach(EventOf(thing), look);
+            if (thing == 0)
+                mTable->ForEach(look);
             std::this_thread::yield(); // Remove waits for a moment without readers
         }
-    };
-    std::thread first(read);
-    std::thread second(read);
-    for (int round = 0; round < kRounds || seen == 0; ++round)
-    {
-        const std::size_t index = static_cast<std::size_t>(round) % isThere.size();
-        isThere[index] = true;
-        for (int row = 0; row < 10; ++row) // more than the first array holds
-            table.Append(listenerOf(index), {{}, listenerOf(index)});
-        if (round % 3 == 0)
-            continue;
-        const std::size_t out = static_cast<std::size_t>(round / 2) % isThere.size();
-        table.Remove([&](const ListenerTable::Row& row) { return row.mListener == listenerOf(out); });
-        isThere[out] = false;
-        std::size_t left = 0;
-        table.ForEach([&](const ListenerTable::Row& row) { left += row.mListener == listenerOf(out) ? 1U : 0U; });
-        ASSERT_EQ(left, 0U);
     }
-    isOver = true;
+
+    void Toggle(std::size_t thing)
+    {
+        Slot& slot = mSlots[thing];
+        if (!slot.mRow)
+        {
+            slot.mIsThere = true;
+            slot.mRow = std::make_unique<ListenerRow>(nullptr, EventOf(thing), &slot, nullptr);
+            mTable->Append(*slot.mRow);
+            return;
+        }
+        ListenerRow* const row = slot.mRow.get();
+        mTable->Remove({&row, 1});
+        slot.mIsThere = false;
+        slot.mRow.reset();
+    }
+
+    std::shared_ptr<ListenerTable> mTable = std::make_shared<ListenerTable>();
+    std::array<Slot, kThings> mSlots;
+    std::atomic<bool> mIsOver = false;
+    std::atomic<long> mWrong = 0;
+    std::atomic<long> mSeen = 0;
+};
+
+TEST_F(ListenerTableTest, ReadersSeeRowsThatAreThere)
+{
+    constexpr int kRounds = 4000;
+    std::thread first([this] { Read(); });
+    std::thread second([this] { Read(); });
+    for (int round = 0; round < kRounds || mSeen == 0; ++round)
+        Toggle(static_cast<std::size_t>(round * 7 + round / 3) % kThings);
+    mIsOver = true;
     first.join();
     second.join();
-    EXPECT_EQ(wrong, 0);
+    EXPECT_EQ(mWrong, 0);
+    for (std::size_t thing = 0; thing < kThings; ++thing)
+    {
+        int count = 0;
+        mTable->ForEach(EventOf(thing), [&](const ListenerRow&) { ++count; });
+        EXPECT_EQ(count, mSlots[thing].mRow ? 1 : 0) << thing;
+    }
 }
 
 } // namespace

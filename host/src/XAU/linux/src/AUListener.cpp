@@ -1,13 +1,38 @@
 #include "host/src/XAU/linux/src/AUListener.h"
 
+#include "foundation/zebcore/HighPrecisionTime.h"
+
 #include <algorithm>
+#include <map>
+#include <utility>
 
 using namespace zebaudiofilterhost::xau;
+using zebcore::utility::HighPrecisionTime;
 
 namespace
 {
 
 constexpr std::chrono::milliseconds kShortestInterval(1);
+
+// 0 if the unit does not tell, or has gone.
+AudioUnitParameterValue ReadValue(const ListenerRow& row)
+{
+    const AudioUnitParameter& parameter = row.mEvent.mArgument.mParameter;
+    AudioUnitParameterValue value = 0.0F;
+    row.mTable->WhileOpen(
+        [&]
+        {
+            try
+            {
+                AudioUnitGetParameter(parameter.mAudioUnit, parameter.mParameterID, parameter.mScope,
+                                      parameter.mElement, &value);
+            }
+            catch (...) // of the unit's: whoever hears of the change asks for the value, or takes this one
+            {
+            }
+        });
+    return value;
+}
 
 } // namespace
 
@@ -27,66 +52,145 @@ AUListenerBase::~AUListenerBase()
 {
     mLoop->RemoveTimer(mTimer);
     *mIsAlive = false;
+    std::map<TablePtr, std::vector<Row*>> rows;
+    for (const RowPtr& row : mRows)
+        rows[row->mTable].push_back(row.get());
+    for (const auto& [table, ofTable] : rows)
+        table->Remove(ofTable);
 }
 
-void AUListenerBase::Tell(const Told& told)
+AUListenerBase::Row* AUListenerBase::Find(const AudioUnitEvent& event, const void* object,
+                                          const TablePtr& table) const
 {
-    if (!mTold.bounded_push(told))
-        mHasLost.store(true, std::memory_order_relaxed); // read again at the next pass, whenever that is
+    Row* found = nullptr;
+    table->ForEach(event,
+                   [&](Row& row)
+                   {
+                       if (row.mListener == this && row.mObject == object)
+                           found = &row;
+                   });
+    return found;
 }
 
-std::vector<Told> AUListenerBase::Collect()
+void AUListenerBase::Add(const AudioUnitEvent& event, void* object, const TablePtr& table)
 {
-    std::vector<Told> batch;
-    mTold.consume_all([&](const Told& told) { batch.push_back(told); });
-    if (mHasLost.exchange(false, std::memory_order_relaxed))
-        AddLost(batch);
+    if (Find(event, object, table))
+        return;
+    const RowPtr row = std::make_shared<Row>(this, event, object, table);
+    mRows.insert(row);
+    table->Append(*row);
+}
+
+void AUListenerBase::Remove(const AudioUnitEvent& event, void* object, const TablePtr& table)
+{
+    Row* const row = Find(event, object, table);
+    if (!row)
+        return;
+    table->Remove({&row, 1});
+    row->mIsWanted = false;
+    mRemoved.push_back(row->shared_from_this());
+    mRows.erase(mRemoved.back());
+}
+
+void AUListenerBase::Tell(Row& row, UInt64 hostTime, AudioUnitParameterValue value)
+{
+    const bool isValue = IsValueChange(row.mEvent);
+    const UInt64 number = mNumber.fetch_add(1, std::memory_order_relaxed); // only to be compared
+    if ((isValue ? mValues : mOthers).bounded_push({&row, number, hostTime, value}))
+        return;
+    row.mLastLeftOut.store(number, std::memory_order_relaxed);
+    row.mLeftOut.fetch_add(1, std::memory_order_relaxed);
+    mHasLeftOut.store(true, std::memory_order_release); // with the two above
+}
+
+void AUListenerBase::TellToRead(Row& row)
+{
+    row.mLastLeftOut.store(mNumber.fetch_add(1, std::memory_order_relaxed), std::memory_order_relaxed);
+    row.mLeftOut.fetch_add(1, std::memory_order_relaxed);
+    mHasLeftOut.store(true, std::memory_order_release); // with the two above
+}
+
+std::vector<AUListenerBase::Heard> AUListenerBase::Collect()
+{
+    const std::vector<RowPtr> removed = std::exchange(mRemoved, {}); // until nothing of theirs waits any more
+    if (mHasLostUnit.exchange(false, std::memory_order_acquire))
+        DropLostUnits();
+    std::vector<Heard> batch;
+    const auto take = [&batch](const Told& told)
+    {
+        batch.push_back({told.mRow->shared_from_this(), told.mNumber, told.mHostTime, told.mValue, 1});
+    };
+    mValues.consume_all(take);
+    mOthers.consume_all(take);
+    if (mHasLeftOut.exchange(false, std::memory_order_acquire))
+        AddLeftOut(batch);
+    std::sort(batch.begin(), batch.end(), [](const Heard& a, const Heard& b) { return a.mNumber < b.mNumber; });
     return batch;
 }
 
-// What was lost may have been about anything: all values are heard once more.
-void AUListenerBase::AddLost(std::vector<Told>& batch) const
+// Something of them may wait yet.
+void AUListenerBase::DropLostUnits()
 {
-    for (const Interest& interest : mInterests)
+    std::erase_if(mRows,
+                  [this](const RowPtr& row)
+                  {
+                      if (row->mTable->IsClosed())
+                          mRemoved.push_back(row);
+                      return row->mTable->IsClosed();
+                  });
+}
+
+void AUListenerBase::AddLeftOut(std::vector<Heard>& batch) const
+{
+    const UInt64 now = HighPrecisionTime::ConvertToNanos(HighPrecisionTime::GetCurrentTime());
+    for (const RowPtr& row : mRows)
     {
-        if (interest.mEvent.mEventType != kAudioUnitEvent_ParameterValueChange)
+        const UInt32 count = row->mLeftOut.exchange(0, std::memory_order_relaxed);
+        const UInt64 number = row->mLastLeftOut.load(std::memory_order_relaxed);
+        if (count == 0)
             continue;
-        const AudioUnitParameter& parameter = interest.mEvent.mArgument.mParameter;
-        Told told{interest, batch.empty() ? 0 : batch.back().mHostTime, 0};
-        if (AudioUnitGetParameter(parameter.mAudioUnit, parameter.mParameterID, parameter.mScope, parameter.mElement,
-                                  &told.mValue) == noErr)
-            batch.push_back(told);
+        if (IsValueChange(row->mEvent))
+            batch.push_back({row, number, now, ReadValue(*row), 1});
+        else
+            batch.push_back({row, number, now, 0.0F, count});
     }
 }
 
-bool AUListenerBase::IsSuperseded(const std::vector<Told>& batch, std::size_t index) const
+// A value that another one follows within the granularity, and without a gesture between them: what was changed
+// before a gesture begins or ends is heard before it.
+void AUListenerBase::DropSuperseded(std::vector<Heard>& batch)
 {
-    const Told& told = batch[index];
-    if (told.mInterest.mEvent.mEventType != kAudioUnitEvent_ParameterValueChange)
-        return false;
-    for (std::size_t later = index + 1; later < batch.size(); ++later)
+    ++mPart;
+    for (auto heard = batch.rbegin(); heard != batch.rend(); ++heard)
     {
-        const Told& next = batch[later];
-        if (next.mInterest.mEvent.mEventType != kAudioUnitEvent_ParameterValueChange)
-            return false; // a gesture begins or ends: what was changed before it is heard before it
-        if (next.mInterest == told.mInterest)
-            return std::chrono::nanoseconds(next.mHostTime - told.mHostTime) < mGranularity;
+        Row& row = *heard->mRow;
+        if (!IsValueChange(row.mEvent))
+        {
+            ++mPart;
+            continue;
+        }
+        const std::chrono::nanoseconds distance(row.mHeardTime - heard->mHostTime);
+        if (row.mHeardPart == mPart && distance < mGranularity)
+            heard->mTimes = 0;
+        row.mHeardPart = mPart;
+        row.mHeardTime = heard->mHostTime;
     }
-    return false;
 }
 
 void AUListenerBase::Deliver()
 {
-    const std::vector<Told> batch = Collect();
+    std::vector<Heard> batch = Collect();
+    DropSuperseded(batch);
+    mHeard.insert(mHeard.end(), batch.begin(), batch.end());
     const std::shared_ptr<bool> isAlive = mIsAlive;
-    for (std::size_t index = 0; index < batch.size(); ++index)
+    while (*isAlive && !mHeard.empty())
     {
-        const Told& told = batch[index];
-        const bool isWanted = std::find(mInterests.begin(), mInterests.end(), told.mInterest) != mInterests.end();
-        if (!isWanted || IsSuperseded(batch, index))
-            continue;
-        mProc(mUserData, told.mInterest.mObject, &told.mInterest.mEvent, told.mHostTime, told.mValue);
-        if (!*isAlive)
-            return;
+        const Heard heard = mHeard.front();
+        if (heard.mTimes > 1)
+            --mHeard.front().mTimes;
+        else
+            mHeard.pop_front();
+        if (heard.mTimes > 0 && heard.mRow->mIsWanted && !heard.mRow->mTable->IsClosed())
+            mProc(mUserData, heard.mRow->mObject, &heard.mRow->mEvent, heard.mHostTime, heard.mValue);
     }
 }

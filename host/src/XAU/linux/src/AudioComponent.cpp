@@ -106,6 +106,7 @@ OSStatus AudioComponentInstanceDispose(AudioComponentInstance instance)
     if (!instance)
         return kAudio_ParamError;
     const std::unique_ptr<ComponentInstanceRecord> owner(instance);
+    instance->mListeners->Close(); // first: listeners of other threads ask the unit for values
     return instance->mUnit->Close ? instance->mUnit->Close(instance->mUnit) : noErr;
 }
 

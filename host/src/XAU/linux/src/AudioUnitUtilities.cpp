@@ -4,9 +4,7 @@
 #include "host/src/XAU/linux/src/AUListener.h"
 #include "host/src/XAU/linux/src/ComponentInstance.h"
 
-#include <algorithm>
 #include <memory>
-#include <set>
 
 using namespace zebaudiofilterhost::xau;
 using zebcore::utility::HighPrecisionTime;
@@ -14,35 +12,28 @@ using zebcore::utility::HighPrecisionTime;
 namespace
 {
 
-using Row = ListenerTable::Row;
-
-ListenerTable* FindTable(const AudioUnitEvent& event)
+// Null for an event without a unit.
+const std::shared_ptr<ListenerTable>* FindTable(const AudioUnitEvent* event)
 {
-    AudioUnit const unit = event.mArgument.mParameter.mAudioUnit;
+    AudioUnit const unit = event ? event->mArgument.mParameter.mAudioUnit : nullptr;
     return unit ? &unit->mListeners : nullptr;
 }
 
-bool IsSender(const Row& row, AUEventListenerRef sender, const void* sendingObject)
+bool IsSender(const ListenerRow& row, AUEventListenerRef sender, const void* sendingObject)
 {
-    return sender != nullptr && row.mListener == sender &&
-           (sendingObject == nullptr || row.mInterest.mObject == sendingObject);
+    return sender != nullptr && row.mListener == sender && (sendingObject == nullptr || row.mObject == sendingObject);
 }
 
-bool Concerns(const Interest& interest, const AudioUnitEvent& event)
+bool IsOfAllParameters(const AudioUnitEvent& event)
 {
-    const AudioUnitParameter& told = event.mArgument.mParameter;
-    if (event.mEventType == kAudioUnitEvent_ParameterValueChange &&
-        told.mParameterID == kAUParameterListener_AnyParameter)
-        return interest.mEvent.mEventType == event.mEventType &&
-               interest.mEvent.mArgument.mParameter.mAudioUnit == told.mAudioUnit;
-    return IsSameEvent(interest.mEvent, event);
+    return IsValueChange(event) && event.mArgument.mParameter.mParameterID == kAUParameterListener_AnyParameter;
 }
 
 AudioUnitParameterValue ReadValue(const AudioUnitEvent& event)
 {
     AudioUnitParameterValue value = 0;
     const AudioUnitParameter& parameter = event.mArgument.mParameter;
-    if (event.mEventType == kAudioUnitEvent_ParameterValueChange)
+    if (IsValueChange(event))
         AudioUnitGetParameter(parameter.mAudioUnit, parameter.mParameterID, parameter.mScope, parameter.mElement,
                               &value);
     return value;
@@ -64,26 +55,19 @@ OSStatus AUEventListenerCreate(AUEventListenerProc proc, void* userData, CFRunLo
 
 OSStatus AUEventListenerAddEventType(AUEventListenerRef listener, void* object, const AudioUnitEvent* event)
 {
-    ListenerTable* table = listener && event ? FindTable(*event) : nullptr;
-    if (!table)
+    const auto* table = FindTable(event);
+    if (!listener || !table)
         return kAudio_ParamError;
-    const Interest interest{*event, object};
-    auto& interests = listener->mInterests;
-    if (std::find(interests.begin(), interests.end(), interest) != interests.end())
-        return noErr;
-    interests.push_back(interest);
-    table->Append(listener, interest);
+    listener->Add(*event, object, *table);
     return noErr;
 }
 
 OSStatus AUEventListenerRemoveEventType(AUEventListenerRef listener, void* object, const AudioUnitEvent* event)
 {
-    ListenerTable* table = listener && event ? FindTable(*event) : nullptr;
-    if (!table)
+    const auto* table = FindTable(event);
+    if (!listener || !table)
         return kAudio_ParamError;
-    const Interest interest{*event, object};
-    if (std::erase(listener->mInterests, interest) > 0)
-        table->Remove([&](const Row& row) { return row.mListener == listener && row.mInterest == interest; });
+    listener->Remove(*event, object, *table);
     return noErr;
 }
 
@@ -92,26 +76,41 @@ OSStatus AUListenerDispose(AUParameterListenerRef listener)
     if (!listener)
         return kAudio_ParamError;
     const std::unique_ptr<AUListenerBase> owner(listener);
-    std::set<ListenerTable*> tables;
-    for (const Interest& interest : listener->mInterests)
-        tables.insert(FindTable(interest.mEvent));
-    for (ListenerTable* table : tables)
-        table->Remove([listener](const Row& row) { return row.mListener == listener; });
     return noErr;
 }
 
 OSStatus AUEventListenerNotify(AUEventListenerRef sender, void* sendingObject, const AudioUnitEvent* event)
 {
-    ListenerTable* table = event ? FindTable(*event) : nullptr;
+    const auto* table = FindTable(event);
     if (!table)
         return kAudio_ParamError;
+    if (IsOfAllParameters(*event))
+    {
+        (*table)->ForEach(
+            [&](ListenerRow& row)
+            {
+                if (IsValueChange(row.mEvent) && !IsSender(row, sender, sendingObject))
+                    row.mListener->TellToRead(row);
+            });
+        return noErr;
+    }
+    bool isHeard = false;
+    const auto isOther = [&](const ListenerRow& row)
+    {
+        return !IsSender(row, sender, sendingObject);
+    };
+    (*table)->ForEach(*event, [&](const ListenerRow& row) { isHeard = isHeard || isOther(row); });
+    if (!isHeard)
+        return noErr;
+    // Not while the rows are read: whoever takes some out waits for the unit then.
+    const AudioUnitParameterValue value = ReadValue(*event);
     const UInt64 now = HighPrecisionTime::ConvertToNanos(HighPrecisionTime::GetCurrentTime());
-    table->ForEach(
-        [&](const Row& row)
-        {
-            if (!IsSender(row, sender, sendingObject) && Concerns(row.mInterest, *event))
-                row.mListener->Tell({row.mInterest, now, ReadValue(row.mInterest.mEvent)});
-        });
+    (*table)->ForEach(*event,
+                      [&](ListenerRow& row)
+                      {
+                          if (isOther(row))
+                              row.mListener->Tell(row, now, value);
+                      });
     return noErr;
 }
 

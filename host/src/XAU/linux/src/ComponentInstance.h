@@ -5,6 +5,7 @@
 
 #include <array>
 #include <cstddef>
+#include <memory>
 
 /// An open unit with its functions, which are looked up once.
 struct ComponentInstanceRecord
@@ -20,5 +21,7 @@ struct ComponentInstanceRecord
     AudioComponent mComponent;
     AudioComponentPlugInInterface* mUnit;
     std::array<AudioComponentMethod, kSelectorCount> mMethods = {};
-    zebaudiofilterhost::xau::ListenerTable mListeners;
+    /// Listeners keep it, who may be disposed of after the unit.
+    std::shared_ptr<zebaudiofilterhost::xau::ListenerTable> mListeners =
+        std::make_shared<zebaudiofilterhost::xau::ListenerTable>();
 };

@@ -1,6 +1,11 @@
 #include "host/src/XAU/linux/src/ListenerTable.h"
 
-#include <memory>
+#include "host/src/XAU/linux/src/AUListener.h"
+
+#include <boost/container_hash/hash.hpp>
+
+#include <algorithm>
+#include <bit>
 #include <utility>
 
 namespace zebaudiofilterhost::xau
@@ -22,47 +27,85 @@ bool IsSameEvent(const AudioUnitEvent& a, const AudioUnitEvent& b)
            one.mParameterID == other.mParameterID && one.mScope == other.mScope && one.mElement == other.mElement;
 }
 
-bool Interest::operator==(const Interest& other) const
+ListenerTable::Cells::Cells(std::size_t capacity) : mCells(capacity), mBuckets(capacity)
 {
-    return mObject == other.mObject && IsSameEvent(mEvent, other.mEvent);
+}
+
+std::size_t ListenerTable::Cells::BucketOf(const AudioUnitEvent& event) const
+{
+    const AudioUnitParameter& thing = event.mArgument.mParameter;
+    std::size_t hash = event.mEventType;
+    boost::hash_combine(hash, thing.mParameterID);
+    boost::hash_combine(hash, thing.mScope);
+    boost::hash_combine(hash, thing.mElement);
+    return hash & (mBuckets.size() - 1);
+}
+
+void ListenerTable::Cells::Append(ListenerRow& row)
+{
+    const std::size_t index = mCount.load(std::memory_order_relaxed);
+    std::atomic<std::uint32_t>& bucket = mBuckets[BucketOf(row.mEvent)];
+    mCells[index].mNext = bucket.load(std::memory_order_relaxed);
+    mCells[index].mRow.store(&row, std::memory_order_release);
+    bucket.store(static_cast<std::uint32_t>(index + 1), std::memory_order_release);
+    mCount.store(index + 1, std::memory_order_release);
+}
+
+void ListenerTable::Cells::Remove(const ListenerRow& row)
+{
+    std::uint32_t place = mBuckets[BucketOf(row.mEvent)].load(std::memory_order_relaxed);
+    for (; place != kNoPlace; place = mCells[place - 1].mNext)
+    {
+        if (mCells[place - 1].mRow.load(std::memory_order_relaxed) == &row)
+            mCells[place - 1].mRow.store(nullptr, std::memory_order_seq_cst); // before the question for readers
+    }
 }
 
 ListenerTable::ListenerTable()
 {
-    mRows.Publish(std::make_shared<Rows>(kFirstCapacity));
+    mCells.Publish(std::make_shared<Cells>(kFirstCapacity));
 }
 
-void ListenerTable::Append(AUListenerBase* listener, const Interest& interest)
+void ListenerTable::Append(ListenerRow& row)
 {
     const std::lock_guard lock(mChanging);
-    const std::size_t count = GetRows().mCount.load(std::memory_order_relaxed);
-    if (count == GetRows().mRows.size())
-        Replace(2 * count, [](const Row&) { return false; });
-    Rows& rows = GetRows();
-    rows.mRows[count] = {listener, interest};
-    rows.mCount.store(count + 1, std::memory_order_release);
+    if (GetCells().mCount.load(std::memory_order_relaxed) == GetCells().mCells.size())
+        Replace();
+    GetCells().Append(row);
 }
 
-void ListenerTable::Remove(const std::function<bool(const Row&)>& isOut)
+void ListenerTable::Remove(std::span<ListenerRow* const> rows)
 {
     const std::lock_guard lock(mChanging);
-    Replace(GetRows().mRows.size(), isOut);
+    for (const ListenerRow* row : rows)
+        GetCells().Remove(*row);
+    mCells.AwaitReaders();
 }
 
-void ListenerTable::Replace(std::size_t capacity, const std::function<bool(const Row&)>& isOut)
+void ListenerTable::Close()
 {
-    auto rows = std::make_shared<Rows>(capacity);
-    const Rows& from = GetRows();
-    std::size_t count = 0;
-    for (std::size_t index = 0; index < from.mCount.load(std::memory_order_relaxed); ++index)
+    const std::lock_guard lock(mChanging);
+    mIsClosed.store(true, std::memory_order_seq_cst);
+    for (Cell& cell : GetCells().mCells)
     {
-        if (!isOut(from.mRows[index]))
-            rows->mRows[count++] = from.mRows[index];
+        // Its listener is there: it takes its rows out before it goes.
+        if (const ListenerRow* row = cell.mRow.exchange(nullptr, std::memory_order_seq_cst))
+            row->mListener->LoseUnit();
     }
-    rows->mCount.store(count, std::memory_order_relaxed); // publishing comes behind it
-    mRows.Publish(std::move(rows));
-    mRows.AwaitReaders();
-    mRows.FreeRetired();
+    mCells.AwaitReaders();
+}
+
+// By room for as many rows again as there are; cells of rows that have gone are left out.
+void ListenerTable::Replace()
+{
+    std::vector<ListenerRow*> rows;
+    ForEach([&rows](ListenerRow& row) { rows.push_back(&row); });
+    auto cells = std::make_shared<Cells>(std::bit_ceil(std::max(kFirstCapacity, 2 * rows.size())));
+    for (ListenerRow* row : rows)
+        cells->Append(*row);
+    mCells.Publish(std::move(cells));
+    mCells.AwaitReaders();
+    mCells.FreeRetired();
 }
 
 } // namespace zebaudiofilterhost::xau

@@ -1,76 +1,110 @@
 #pragma once
 
-#include "AudioToolbox/AudioUnitUtilities.h"
+#include "host/src/XAU/linux/src/ListenerRow.h"
 #include "utility/src/Published.h"
 
 #include <atomic>
 #include <cstddef>
-#include <functional>
+#include <cstdint>
 #include <memory>
 #include <mutex>
+#include <span>
 #include <vector>
 
 namespace zebaudiofilterhost::xau
 {
 
-/// What a listener wants to hear.
-struct Interest
-{
-    AudioUnitEvent mEvent;
-    void* mObject;
-
-    bool operator==(const Interest& other) const;
-};
-
-/// Whether both name the same change of the same thing.
-bool IsSameEvent(const AudioUnitEvent& a, const AudioUnitEvent& b);
-
-/// Who listens to one unit. Those that tell read rows that never change; more are appended behind the ones that they
-/// see, and what is taken out is left out of another array, which is put in the place of the first when nobody reads
-/// that any more.
+/// Who listens to one unit, by what is listened to. Those that tell read cells of which only the row ever changes, to
+/// none when it is taken out. More cells are appended behind the ones that they see; what is full is replaced by a
+/// larger array, and kept until nobody reads it any more.
 class ListenerTable
 {
 public:
-    struct Row
-    {
-        AUListenerBase* mListener = nullptr;
-        Interest mInterest = {};
-    };
-
     ListenerTable();
 
     /// [any but process]
-    void Append(AUListenerBase* listener, const Interest& interest);
-    /// Nobody tells the listener of what is taken out from the return on. [any but process]
-    void Remove(const std::function<bool(const Row&)>& isOut);
+    void Append(ListenerRow& row);
+    /// Nobody tells a listener of these rows from the return on. Those that are not there are nothing.
+    /// [any but process]
+    void Remove(std::span<ListenerRow* const> rows);
+    /// Before the unit goes: takes all rows out and lets their listeners know, which may be disposed of later.
+    /// [any but process]
+    void Close();
+    bool IsClosed() const { return mIsClosed.load(std::memory_order_seq_cst); }
+
+    /// Calls `call` unless the unit has gone; it does not go before the return. Must not close the table. [any]
+    template <typename Call>
+    void WhileOpen(const Call& call) const
+    {
+        const Published<CellsPtr>::Reader reader(mCells); // before the question, for Close asks for readers after it
+        if (!IsClosed())
+            call();
+    }
 
     /// Calls `visit` for each row, which must neither block nor change the table. Neither allocates nor locks. [any]
     template <typename Visit>
     void ForEach(const Visit& visit) const
     {
-        const Published<RowsPtr>::Reader reader(mRows); // also until a unit that is asked for its value throws
-        const Rows& rows = **reader;
-        const std::size_t count = rows.mCount.load(std::memory_order_acquire); // with what Append wrote before it
+        const Published<CellsPtr>::Reader reader(mCells);
+        const Cells& cells = **reader;
+        const std::size_t count = cells.mCount.load(std::memory_order_acquire); // with what Append wrote before it
         for (std::size_t index = 0; index < count; ++index)
-            visit(rows.mRows[index]);
+            VisitCell(cells.mCells[index], visit);
+    }
+
+    /// The same for the rows of one event, without a look at the others.
+    template <typename Visit>
+    void ForEach(const AudioUnitEvent& event, const Visit& visit) const
+    {
+        const Published<CellsPtr>::Reader reader(mCells);
+        const Cells& cells = **reader;
+        const auto visitSame = [&](ListenerRow& row)
+        {
+            if (IsSameEvent(row.mEvent, event))
+                visit(row);
+        };
+        // Each cell was written before the one that leads to it.
+        std::uint32_t place = cells.mBuckets[cells.BucketOf(event)].load(std::memory_order_acquire);
+        for (; place != kNoPlace; place = cells.mCells[place - 1].mNext)
+            VisitCell(cells.mCells[place - 1], visitSame);
     }
 
 private:
-    struct Rows
-    {
-        explicit Rows(std::size_t capacity) : mRows(capacity) {}
+    static constexpr std::uint32_t kNoPlace = 0; // places count from 1
 
-        std::vector<Row> mRows; // of a fixed size
+    struct Cell
+    {
+        std::atomic<ListenerRow*> mRow = nullptr;
+        std::uint32_t mNext = kNoPlace; // of the same bucket
+    };
+
+    struct Cells
+    {
+        explicit Cells(std::size_t capacity); // a power of two
+        std::size_t BucketOf(const AudioUnitEvent& event) const;
+        void Append(ListenerRow& row);
+        void Remove(const ListenerRow& row);
+
+        std::vector<Cell> mCells;                         // of a fixed size
+        std::vector<std::atomic<std::uint32_t>> mBuckets; // places of first cells
         std::atomic<std::size_t> mCount = 0;
     };
 
-    using RowsPtr = std::shared_ptr<Rows>;
+    using CellsPtr = std::shared_ptr<Cells>;
 
-    /// Of whoever holds the lock: only that side replaces or adds.
-    Rows& GetRows() const { return **Published<RowsPtr>::Reader(mRows); }
-    void Replace(std::size_t capacity, const std::function<bool(const Row&)>& isOut);
+    template <typename Visit>
+    static void VisitCell(const Cell& cell, const Visit& visit)
+    {
+        if (ListenerRow* const row = cell.mRow.load(std::memory_order_seq_cst)) // after counting itself as a reader
+            visit(*row);
+    }
 
-    Published<RowsPtr> mRows;
+    /// Of whoever holds the lock: only that side replaces or changes.
+    Cells& GetCells() const { return **Published<CellsPtr>::Reader(mCells); }
+    void Replace();
+
+    Published<CellsPtr> mCells;
+    std::atomic<bool> mIsClosed = false;
     std::mutex mChanging; // one at a time
 };
 
