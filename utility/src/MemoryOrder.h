@@ -39,7 +39,7 @@ enum class OrderSite
 /// `order`, unless this build weakens the site.
 consteval std::memory_order OrderAt(OrderSite site, std::memory_order order)
 {
-    return site != OrderSite::kNone && site == OrderSite::ZEB_WEAKEN ? std::memory_order_relaxed : order;
+    return site == OrderSite::ZEB_WEAKEN ? std::memory_order_relaxed : order;
 }
 
 } // namespace zebaudiofilterhost
