@@ -8,6 +8,7 @@
 #include <boost/smart_ptr/intrusive_ptr.hpp>
 
 #include <map>
+#include <unordered_map>
 #include <vector>
 
 namespace zebaudiofilterhost
@@ -58,11 +59,15 @@ public:
     DescriptorMap BuildComponentDescriptorMap(const DescriptorVector& descriptors) const;
 
 private:
+    using DescriptorIndex = std::unordered_map<UTF16String, DescriptorPtr>;
+
+    static DescriptorIndex BuildIndex(const DescriptorVector& descriptors);
+
     AudioFilterDescriptorManager();
     ~AudioFilterDescriptorManager();
 
     DescriptorVector mDescriptors;
-    DescriptorMap mDescriptorMap;
+    DescriptorIndex mDescriptorIndex;
     std::map<UTF16String, UTF16String> mLegacyToCurrentID;
 };
 

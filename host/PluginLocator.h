@@ -4,6 +4,8 @@
 #include "host/TechnologyType.h"
 #include "utility/CommonTypes.h"
 
+#include <cstddef>
+
 namespace zebaudiofilterhost
 {
 
@@ -38,6 +40,9 @@ public:
     /// Overwrites the object. Without a colon in the text it becomes a default locator; a number that is none, or
     /// does not fit 32 bits, gives kTechnologyNone and keeps the path. Any other number is taken as it stands.
     void FromString(const UTF16String& text);
+
+    /// Equal for equal locators. [any]
+    friend std::size_t hash_value(const PluginLocator& locator);
 
 private:
     TechnologyType mType = kTechnologyNone;

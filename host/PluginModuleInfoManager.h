@@ -10,10 +10,13 @@
 #include <boost/smart_ptr/intrusive_ptr.hpp>
 
 #include <map>
+#include <memory>
 #include <vector>
 
 namespace zebaudiofilterhost
 {
+
+class PluginModuleRecords;
 
 /// All technologies, and the records of all plug-in binaries; reads and writes the settings file. It opens no file by
 /// itself: the application stores the private configuration, calls LoadConfiguration, CollectPotentialPlugins,
@@ -102,13 +105,13 @@ private:
     PluginModuleInfoManager();
     ~PluginModuleInfoManager();
 
+    void EnterRecords(const PropList& list);
     void LoadCurrentConfiguration(const PropList& list);
     void LoadWithoutFile();
     void ReadTechnologyDirectories(const PropList& section) const;
 
     std::map<TechnologyType, TechnologyPtr> mTechnologies;
-    PluginInfoMap mInfos;
-    PluginInfoVector mInfosInOrder;
+    std::unique_ptr<PluginModuleRecords> mRecords;
     PluginInfosChangedSignal mPluginInfosChangedSignal;
     PropList mPrivatePluginConfiguration;
     UTF16String mSettingsFileName;

@@ -77,7 +77,7 @@ PluginLocator LocatorOf(int index)
 UTF16String FilterIDOf(int index)
 {
     const std::string digits = std::to_string(index);
-    return u"3:" + UTF16FromNarrow(std::string(32 - digits.size(), '5') + digits);
+    return u"3:" + UTF16FromNarrow(std::string(32 - digits.size(), '0') + digits);
 }
 
 boost::intrusive_ptr<PluginModuleInfo> RecordOf(int index)

@@ -1,18 +1,49 @@
 #include "foundation/zebcore/internal/PropListEntries.h"
 
+#include <algorithm>
+#include <functional>
+
 namespace zebcore::proplist
 {
 
+namespace
+{
+
+constexpr std::size_t kFewEntries = 16;
+constexpr std::size_t kFirstCapacity = 12; // A section of the settings file fits
+constexpr std::size_t kNone = static_cast<std::size_t>(-1);
+
+std::size_t Hash(std::u8string_view key)
+{
+    return std::hash<std::u8string_view>()(key);
+}
+
+} // namespace
+
+std::size_t PropList::Entries::Position(std::u8string_view key) const
+{
+    if (mIndex.empty())
+    {
+        const auto found =
+            std::find_if(mEntries.begin(), mEntries.end(), [key](const Entry& entry) { return entry.mKey == key; });
+        return found == mEntries.end() ? kNone : static_cast<std::size_t>(found - mEntries.begin());
+    }
+    const auto [begin, end] = mIndex.equal_range(Hash(key));
+    const auto found =
+        std::find_if(begin, end, [this, key](const auto& indexed) { return mEntries[indexed.second].mKey == key; });
+    return found == end ? kNone : found->second;
+}
+
 const PropList::Entries::Value* PropList::Entries::Find(const UTF8String& key) const
 {
-    const auto found = mIndex.find(key);
-    return found == mIndex.end() ? nullptr : &found->second->mValue;
+    const std::size_t position = Position(key);
+    return position == kNone ? nullptr : &mEntries[position].mValue;
 }
 
 PropList::Entries::Value* PropList::Entries::Find(const UTF8String& key)
 {
-    const auto found = mIndex.find(key);
-    return found == mIndex.end() ? nullptr : &found->second->mValue;
+    const std::size_t position = Position(key);
+    return position == kNone ? nullptr : &mEntries[position].mValue;
 }
 
 PropList::Entries::Value& PropList::Entries::Set(const UTF8String& key, Value value)
@@ -23,27 +54,47 @@ PropList::Entries::Value& PropList::Entries::Set(const UTF8String& key, Value va
         std::swap(*existing, value);
         return *existing;
     }
-    const auto entry = mEntries.insert(mEntries.end(), Entry{key, std::move(value)});
+    Append(key, std::move(value));
+    return mEntries.back().mValue;
+}
+
+void PropList::Entries::Append(const UTF8String& key, Value&& value)
+{
+    if (mEntries.empty())
+        mEntries.reserve(kFirstCapacity);
+    mEntries.push_back(Entry{key, std::move(value)});
     try
     {
-        mIndex.emplace(entry->mKey, entry);
+        if (!mIndex.empty())
+            mIndex.emplace(Hash(mEntries.back().mKey), mEntries.size() - 1);
+        else if (mEntries.size() > kFewEntries)
+            BuildIndex();
     }
     catch (...)
     {
-        mEntries.erase(entry);
+        mEntries.pop_back();
         throw;
     }
-    return entry->mValue;
+}
+
+void PropList::Entries::BuildIndex()
+{
+    decltype(mIndex) index;
+    for (std::size_t position = 0; position < mEntries.size(); ++position)
+        index.emplace(Hash(mEntries[position].mKey), position);
+    mIndex.swap(index);
 }
 
 void PropList::Entries::Remove(const UTF8String& key)
 {
-    const auto found = mIndex.find(key);
-    if (found == mIndex.end())
+    const std::size_t position = Position(key);
+    if (position == kNone)
         return;
-    const Iterator entry = found->second;
-    mIndex.erase(found);
-    mEntries.erase(entry);
+    const Value doomed = std::move(mEntries[position].mValue); // The key may be part of what it names
+    mEntries.erase(mEntries.begin() + static_cast<std::ptrdiff_t>(position));
+    mIndex.clear();
+    if (mEntries.size() > kFewEntries)
+        BuildIndex();
 }
 
 void PropList::Entries::Clear()

@@ -61,6 +61,16 @@ String FromUTF16(std::u16string_view text)
     return result;
 }
 
+// Most text is: names, paths, numbers.
+bool IsAscii(std::string_view text)
+{
+    constexpr auto kOther = static_cast<unsigned char>(0x80);
+    unsigned char seen = 0;
+    for (const char byte : text) // Without a way out, which lets the compiler take many bytes at a time
+        seen |= static_cast<unsigned char>(byte);
+    return seen < kOther;
+}
+
 std::string_view AsNarrow(std::u8string_view text)
 {
     return {reinterpret_cast<const char*>(text.data()), text.size()};
@@ -90,7 +100,7 @@ UTF16String UTF8to16(std::u8string_view text, UnicodeErrorCode* errorCode, unsig
 {
     const std::string_view narrow = AsNarrow(text);
     const char* end = narrow.data() + narrow.size();
-    const char* firstIllFormed = utf8::find_invalid(narrow.data(), end);
+    const char* firstIllFormed = IsAscii(narrow) ? end : utf8::find_invalid(narrow.data(), end);
     if (errorCode != nullptr)
         *errorCode = firstIllFormed == end ? kUnicodeError_None : kUnicodeError_IllFormed;
     if (errorPosition != nullptr)
@@ -115,6 +125,8 @@ std::string NarrowFromUTF16(std::u16string_view text)
 
 UTF16String UTF16FromNarrow(std::string_view utf8)
 {
+    if (IsAscii(utf8))
+        return AsciiToUTF16(utf8);
     if (utf8::is_valid(utf8.begin(), utf8.end()))
         return ToUTF16(utf8);
     std::string repaired;

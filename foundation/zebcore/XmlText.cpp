@@ -107,6 +107,27 @@ void AppendCharacter(UTF8String& out, char32_t character)
         AppendEscape(out, kUnitForm, character);
 }
 
+// What goes into the text as it is: printable ASCII without the reserved characters and the backslash.
+template <typename Unit>
+constexpr bool IsPlain(Unit unit)
+{
+    return unit >= Unit{' '} && unit < Unit{0x7F} && unit != Unit{'&'} && unit != Unit{'<'} && unit != Unit{'>'} &&
+           unit != Unit{'"'} && unit != Unit{'\''} && unit != Unit{'\\'};
+}
+
+// Appends the plain beginning of the text, which is nearly always all of it, and returns its length.
+template <typename Unit>
+std::size_t AppendPlain(UTF8String& out, std::basic_string_view<Unit> text)
+{
+    const auto end = std::find_if_not(text.begin(), text.end(), IsPlain<Unit>);
+    const auto length = static_cast<std::size_t>(end - text.begin());
+    const std::size_t before = out.size();
+    out.resize(before + length);
+    std::transform(text.begin(), end, out.begin() + static_cast<std::ptrdiff_t>(before),
+                   [](Unit unit) { return static_cast<char8_t>(unit); });
+    return length;
+}
+
 constexpr bool IsHighSurrogate(char32_t unit)
 {
     return unit >= 0xD800 && unit < 0xDC00;
@@ -139,7 +160,10 @@ void AppendByte(UTF8String& out, std::uint32_t byte)
 
 void AppendRun(UTF16String& out, std::u8string_view run)
 {
-    out += utility::UTF8to16(run);
+    if (out.empty())
+        out = utility::UTF8to16(run);
+    else
+        out += utility::UTF8to16(run);
 }
 
 void AppendRun(UTF8String& out, std::u8string_view run)
@@ -189,7 +213,7 @@ void AppendWellFormed(UTF8String& out, std::u8string_view all, std::size_t begin
 
 void AppendXmlText(UTF8String& out, std::u16string_view text)
 {
-    for (std::size_t i = 0; i < text.size(); ++i)
+    for (std::size_t i = AppendPlain(out, text); i < text.size(); ++i)
     {
         const char32_t unit = text[i];
         if (IsHighSurrogate(unit) && i + 1 < text.size() && IsLowSurrogate(text[i + 1]))
@@ -203,7 +227,7 @@ void AppendXmlText(UTF8String& out, std::u16string_view text)
 
 void AppendXmlText(UTF8String& out, std::u8string_view text)
 {
-    for (std::size_t done = 0; done < text.size();)
+    for (std::size_t done = AppendPlain(out, text); done < text.size();)
     {
         const auto* const bad = utf8::find_invalid(text.data() + done, text.data() + text.size());
         const auto good = static_cast<std::size_t>(bad - text.data());

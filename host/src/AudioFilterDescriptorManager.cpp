@@ -35,27 +35,27 @@ void AudioFilterDescriptorManager::AddAudioFilterDescriptor(DescriptorPtr descri
     {
         return;
     }
-    // Every ID of the vector is in the map, so the search is saved for a new ID: adding stays logarithmic.
-    const auto known = mDescriptorMap.find(descriptor->GetUniqueID());
-    if (known != mDescriptorMap.end())
+    // Every ID of the vector is in the map, so the search is saved for a new ID: adding takes constant time.
+    const auto known = mDescriptorIndex.find(descriptor->GetUniqueID());
+    if (known != mDescriptorIndex.end())
     {
         const auto found = std::find(mDescriptors.begin(), mDescriptors.end(), descriptor);
         if (found != mDescriptors.end())
         {
             mDescriptors.erase(found);
-            mDescriptorMap.erase(known);
+            mDescriptorIndex.erase(known);
         }
     }
     mDescriptors.push_back(descriptor);
-    mDescriptorMap.emplace(descriptor->GetUniqueID(), std::move(descriptor));
+    mDescriptorIndex.emplace(descriptor->GetUniqueID(), std::move(descriptor));
 }
 
 AudioFilterDescriptorManager::DescriptorPtr
 AudioFilterDescriptorManager::GetComponentDescriptorForID(const UTF16String& id) const
 {
     const auto legacy = mLegacyToCurrentID.find(id);
-    const auto found = mDescriptorMap.find(legacy == mLegacyToCurrentID.end() ? id : legacy->second);
-    return found == mDescriptorMap.end() ? DescriptorPtr() : found->second;
+    const auto found = mDescriptorIndex.find(legacy == mLegacyToCurrentID.end() ? id : legacy->second);
+    return found == mDescriptorIndex.end() ? DescriptorPtr() : found->second;
 }
 
 void AudioFilterDescriptorManager::AddLegacyToCurrentIDMapping(const UTF16String& legacy, const UTF16String& current)
@@ -92,7 +92,7 @@ AudioFilterDescriptorManager::DescriptorVector AudioFilterDescriptorManager::Get
 void AudioFilterDescriptorManager::ClearExternalInfos()
 {
     mDescriptors = GetInternalInfos();
-    mDescriptorMap = BuildComponentDescriptorMap(mDescriptors);
+    mDescriptorIndex = BuildIndex(mDescriptors);
 }
 
 void AudioFilterDescriptorManager::ClearInfosForLocator(const PluginLocator& locator)
@@ -105,30 +105,30 @@ void AudioFilterDescriptorManager::ClearInfosForLocators(const std::vector<Plugi
     const std::set<PluginLocator> doomed(locators.begin(), locators.end());
     std::erase_if(mDescriptors,
                   [&doomed](const DescriptorPtr& descriptor) { return doomed.contains(descriptor->GetLocator()); });
-    mDescriptorMap = BuildComponentDescriptorMap(mDescriptors);
+    mDescriptorIndex = BuildIndex(mDescriptors);
 }
 
 void AudioFilterDescriptorManager::ReadExternalComponentDescriptors(const PropList& list, bool merge)
 {
     DescriptorVector descriptors = merge ? mDescriptors : GetInternalInfos();
-    DescriptorMap descriptorMap = merge ? mDescriptorMap : BuildComponentDescriptorMap(descriptors);
+    DescriptorIndex index = merge ? mDescriptorIndex : BuildIndex(descriptors);
     int count = 0;
     list.GetValue(kKey_NumDescriptors, count);
-    for (const std::size_t index : PresentIndices(list, kKey_Descriptor, count))
+    for (const std::size_t number : PresentIndices(list, kKey_Descriptor, count))
     {
-        const PropList* const section = list.GetSubList(IndexedKey(kKey_Descriptor, index));
+        const PropList* const section = list.GetSubList(IndexedKey(kKey_Descriptor, number));
         if (section == nullptr)
         {
             continue;
         }
         const DescriptorPtr descriptor(new AudioFilterDescriptor(*section));
-        if (descriptorMap.emplace(descriptor->GetUniqueID(), descriptor).second)
+        if (index.emplace(descriptor->GetUniqueID(), descriptor).second)
         {
             descriptors.push_back(descriptor);
         }
     }
     mDescriptors.swap(descriptors);
-    mDescriptorMap.swap(descriptorMap);
+    mDescriptorIndex.swap(index);
 }
 
 void AudioFilterDescriptorManager::WriteExternalComponentDescriptors(PropList& list) const
@@ -139,6 +139,17 @@ void AudioFilterDescriptorManager::WriteExternalComponentDescriptors(PropList& l
     {
         infos[index]->Write(list.GetOrCreateSubList(IndexedKey(kKey_Descriptor, index)));
     }
+}
+
+AudioFilterDescriptorManager::DescriptorIndex
+AudioFilterDescriptorManager::BuildIndex(const DescriptorVector& descriptors)
+{
+    DescriptorIndex index;
+    for (const DescriptorPtr& descriptor : descriptors)
+    {
+        index.emplace(descriptor->GetUniqueID(), descriptor);
+    }
+    return index;
 }
 
 AudioFilterDescriptorManager::DescriptorMap

@@ -71,6 +71,11 @@ bool PluginLocator::operator!=(const PluginLocator& other) const
     return !(*this == other);
 }
 
+std::size_t hash_value(const PluginLocator& locator)
+{
+    return zebcore::filesupport::HashFileName(locator.mPath) ^ static_cast<std::size_t>(locator.mType);
+}
+
 TechnologyType PluginLocator::GetTechnologyType() const
 {
     return mType;

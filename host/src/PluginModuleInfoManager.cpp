@@ -1,8 +1,10 @@
 #include "host/PluginModuleInfoManager.h"
 
 #include "host/AudioFilterDescriptorManager.h"
+#include "host/src/PluginModuleRecords.h"
 
 #include <algorithm>
+#include <iterator>
 #include <set>
 #include <utility>
 
@@ -15,7 +17,8 @@ PluginModuleInfoManager& PluginModuleInfoManager::GetInstance()
     return sInstance;
 }
 
-PluginModuleInfoManager::PluginModuleInfoManager() : mSettingsFileName(u"AudioPluginManagerSettings.xml")
+PluginModuleInfoManager::PluginModuleInfoManager()
+    : mRecords(std::make_unique<PluginModuleRecords>()), mSettingsFileName(u"AudioPluginManagerSettings.xml")
 {
 }
 
@@ -52,26 +55,18 @@ void PluginModuleInfoManager::AddPluginModuleInfo(PluginInfoPtr info)
     {
         return;
     }
-    const auto known = mInfos.find(info->GetLocator());
-    if (known != mInfos.end())
-    {
-        // The map and the vector hold the same objects, so the pointer finds the entry of the locator.
-        mInfosInOrder.erase(std::find(mInfosInOrder.begin(), mInfosInOrder.end(), known->second));
-        mInfos.erase(known);
-    }
-    mInfos.emplace(info->GetLocator(), info);
-    mInfosInOrder.push_back(std::move(info));
+    mRecords->Add(info);
     mPluginInfosChangedSignal();
 }
 
 PluginModuleInfoManager::PluginInfoIterator PluginModuleInfoManager::PluginInfoBegin() const
 {
-    return mInfosInOrder.begin();
+    return mRecords->InOrder().begin();
 }
 
 PluginModuleInfoManager::PluginInfoIterator PluginModuleInfoManager::PluginInfoEnd() const
 {
-    return mInfosInOrder.end();
+    return mRecords->InOrder().end();
 }
 
 PluginModuleInfoManager::PluginInfosChangedSignal& PluginModuleInfoManager::GetPluginInfosChangedSignal()
@@ -81,45 +76,32 @@ PluginModuleInfoManager::PluginInfosChangedSignal& PluginModuleInfoManager::GetP
 
 PluginModuleInfoManager::PluginInfoPtr PluginModuleInfoManager::FindPluginInfo(const PluginLocator& locator) const
 {
-    const auto found = mInfos.find(locator);
-    return found == mInfos.end() ? PluginInfoPtr() : found->second;
+    return mRecords->Find(locator);
 }
 
 std::vector<PluginLocator> PluginModuleInfoManager::GetPluginLocators() const
 {
-    std::vector<PluginLocator> locators;
-    for (const auto& [locator, info] : mInfos)
-    {
-        locators.push_back(locator);
-    }
-    return locators;
+    return mRecords->Locators();
 }
 
 std::vector<PluginLocator> PluginModuleInfoManager::GetEnabledPlugins() const
 {
-    std::vector<PluginLocator> locators;
-    for (const auto& [locator, info] : mInfos)
-    {
-        if (info->IsEnabled())
-        {
-            locators.push_back(locator);
-        }
-    }
+    std::vector<PluginLocator> locators = mRecords->Locators();
+    std::erase_if(locators, [this](const PluginLocator& locator) { return !mRecords->Find(locator)->IsEnabled(); });
     return locators;
 }
 
 bool PluginModuleInfoManager::IsPluginEnabled(const PluginLocator& locator, bool unknownIsDisabled) const
 {
-    const auto found = mInfos.find(locator);
-    return found == mInfos.end() ? !unknownIsDisabled : found->second->IsEnabled();
+    const PluginInfoPtr info = FindPluginInfo(locator);
+    return info ? info->IsEnabled() : !unknownIsDisabled;
 }
 
 void PluginModuleInfoManager::SetPluginEnabled(const PluginLocator& locator, bool enabled)
 {
-    const auto found = mInfos.find(locator);
-    if (found != mInfos.end())
+    if (const PluginInfoPtr info = FindPluginInfo(locator))
     {
-        found->second->SetEnabled(enabled);
+        info->SetEnabled(enabled);
     }
 }
 
@@ -142,19 +124,13 @@ std::vector<PluginLocator> PluginModuleInfoManager::CollectPotentialPlugins(bool
     }
 
     const std::set<PluginLocator> onDisk(found.begin(), found.end());
-    std::vector<PluginLocator> gone;
-    for (const auto& [locator, info] : mInfos)
-    {
-        if (!onDisk.contains(locator))
-        {
-            gone.push_back(locator);
-        }
-    }
+    std::vector<PluginLocator> gone = mRecords->Locators();
+    std::erase_if(gone, [&onDisk](const PluginLocator& locator) { return onDisk.contains(locator); });
     removed.swap(gone);
 
     if (onlyNew)
     {
-        std::erase_if(found, [this](const PluginLocator& locator) { return mInfos.contains(locator); });
+        std::erase_if(found, [this](const PluginLocator& locator) { return mRecords->Find(locator) != nullptr; });
     }
     return found;
 }
@@ -162,22 +138,12 @@ std::vector<PluginLocator> PluginModuleInfoManager::CollectPotentialPlugins(bool
 void PluginModuleInfoManager::RemovePluginLocators(const std::vector<PluginLocator>& locators)
 {
     std::vector<PluginLocator> removed;
-    std::set<PluginInfoPtr> removedInfos;
-    for (const PluginLocator& locator : locators)
-    {
-        const auto found = mInfos.find(locator);
-        if (found != mInfos.end())
-        {
-            removedInfos.insert(found->second);
-            removed.push_back(found->first);
-            mInfos.erase(found);
-        }
-    }
+    std::copy_if(locators.begin(), locators.end(), std::back_inserter(removed),
+                 [this](const PluginLocator& locator) { return mRecords->Remove(locator); });
     if (removed.empty())
     {
         return;
     }
-    std::erase_if(mInfosInOrder, [&removedInfos](const PluginInfoPtr& info) { return removedInfos.contains(info); });
     AudioFilterDescriptorManager::GetInstance().ClearInfosForLocators(removed);
     mPluginInfosChangedSignal();
 }

@@ -6,6 +6,7 @@
 #include "foundation/zebcore/PropListUtils.h"
 #include "host/AudioFilterDescriptorManager.h"
 #include "host/src/IndexedKeys.h"
+#include "host/src/PluginModuleRecords.h"
 
 #include <set>
 
@@ -54,6 +55,21 @@ void WriteTechnologyDirectories(PropList& section, const PluginTechnology& techn
     }
 }
 
+std::vector<PluginModuleInfoManager::PluginInfoPtr> ReadRecords(const PropList& list)
+{
+    int count = 0;
+    list.GetValue(kKey_NumPluginInfos, count);
+    std::vector<PluginModuleInfoManager::PluginInfoPtr> infos;
+    for (const std::size_t index : PresentIndices(list, kKey_PluginInfo, count))
+    {
+        if (const PropList* const section = list.GetSubList(IndexedKey(kKey_PluginInfo, index)))
+        {
+            infos.emplace_back(new PluginModuleInfo(*section));
+        }
+    }
+    return infos;
+}
+
 } // namespace
 
 void PluginModuleInfoManager::ReadPluginInfos(const PropList& list, PluginInfoMap& infos, PluginInfoVector& order,
@@ -64,18 +80,10 @@ void PluginModuleInfoManager::ReadPluginInfos(const PropList& list, PluginInfoMa
         infos.clear();
         order.clear();
     }
-    int count = 0;
-    list.GetValue(kKey_NumPluginInfos, count);
     // Replaced records leave the vector in one pass at the end: a list full of known plug-ins stays linear.
     std::set<PluginInfoPtr> replaced;
-    for (const std::size_t index : PresentIndices(list, kKey_PluginInfo, count))
+    for (const PluginInfoPtr& info : ReadRecords(list))
     {
-        const PropList* const section = list.GetSubList(IndexedKey(kKey_PluginInfo, index));
-        if (section == nullptr)
-        {
-            continue;
-        }
-        const PluginInfoPtr info(new PluginModuleInfo(*section));
         const auto known = infos.find(info->GetLocator());
         if (known != infos.end())
         {
@@ -88,12 +96,21 @@ void PluginModuleInfoManager::ReadPluginInfos(const PropList& list, PluginInfoMa
     std::erase_if(order, [&replaced](const PluginInfoPtr& info) { return replaced.contains(info); });
 }
 
+void PluginModuleInfoManager::EnterRecords(const PropList& list)
+{
+    for (const PluginInfoPtr& info : ReadRecords(list))
+    {
+        mRecords->Add(info);
+    }
+}
+
 void PluginModuleInfoManager::WritePluginInfos(PropList& list) const
 {
-    list.SetValue(kKey_NumPluginInfos, static_cast<int>(mInfosInOrder.size()));
-    for (std::size_t index = 0; index < mInfosInOrder.size(); ++index)
+    const PluginInfoVector& infos = mRecords->InOrder();
+    list.SetValue(kKey_NumPluginInfos, static_cast<int>(infos.size()));
+    for (std::size_t index = 0; index < infos.size(); ++index)
     {
-        mInfosInOrder[index]->Write(list.GetOrCreateSubList(IndexedKey(kKey_PluginInfo, index)));
+        infos[index]->Write(list.GetOrCreateSubList(IndexedKey(kKey_PluginInfo, index)));
     }
 }
 
@@ -155,7 +172,8 @@ void PluginModuleInfoManager::LoadConfiguration(File& file)
 void PluginModuleInfoManager::LoadCurrentConfiguration(const PropList& list)
 {
     ReadDirectories(list);
-    ReadPluginInfos(list, mInfos, mInfosInOrder, false);
+    mRecords->Clear();
+    EnterRecords(list);
     // The private configuration comes first, so that its descriptors win over those of the file.
     AudioFilterDescriptorManager& descriptors = AudioFilterDescriptorManager::GetInstance();
     descriptors.ReadExternalComponentDescriptors(mPrivatePluginConfiguration, false);
@@ -167,7 +185,7 @@ void PluginModuleInfoManager::LoadWithoutFile()
 {
     AudioFilterDescriptorManager::GetInstance().ReadExternalComponentDescriptors(mPrivatePluginConfiguration, false);
     mPluginInfosChangedSignal();
-    if (mInfosInOrder.empty())
+    if (mRecords->InOrder().empty())
     {
         ResetToDefaultFolders();
     }
@@ -211,7 +229,7 @@ void PluginModuleInfoManager::AddConfiguration(const UTF8String& text, bool noti
 {
     PropList list;
     zebcore::proplist::utils::ReadPropList(text, list);
-    ReadPluginInfos(list, mInfos, mInfosInOrder, true);
+    EnterRecords(list);
     AudioFilterDescriptorManager::GetInstance().ReadExternalComponentDescriptors(list, true);
     if (notify)
     {
@@ -227,8 +245,7 @@ void PluginModuleInfoManager::SetPrivatePluginConfiguration(const UTF8String& te
 
 void PluginModuleInfoManager::ClearAll(bool withoutPrivate)
 {
-    mInfos.clear();
-    mInfosInOrder.clear();
+    mRecords->Clear();
     AudioFilterDescriptorManager& descriptors = AudioFilterDescriptorManager::GetInstance();
     descriptors.ClearExternalInfos();
     if (!withoutPrivate)

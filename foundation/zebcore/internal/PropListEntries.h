@@ -2,16 +2,19 @@
 
 #include "foundation/zebcore/PropList.h"
 
+#include <cstddef>
 #include <list>
 #include <memory>
 #include <string_view>
 #include <unordered_map>
 #include <variant>
+#include <vector>
 
 namespace zebcore::proplist
 {
 
-// What a PropList holds: the entries in order of arrival, and an index over their keys.
+// What a PropList holds: the entries in order of arrival. The many lists with a few entries are searched one by one;
+// a longer one gets an index over the hashes of its keys.
 class PropList::Entries
 {
 public:
@@ -20,26 +23,28 @@ public:
 
     struct Entry
     {
-        const UTF8String mKey;
+        UTF8String mKey; // never changes
         Value mValue;
     };
 
     const Value* Find(const UTF8String& key) const;
     Value* Find(const UTF8String& key);
 
-    // Replaces the value under the key in its place, or appends it. Returns where it stands now.
+    // Replaces the value under the key in its place, or appends it. Returns where it stands until the next change.
     Value& Set(const UTF8String& key, Value value);
 
     void Remove(const UTF8String& key);
     void Clear();
 
-    const std::list<Entry>& InOrder() const { return mEntries; }
+    const std::vector<Entry>& InOrder() const { return mEntries; }
 
 private:
-    using Iterator = std::list<Entry>::iterator;
+    std::size_t Position(std::u8string_view key) const;
+    void Append(const UTF8String& key, Value&& value);
+    void BuildIndex();
 
-    std::list<Entry> mEntries;
-    std::unordered_map<std::u8string_view, Iterator> mIndex; // the views are of the entries' own keys
+    std::vector<Entry> mEntries;
+    std::unordered_multimap<std::size_t, std::size_t> mIndex; // from hash to position; empty for a short list
 };
 
 } // namespace zebcore::proplist

@@ -5,6 +5,7 @@
 #include <CoreFoundation/CoreFoundation.h>
 #include <unistd.h>
 
+#include <functional>
 #include <memory>
 #include <string>
 #include <type_traits>
@@ -56,6 +57,11 @@ UTF16String Key(const UTF16String& path)
 int CompareFileNames(const UTF16String& a, const UTF16String& b)
 {
     return a == b ? 0 : Key(a).compare(Key(b));
+}
+
+std::size_t HashFileName(const UTF16String& path)
+{
+    return std::hash<UTF16String>()(Key(path));
 }
 
 } // namespace zebcore::filesupport
