@@ -19,6 +19,7 @@ add_library(zeb_vst3_sdk STATIC EXCLUDE_FROM_ALL
     ${PROJECT_SOURCE_DIR}/host/src/VST3/src/VST3InterfaceIDs.cpp)
 target_include_directories(zeb_vst3_sdk SYSTEM PUBLIC ${VST3_SDK_ROOT})
 target_compile_definitions(zeb_vst3_sdk PUBLIC RELEASE=1)
+set_property(TARGET zeb_vst3_sdk PROPERTY UNITY_BUILD OFF) # It defines by macros what a neighbour defines too
 # The SDK's interfaces have no virtual destructor, and nobody deletes through them.
 target_compile_options(zeb_vst3_sdk PRIVATE -w INTERFACE -Wno-non-virtual-dtor)
 

@@ -1,26 +1,13 @@
 // Life of a filter: construction, ticks, suspending and resuming, cloning.
 #include "audiofilter/AudioFilter.h"
 
+#include "audiofilter/src/BusLayouts.h"
 #include "module/ModuleUITimer.h"
 #include "utility/EffectUtils.h"
 #include "utility/ThreadUtils.h"
 
 namespace zebaudiofilterhost
 {
-
-namespace
-{
-
-std::vector<ChannelLayout> LayoutsOf(const std::vector<AudioFilterBusDescription>& buses)
-{
-    std::vector<ChannelLayout> layouts;
-    layouts.reserve(buses.size());
-    for (const AudioFilterBusDescription& bus : buses)
-        layouts.push_back(bus.GetLayout());
-    return layouts;
-}
-
-} // namespace
 
 AudioFilter::AudioFilter(const UTF16String& id, const UTF16String& displayName)
     : mFilterID(id), mDisplayName(displayName)

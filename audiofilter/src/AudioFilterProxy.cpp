@@ -1,5 +1,6 @@
 #include "audiofilter/AudioFilterProxy.h"
 
+#include "audiofilter/src/BusLayouts.h"
 #include "utility/EffectUtils.h"
 
 namespace zebaudiofilterhost
@@ -11,17 +12,6 @@ namespace
 constexpr unsigned long kFirstCount = 1;
 constexpr unsigned long kSecondCount = 6;
 constexpr AudioFilterParameterInfoUnit kNoUnit = AudioFilterParameterInfoUnit(0);
-
-std::vector<ChannelLayout> LayoutsOf(const std::vector<AudioFilterBusDescription>& buses)
-{
-    std::vector<ChannelLayout> layouts;
-    layouts.reserve(buses.size());
-    for (const AudioFilterBusDescription& bus : buses)
-    {
-        layouts.push_back(bus.GetLayout());
-    }
-    return layouts;
-}
 
 } // namespace
 
