@@ -20,8 +20,8 @@ public:
     /// False, with nothing stored, when the ring is full. The message must not be null. [main]
     bool Push(const boost::intrusive_ptr<Message>& message);
 
-    /// The oldest message, which is no longer in here, or null when there is none. [process]
-    boost::intrusive_ptr<Message> Pop();
+    /// Moves the oldest message to `message`. False, with nothing written, when there is none. [process]
+    bool Pop(boost::intrusive_ptr<Message>& message);
 
 private:
     static constexpr std::size_t kSize = 33; // One place stays free, which tells a full ring from an empty one

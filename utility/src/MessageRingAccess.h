@@ -22,16 +22,16 @@ inline bool MessageRing::Push(const boost::intrusive_ptr<Message>& message)
     return true;
 }
 
-inline boost::intrusive_ptr<Message> MessageRing::Pop()
+inline bool MessageRing::Pop(boost::intrusive_ptr<Message>& message)
 {
     const std::size_t read = mReadIndex.load(std::memory_order_relaxed); // Our own
     // Acquire: sees the place that the producer filled before it published the index.
     if (read == mWriteIndex.load(OrderAt(OrderSite::kMessagePopLooks, std::memory_order_acquire)))
-        return nullptr;
-    boost::intrusive_ptr<Message> message = std::move(mPlaces[read]);
+        return false;
+    message = std::move(mPlaces[read]);
     // Release: gives the empty place back.
     mReadIndex.store(Next(read), OrderAt(OrderSite::kMessagePopGivesBack, std::memory_order_release));
-    return message;
+    return true;
 }
 
 } // namespace zebaudiofilterhost

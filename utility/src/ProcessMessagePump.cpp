@@ -8,7 +8,7 @@ namespace zebaudiofilterhost
 void ProcessMessageHandler::PumpFromProcessThread()
 {
     // The message list holds a reference until after this one is gone, so nothing is freed here.
-    while (const boost::intrusive_ptr<Message> message = mRing.Pop())
+    for (boost::intrusive_ptr<Message> message; mRing.Pop(message); message.reset())
     {
         bool done = true;
         try

@@ -68,22 +68,22 @@ ParameterRing::Place ParameterRing::ReadPlace(std::uint64_t ticket, ParameterQue
     return place;
 }
 
-bool ParameterRing::ReadFrom(std::uint64_t ticket, ParameterQueueValue& value, std::uint64_t end)
+bool ParameterRing::ReadOn(ParameterQueueValue& value, std::uint64_t end)
 {
-    for (; ticket < end; ticket = OldestKept())
+    std::uint64_t ticket = OldestKept();
+    while (ticket < end)
     {
-        ParameterQueueValue read;
-        const Place place = ReadPlace(ticket, read);
+        const Place place = ReadPlace(ticket, value);
         if (place == Place::kInTheMaking)
             return false;
-        // A place that was overwritten means that the oldest kept has moved on by now.
         if (place == Place::kComplete)
         {
             mNextRead.store(ticket + 1, std::memory_order_relaxed);
-            value = read;
             return true;
         }
+        ticket = OldestKept(); // A place that was overwritten means that it has moved on by now
     }
+    mNextRead.store(ticket, std::memory_order_relaxed); // Past what was discarded or overwritten
     return false;
 }
 

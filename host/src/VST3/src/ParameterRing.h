@@ -32,8 +32,7 @@ public:
     /// The reader's.
     bool Read(ParameterQueueValue& value, std::uint64_t end)
     {
-        const std::uint64_t ticket = OldestKept();
-        return ticket < end && ReadFrom(ticket, value, end);
+        return end != mNextRead.load(std::memory_order_relaxed) && ReadOn(value, end);
     }
 
     /// Changes in the making count.
@@ -58,7 +57,7 @@ private:
     using Words = std::array<std::atomic<std::uint64_t>, 3>;
 
     Place ReadPlace(std::uint64_t ticket, ParameterQueueValue& value) const;
-    bool ReadFrom(std::uint64_t ticket, ParameterQueueValue& value, std::uint64_t end);
+    bool ReadOn(ParameterQueueValue& value, std::uint64_t end);
 
     std::uint64_t GetNextRead() const
     {
