@@ -1,0 +1,90 @@
+// Questions to the process thread and answers back, as many as one asks for, in plain memory: what the ring and the
+// states of messages do not order, ThreadSanitizer reports, and what they lose, repeat or reorder, the numbers show.
+#include "tests/rings/MessageCount.h"
+#include "utility/ProcessMessageHandler.h"
+#include "utility/ThreadUtils.h"
+
+#include <gtest/gtest.h>
+
+#include <atomic>
+#include <thread>
+
+namespace zebaudiofilterhost
+{
+
+namespace
+{
+
+constexpr std::uint64_t kTravellers = 32; // as many as the ring holds: a full ring could change the order
+
+struct Road
+{
+    std::uint64_t mCount;
+    // The main thread's.
+    std::uint64_t mAsked = 0;
+    std::uint64_t mAnswered = 0;
+    std::uint64_t mWrongAnswers = 0;
+    // The process thread's, until it has ended.
+    std::uint64_t mHeard = 0;
+    std::uint64_t mWrongQuestions = 0;
+};
+
+// Goes back and forth, each time with another question, until all are asked.
+class Traveller : public Message
+{
+public:
+    explicit Traveller(Road& road) : mRoad(road), mQuestion(road.mAsked++) {}
+
+    bool ExecuteOnProcessThread() override
+    {
+        if (mQuestion != mRoad.mHeard++)
+            ++mRoad.mWrongQuestions;
+        mAnswer = ~mQuestion;
+        return false;
+    }
+
+    bool ExecuteOnMainThread() override
+    {
+        ++mRoad.mAnswered;
+        if (mAnswer != ~mQuestion)
+            ++mRoad.mWrongAnswers;
+        if (mRoad.mAsked >= mRoad.mCount)
+            return true;
+        mQuestion = mRoad.mAsked++;
+        return false;
+    }
+
+private:
+    Road& mRoad;
+    std::uint64_t mQuestion;
+    std::uint64_t mAnswer = 0;
+};
+
+TEST(MessageRingLoad, QuestionsArriveInOrderAndAnswersComeBack)
+{
+    InitializeMainThreadID();
+    Road road{testing::GetMessageCount()};
+    ProcessMessageHandler handler;
+    handler.SetProcessing(true);
+    std::atomic<bool> stop{false};
+    std::jthread process(
+        [&]
+        {
+            for (; !stop.load(std::memory_order_relaxed); std::this_thread::yield())
+                handler.PumpFromProcessThread();
+        });
+    for (std::uint64_t traveller = 0; traveller < kTravellers; ++traveller)
+        handler.Post(boost::intrusive_ptr<Message>(new Traveller(road)));
+    for (; road.mAnswered < road.mCount; std::this_thread::yield())
+        handler.PumpFromMainThread();
+    stop.store(true, std::memory_order_relaxed);
+    process.join();
+    EXPECT_EQ(road.mHeard, road.mCount);
+    EXPECT_EQ(road.mAnswered, road.mCount);
+    EXPECT_EQ(road.mWrongQuestions, 0U);
+    EXPECT_EQ(road.mWrongAnswers, 0U);
+}
+
+} // namespace
+
+} // namespace zebaudiofilterhost
