@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include <cstdlib>
+#include <malloc.h>
 #include <unistd.h>
 
 int main(int argc, char** argv)
@@ -12,6 +13,8 @@ int main(int argc, char** argv)
         setenv("LD_BIND_NOW", "1", 1);
         execv("/proc/self/exe", argv);
     }
+    constexpr int kPage = 4096;
+    mallopt(M_MMAP_THRESHOLD, kPage);
     testing::InitGoogleTest(&argc, argv);
     return RUN_ALL_TESTS();
 }
