@@ -4,5 +4,5 @@ set(fake_plugin
     ../tests/vst3/FakeController.cpp
     ../tests/vst3/FakePlugin.cpp)
 
-zeb_add_fuzz_target(vst3_chunk UP_TO zeb_vst3 SOURCES ${ZEB_FUZZ_SUPPORT} ${fake_plugin})
-zeb_add_fuzz_target(vst3_filter_ids UP_TO zeb_vst3 SOURCES ${ZEB_FUZZ_SUPPORT})
+zeb_add_fuzz_target(vst3_chunk UP_TO zeb_vst3 DICTIONARY property_list LONGEST 192 SOURCES ${fake_plugin})
+zeb_add_fuzz_target(vst3_filter_ids UP_TO zeb_vst3 DICTIONARY filter_ids LONGEST 96)

@@ -2,6 +2,7 @@
 
 #include "foundation/zebcore/PropList.h"
 #include "foundation/zebcore/PropListUtils.h"
+#include "fuzz/support/ListText.h"
 #include "fuzz/support/Target.h"
 #include "host/AudioFilterDescriptorManager.h"
 #include "host/BannedPluginManager.h"
@@ -23,13 +24,20 @@ const UTF16String kPrivatePath = u"/opt/private/Gain.vst3";
 namespace
 {
 
-UTF8String PrivateConfiguration()
+bool sIsFilled = false;
+
+PropList PrivateConfiguration()
 {
     PropList list;
     list.SetValue(u8"num_descriptors", 1);
     const AudioFilterDescriptor descriptor(PluginLocator(kTechnologyVST3, kPrivatePath), u"Gain", u"Vendor", 1,
                                            kCategoryEffect, kPrivateFilterID, Guid(), false);
     descriptor.Write(list.GetOrCreateSubList(u8"descriptor0"));
+    return list;
+}
+
+UTF8String TextOf(const PropList& list)
+{
     UTF8String text;
     zebcore::proplist::utils::WritePropList(text, list);
     return text;
@@ -39,6 +47,7 @@ UTF8String PrivateConfiguration()
 
 void EmptyCatalogue()
 {
+    TouchCatalogue();
     PluginModuleInfoManager& infos = PluginModuleInfoManager::GetInstance();
     infos.SetPrivatePluginConfiguration(u8"");
     infos.ClearAll(true);
@@ -52,20 +61,34 @@ void EmptyCatalogue()
     BannedPluginManager::GetInstance().ReadBannedPlugins(PropList());
 }
 
+void TouchCatalogue()
+{
+    sIsFilled = false;
+}
+
+std::string CatalogueText()
+{
+    PropList list;
+    PluginModuleInfoManager::GetInstance().BuildConfigurationPropList(list, true);
+    return ListText(list);
+}
+
 void FillCatalogue()
 {
-    static const UTF8String sPrivate = PrivateConfiguration();
+    if (sIsFilled)
+        return;
+    static const PropList sPrivate = PrivateConfiguration();
+    static const UTF8String sPrivateText = TextOf(sPrivate);
     EmptyCatalogue();
     PluginModuleInfoManager& infos = PluginModuleInfoManager::GetInstance();
     infos.AddPluginModuleInfo(new PluginModuleInfo(PluginLocator(kTechnologyVST3, kRecordedPath), u"Recorded",
                                                    u"Vendor", 1, kTechnologyVST3, true, false));
     if (const auto technology = infos.GetPluginTechnology(kTechnologyVST3))
         technology->AddPluginDirectories({u"/opt/vst3"});
-    infos.SetPrivatePluginConfiguration(sPrivate);
+    infos.SetPrivatePluginConfiguration(sPrivateText);
     AudioFilterDescriptorManager::GetInstance().ClearExternalInfos();
-    PropList list;
-    zebcore::proplist::utils::ReadPropList(sPrivate, list);
-    AudioFilterDescriptorManager::GetInstance().ReadExternalComponentDescriptors(list, false);
+    AudioFilterDescriptorManager::GetInstance().ReadExternalComponentDescriptors(sPrivate, false);
+    sIsFilled = true;
 }
 
 void ExpectSoundCatalogue()

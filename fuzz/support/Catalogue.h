@@ -3,6 +3,8 @@
 
 #include "foundation/zebcore/StringTypes.h"
 
+#include <string>
+
 namespace zebfuzz
 {
 
@@ -13,8 +15,15 @@ extern const zebcore::UTF16String kPrivatePath;     // of that descriptor, VST 3
 // Nothing in it, the directories of the technologies included.
 void EmptyCatalogue();
 
-// One record, one directory, and a private configuration with one descriptor.
+// One record, one directory, and a private configuration with one descriptor. Costs nothing where the catalogue is so
+// already.
 void FillCatalogue();
+
+// Says that the catalogue, or the private configuration, is no longer as FillCatalogue makes it.
+void TouchCatalogue();
+
+// Records, directories and descriptors, told so that equal texts mean equal catalogues.
+std::string CatalogueText();
 
 // Fails unless look-up and order of arrival tell the same, and no ID is offered twice.
 void ExpectSoundCatalogue();

@@ -21,14 +21,13 @@ public:
     void VisitValue(const UTF8String& key, const UTF16String& value) override
     {
         Begin('w', key, value.size());
-        for (const char16_t unit : value)
-            mText.append({static_cast<char>(unit >> 8U), static_cast<char>(unit & 255U)});
+        Append(value.data(), value.size() * sizeof(char16_t));
     }
 
     void VisitValue(const UTF8String& key, const UTF8String& value) override
     {
         Begin('c', key, value.size());
-        mText.append(value.begin(), value.end());
+        Append(value.data(), value.size());
     }
 
     void VisitValue(const UTF8String& key, bool value) override { Begin('b', key, value ? 1 : 0); }
@@ -43,7 +42,7 @@ public:
     {
         Begin('F', key, value.size());
         for (const float number : value)
-            mText += std::to_string(std::bit_cast<std::uint32_t>(number)) + ' ';
+            Append(&number, sizeof(number));
     }
 
     void VisitSubList(const UTF8String& key, const PropList& subList) override
@@ -56,12 +55,15 @@ public:
     std::string mText;
 
 private:
+    void Append(const void* bytes, std::size_t size) { mText.append(static_cast<const char*>(bytes), size); }
+
     // Lengths come first, so that no content can pass for the end of its entry or list.
     void Begin(char type, const UTF8String& key, std::size_t number)
     {
-        mText += type + std::to_string(key.size()) + ':';
-        mText.append(key.begin(), key.end());
-        mText += std::to_string(number) + '=';
+        const std::size_t numbers[] = {key.size(), number};
+        mText += type;
+        Append(numbers, sizeof(numbers));
+        Append(key.data(), key.size());
     }
 };
 

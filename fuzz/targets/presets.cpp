@@ -18,6 +18,7 @@ using namespace zebfuzz;
 using namespace zebaudiofilterhost;
 using zebaudiofilterhost::testing::RecordingFilter;
 
+const std::vector<float> kParameters = {0.25F, 0.5F};
 constexpr int kFrames = 4;
 constexpr int kChannels = 4;
 
@@ -25,33 +26,48 @@ boost::intrusive_ptr<RecordingFilter> MakeFilter()
 {
     InitializeMainThreadID();
     auto filter = zebaudiofilterhost::testing::MakeFilter({2}, {2});
-    filter->mParameters = {0.25F, 0.5F};
+    filter->mParameters = kParameters;
     filter->SetBlockSize(kFrames);
     filter->SetMainTargetBus(zebaudiofilterhost::testing::MakeBus(kChannels));
     filter->SetUseChannelMap(true);
     return filter;
 }
 
-void CheckSettings(PropList& list)
+bool AreParameters(const PresetData& preset)
 {
-    const auto filter = MakeFilter();
-    const std::vector<float> before = filter->mParameters;
-    const PresetData preset(list);
-    const bool isOurs = preset.GetVersion() == filter->GetCurrentPresetVersion() &&
-                        preset.GetPresetType() == PresetData::kPresetType_Params;
     std::list<float> values;
     preset.GetParamList(values);
-    const bool loaded = filter->LoadSettings(preset);
-    Expect(loaded == (isOurs && values.size() == before.size()), "a preset of another kind or length is refused");
-    Expect(loaded || filter->mParameterCalls.empty(), "a preset that is refused changes nothing");
+    return preset.GetPresetType() == PresetData::kPresetType_Params && values.size() == kParameters.size();
+}
+
+// The filter has no factory presets, and so calls each by an empty name: choosing one of those does nothing.
+bool IsNothing(const PresetData& preset)
+{
+    return preset.GetPresetType() == PresetData::kPresetType_Factory && preset.GetFactoryIndex() >= 0 &&
+           preset.GetFactoryPresetName().empty();
+}
+
+void CheckSettings(PropList& list)
+{
+    static const auto sFilter = MakeFilter();
+    sFilter->mParameters = kParameters;
+    sFilter->mParameterCalls.clear();
+    const PresetData preset(list);
+    const bool isOurs = preset.GetVersion() == sFilter->GetCurrentPresetVersion();
+    const bool loaded = sFilter->LoadSettings(preset);
+    Expect(loaded == (isOurs && (AreParameters(preset) || IsNothing(preset))),
+           "a preset of another kind or length is refused");
+    Expect(loaded || sFilter->mParameterCalls.empty(), "a preset that is refused changes nothing");
+    if (!loaded)
+        return;
 
     PropList savedList;
     PresetData saved(savedList);
-    filter->SaveSettings(saved);
-    Expect(filter->LoadSettings(saved), "settings that were saved can be loaded");
+    sFilter->SaveSettings(saved);
+    Expect(sFilter->LoadSettings(saved), "settings that were saved can be loaded");
     PropList again;
     PresetData savedAgain(again);
-    filter->SaveSettings(savedAgain);
+    sFilter->SaveSettings(savedAgain);
     Expect(ListText(savedList) == ListText(again), "settings come back bit for bit");
 }
 
@@ -75,10 +91,11 @@ void CheckViews(PropList& list)
 
 void RunBlock(RecordingFilter& filter)
 {
-    filter.Resume();
-    zebaudiofilterhost::testing::Buffers in(kChannels, kFrames);
-    zebaudiofilterhost::testing::Buffers out(kChannels, kFrames);
+    static zebaudiofilterhost::testing::Buffers in(kChannels, kFrames);
+    static zebaudiofilterhost::testing::Buffers out(kChannels, kFrames);
     ChannelFlags flags;
+    filter.mProcessCalls.clear();
+    filter.Resume();
     filter.ProcessWithMapping(in.Pointers(), out.Pointers(), kFrames, ChannelFlags(), flags);
     filter.Suspend();
 }
@@ -86,19 +103,27 @@ void RunBlock(RecordingFilter& filter)
 // The maps that come of settings must keep to the buffers.
 void CheckChannelMaps(const PropList& list)
 {
-    const auto filter = MakeFilter();
-    filter->LoadChannelMapSettings(&list);
-    RunBlock(*filter);
+    static const auto sFilter = MakeFilter();
+    static const ChannelMap sInputs = sFilter->GetChannelMap(AudioFilter::kDirection_Input);
+    static const ChannelMap sOutputs = sFilter->GetChannelMap(AudioFilter::kDirection_Output);
+    sFilter->LoadChannelMapSettings(&list);
+    if (sFilter->GetChannelMap(AudioFilter::kDirection_Input) == sInputs &&
+        sFilter->GetChannelMap(AudioFilter::kDirection_Output) == sOutputs)
+        return;
+    RunBlock(*sFilter);
     PropList saved;
-    filter->SaveChannelMapSettings(&saved);
-    Expect(filter->LoadChannelMapSettings(&saved), "channel maps that were saved can be loaded");
-    RunBlock(*filter);
+    sFilter->SaveChannelMapSettings(&saved);
+    Expect(sFilter->LoadChannelMapSettings(&saved), "channel maps that were saved can be loaded");
+    RunBlock(*sFilter);
+    sFilter->SetChannelMap(sInputs, AudioFilter::kDirection_Input);
+    sFilter->SetChannelMap(sOutputs, AudioFilter::kDirection_Output);
 }
 
 void Run(Bytes bytes)
 {
     PropList list;
-    zebcore::proplist::utils::ReadPropList(TextOf(bytes), list);
+    if (!zebcore::proplist::utils::ReadPropList(TextOf(bytes), list))
+        return;
     CheckChannelMaps(list);
     CheckSettings(list);
     CheckViews(list);

@@ -41,10 +41,17 @@ States Split(std::string_view chunk)
     return {chunk.substr(0, componentSize), chunk.substr(componentSize, controllerSize), true};
 }
 
+fakeplugin::FakePlugin& Plugin()
+{
+    static fakeplugin::FakePlugin sPlugin;
+    sPlugin.recording = false;
+    return sPlugin;
+}
+
 void Run(Bytes bytes)
 {
-    fakeplugin::FakePlugin plugin;
-    plugin.recording = false;
+    fakeplugin::FakePlugin& plugin = Plugin();
+    static const auto sFilter = plugin.MakeFilter();
     plugin.state = "old";
     plugin.controllerState = "former";
     PropList list;
@@ -52,8 +59,7 @@ void Run(Bytes bytes)
     preset.SetChunkData(bytes.data(), bytes.size());
     preset.SetVersion(1.0F);
     preset.SetPresetType(PresetData::kPresetType_Chunk);
-    const auto filter = plugin.MakeFilter();
-    Expect(filter->LoadSettings(preset), "a chunk is taken, whatever is in it");
+    Expect(sFilter->LoadSettings(preset), "a chunk is taken, whatever is in it");
 
     const std::string chunk(bytes.begin(), bytes.end());
     const States states = Split(chunk);
@@ -64,7 +70,7 @@ void Run(Bytes bytes)
     Expect(plugin.controllerState == (states.controller.empty() ? "former" : states.controller),
            "the controller gets its bytes, if there are any");
 
-    filter->SaveSettings(preset);
+    sFilter->SaveSettings(preset);
     std::vector<unsigned char> saved;
     preset.GetChunkData(saved);
     const States again = Split({reinterpret_cast<const char*>(saved.data()), saved.size()});

@@ -31,7 +31,7 @@ public:
         mFake.effect.numParams = 2;
         mFake.effect.numPrograms = 2;
         mFake.effect.flags |= usesChunks ? vst::effFlagsProgramChunks : 0;
-        mFake.parameters = {0.25F, 0.5F};
+        Reset();
         mFake.On(vst::effSetChunk,
                  [this](int, long long size, void* bytes, float)
                  {
@@ -56,55 +56,67 @@ public:
         mFilter = new VSTAudioFilter(u"2:1234 Fake", u"/opt/vst/Fake.so", mFake.Get(), true, true);
     }
 
+    // As it was before anything was loaded.
+    void Reset()
+    {
+        mState = {1, 2, 3};
+        mFake.parameters = {0.25F, 0.5F};
+    }
+
     VSTAudioFilter& Filter() { return *mFilter; }
     const Chunk& State() const { return mState; }
     const std::vector<float>& Parameters() const { return mFake.parameters; }
 
 private:
-    Chunk mState = {1, 2, 3};
+    Chunk mState;
     fakeeffect::FakeEffect mFake; // dies after the filter
     boost::intrusive_ptr<VSTAudioFilter> mFilter;
 };
 
 void CheckChunk(const PresetData& preset)
 {
-    Effect effect(true);
-    const Chunk before = effect.State();
-    const bool loaded = effect.Filter().LoadSettings(preset);
+    static Effect sEffect(true);
+    sEffect.Reset();
+    const Chunk before = sEffect.State();
+    const bool loaded = sEffect.Filter().LoadSettings(preset);
     const bool isChunk = preset.GetPresetType() == PresetData::kPresetType_Chunk;
     Chunk chunk;
     if (loaded && isChunk && preset.GetChunkData(chunk))
-        Expect(effect.State() == chunk, "the effect gets its bytes");
+        Expect(sEffect.State() == chunk, "the effect gets its bytes");
     else
-        Expect(effect.State() == before, "a preset without bytes leaves the state");
+        Expect(sEffect.State() == before, "a preset without bytes leaves the state");
 }
 
 void CheckValues(const PresetData& preset)
 {
-    Effect effect(false);
-    const std::vector<float> before = effect.Parameters();
+    static Effect sEffect(false);
+    sEffect.Reset();
+    const std::vector<float> before = sEffect.Parameters();
     std::list<float> values;
     preset.GetParamList(values);
     const bool fits = values.size() == before.size() && preset.GetPresetType() == PresetData::kPresetType_Params;
-    const bool loaded = effect.Filter().LoadSettings(preset);
-    Expect(fits || effect.Parameters() == before, "a preset of another kind or length sets nothing");
+    const bool loaded = sEffect.Filter().LoadSettings(preset);
+    Expect(fits || sEffect.Parameters() == before, "a preset of another kind or length sets nothing");
     Expect(fits || !loaded || preset.GetPresetType() == PresetData::kPresetType_Factory,
            "a preset of another kind or length is refused");
+    if (!loaded)
+        return;
 
     PropList savedList;
     PresetData saved(savedList);
-    effect.Filter().SaveSettings(saved);
-    Expect(effect.Filter().LoadSettings(saved), "settings that were saved can be loaded");
+    sEffect.Filter().SaveSettings(saved);
+    Expect(sEffect.Filter().LoadSettings(saved), "settings that were saved can be loaded");
     PropList again;
     PresetData savedAgain(again);
-    effect.Filter().SaveSettings(savedAgain);
+    sEffect.Filter().SaveSettings(savedAgain);
     Expect(ListText(savedList) == ListText(again), "settings come back bit for bit");
 }
 
 void Run(Bytes bytes)
 {
     PropList list;
-    zebcore::proplist::utils::ReadPropList(TextOf(bytes), list);
+    if (!zebcore::proplist::utils::ReadPropList(TextOf(bytes), list))
+        return;
     const PresetData preset(list);
     CheckChunk(preset);
     CheckValues(preset);
