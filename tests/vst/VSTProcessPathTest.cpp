@@ -1,4 +1,5 @@
-// What a plug-in may ask its host in the middle of a block: the answers may not allocate, free, lock or call the system.
+// What a plug-in may ask its host in the middle of a block: the answers may not allocate, free, lock or call the
+// system.
 
 #include "host/src/VST/src/VSTAudioFilter.h"
 #include "tests/support/RealtimeGuard.h"
