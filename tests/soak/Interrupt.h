@@ -1,0 +1,11 @@
+#pragma once
+
+namespace soak::interrupt
+{
+
+/// From now on Ctrl-C and a request to terminate end the run early, with its verdict.
+void Watch();
+
+bool IsRequested();
+
+} // namespace soak::interrupt

@@ -1,0 +1,37 @@
+#include "Ledger.h"
+
+#include <algorithm>
+
+namespace soak
+{
+
+Ledger::Ledger(const std::vector<std::string>& names)
+{
+    for (const std::string& name : names)
+    {
+        mAccounts.push_back({name});
+    }
+}
+
+void Ledger::AddTurn(std::size_t index, int lives, int editors, const Resources& before, const Resources& after)
+{
+    Account& account = mAccounts[index];
+    ++account.turns;
+    account.lives += lives;
+    account.editors += editors;
+    account.growth += static_cast<std::ptrdiff_t>(after.inUse) - static_cast<std::ptrdiff_t>(before.inUse);
+    account.descriptors += after.descriptors - before.descriptors;
+    account.threads += after.threads - before.threads;
+}
+
+std::vector<Ledger::Account> Ledger::Worst(std::size_t most) const
+{
+    std::vector<Account> worst;
+    std::copy_if(mAccounts.begin(), mAccounts.end(), std::back_inserter(worst),
+                 [](const Account& account) { return account.HasLeft(); });
+    std::sort(worst.begin(), worst.end(), [](const Account& a, const Account& b) { return a.growth > b.growth; });
+    worst.resize(std::min(worst.size(), most));
+    return worst;
+}
+
+} // namespace soak

@@ -1,0 +1,34 @@
+#pragma once
+
+#include <condition_variable>
+#include <functional>
+#include <mutex>
+#include <thread>
+
+namespace soak
+{
+
+/// The application's audio thread: one for the whole run, which takes denormal numbers as zero.
+class ProcessThread
+{
+public:
+    ProcessThread();
+    ~ProcessThread();
+    ProcessThread(const ProcessThread&) = delete;
+    ProcessThread& operator=(const ProcessThread&) = delete;
+
+    /// Runs the work there, and the main thread's loop here, until the work is done. [main]
+    void Run(const std::function<void()>& work);
+
+private:
+    void Serve();
+    bool IsDoneWithin(unsigned int milliseconds);
+
+    std::mutex mMutex;
+    std::condition_variable mChanged;
+    std::function<void()> mWork; // empty when there is none
+    bool mEnds = false;
+    std::thread mThread;
+};
+
+} // namespace soak

@@ -1,0 +1,90 @@
+#include "Subject.h"
+
+#include "ControlFilter.h"
+#include "foundation/zebcore/MainThreadLoop.h"
+#include "foundation/zebcore/NativePath.h"
+#include "foundation/zebcore/StringConversion.h"
+#include "host/AudioFilterDescriptorManager.h"
+#include "host/PluginModuleInfoManager.h"
+#include "host/PluginModuleScanner.h"
+
+#include <algorithm>
+#include <cctype>
+
+namespace soak
+{
+
+using namespace zebaudiofilterhost;
+
+namespace
+{
+
+void Scan()
+{
+    std::vector<PluginLocator> gone;
+    PluginModuleInfoManager& infos = PluginModuleInfoManager::GetInstance();
+    infos.ResetToDefaultFolders();
+    const boost::intrusive_ptr<PluginModuleScanner> scanner(
+        new PluginModuleScanner(infos.CollectPotentialPlugins(false, gone), false));
+    scanner->BeginScan();
+    while (scanner->ContinueScan())
+    {
+        zebcore::threads::PumpMainThread();
+    }
+    scanner->EndScan();
+}
+
+const char* TechnologyName(const AudioFilterDescriptor& descriptor)
+{
+    switch (descriptor.GetLocator().GetTechnologyType())
+    {
+    case kTechnologyVST:
+        return "VST 2";
+    case kTechnologyVST3:
+        return "VST 3";
+    case kTechnologyAudioUnit:
+        return "Audio Unit";
+    default:
+        return "built in";
+    }
+}
+
+std::string Lowered(std::string text)
+{
+    std::transform(text.begin(), text.end(), text.begin(),
+                   [](unsigned char letter) { return static_cast<char>(std::tolower(letter)); });
+    return text;
+}
+
+Subject ToSubject(const AudioFilterDescriptor& descriptor, const std::vector<std::string>& withoutEditor)
+{
+    const UTF16String padded = descriptor.GetName();
+    const std::string name = zebcore::utility::NarrowFromUTF16(padded.substr(0, padded.find(u'\0')));
+    const std::string path = zebcore::filesupport::ToNativePath(descriptor.GetLocator().GetPath());
+    const bool withEditor =
+        std::none_of(withoutEditor.begin(), withoutEditor.end(),
+                     [&path](const std::string& part) { return path.find(part) != std::string::npos; });
+    return {descriptor.GetUniqueID(), name + " (" + TechnologyName(descriptor) + ")", withEditor};
+}
+
+} // namespace
+
+std::vector<Subject> FindSubjects(const std::string& only, const std::vector<std::string>& withoutEditor)
+{
+    Scan();
+    std::vector<Subject> subjects;
+    const auto& catalogue = AudioFilterDescriptorManager::GetInstance();
+    for (auto descriptor = catalogue.InfoBegin(); descriptor != catalogue.InfoEnd(); ++descriptor)
+    {
+        Subject subject = ToSubject(**descriptor, withoutEditor);
+        if (subject.id == kControlFilterID || Lowered(subject.name).find(Lowered(only)) != std::string::npos)
+        {
+            subjects.push_back(std::move(subject));
+        }
+    }
+    // The order of a folder's entries must not change what a seed gives.
+    std::sort(subjects.begin(), subjects.end(), [](const Subject& a, const Subject& b) { return a.id < b.id; });
+    return subjects;
+}
+
+} // namespace soak
