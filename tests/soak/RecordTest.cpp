@@ -1,0 +1,95 @@
+#include "Record.h"
+#include "Ledger.h"
+
+#include <gmock/gmock.h>
+
+#include <functional>
+
+namespace soak
+{
+namespace
+{
+
+using testing::ElementsAre;
+
+constexpr int kSamples = 120;
+constexpr double kMega = 1e6;
+
+// A run of two minutes that holds what `change` makes of 100 MB, 10 descriptors and 3 threads at each second.
+std::vector<Check::Outcome> OutcomesOf(const std::function<void(int, Resources&)>& change, int samples = kSamples)
+{
+    std::vector<Sample> row;
+    for (int second = 0; second <= samples; ++second)
+    {
+        Resources resources{static_cast<std::size_t>(100 * kMega), static_cast<std::size_t>(50 * kMega), 10, 3};
+        change(second, resources);
+        row.push_back({static_cast<double>(second), resources});
+    }
+    std::vector<Check::Outcome> outcomes;
+    for (const Check& check : JudgeResources(row))
+    {
+        outcomes.push_back(check.outcome);
+    }
+    return outcomes;
+}
+
+constexpr auto kHolds = Check::Outcome::Holds;
+constexpr auto kFails = Check::Outcome::Fails;
+
+TEST(RecordTest, TellsSteadyGrowthFromNoise)
+{
+    EXPECT_THAT(OutcomesOf([](int, Resources&) {}), ElementsAre(kHolds, kHolds, kHolds, kHolds));
+    // A single peak at the end is no growth, nor is a fifth more for a moment ahead of the last quarter.
+    EXPECT_THAT(OutcomesOf([](int second, Resources& resources)
+                           { resources.resident += second % 15 == 14 || second == 80 ? 20000000 : 0; }),
+                ElementsAre(kHolds, kHolds, kHolds, kHolds));
+    // From the middle of the first quarter to that of the last are 90 s: 6 % are too much, 4 % are not.
+    EXPECT_THAT(OutcomesOf([](int second, Resources& resources)
+                           { resources.resident += static_cast<std::size_t>(second * 0.06 / 90 * 101 * kMega); }),
+                ElementsAre(kFails, kHolds, kHolds, kHolds));
+    EXPECT_THAT(OutcomesOf([](int second, Resources& resources)
+                           { resources.inUse += static_cast<std::size_t>(second * 0.06 / 90 * 51 * kMega); }),
+                ElementsAre(kHolds, kFails, kHolds, kHolds));
+    EXPECT_THAT(OutcomesOf([](int second, Resources& resources)
+                           { resources.inUse += static_cast<std::size_t>(second * 0.04 / 90 * 50 * kMega); }),
+                ElementsAre(kHolds, kHolds, kHolds, kHolds));
+}
+
+TEST(RecordTest, CountsAtBothEnds)
+{
+    EXPECT_THAT(OutcomesOf([](int second, Resources& resources) { resources.descriptors += second == kSamples; }),
+                ElementsAre(kHolds, kHolds, kFails, kHolds));
+    EXPECT_THAT(OutcomesOf([](int second, Resources& resources) { resources.threads += second == kSamples; }),
+                ElementsAre(kHolds, kHolds, kHolds, kFails));
+    EXPECT_THAT(OutcomesOf([](int second, Resources& resources) { resources.threads += second == kSamples / 2; }),
+                ElementsAre(kHolds, kHolds, kHolds, kHolds));
+}
+
+TEST(RecordTest, JudgesNoMemoryOfAShortRun)
+{
+    EXPECT_THAT(OutcomesOf([](int second, Resources& resources)
+                           { resources.inUse *= static_cast<std::size_t>(1 + second); },
+                           30),
+                ElementsAre(Check::Outcome::NotJudged, Check::Outcome::NotJudged, kHolds, kHolds));
+}
+
+TEST(LedgerTest, PutsWhatStaysDownToItsEffect)
+{
+    Ledger ledger({"tight", "leaks", "leaks more", "keeps a descriptor"});
+    const Resources before{0, 1000, 10, 3};
+    ledger.AddTurn(0, 5, 1, before, before);
+    ledger.AddTurn(1, 5, 1, before, {0, 1050, 10, 3});
+    ledger.AddTurn(1, 5, 1, before, {0, 1050, 10, 3});
+    ledger.AddTurn(2, 5, 1, before, {0, 1900, 10, 3});
+    ledger.AddTurn(3, 5, 1, before, {0, 990, 11, 3});
+    std::vector<std::string> names;
+    for (const Ledger::Account& account : ledger.Worst(5))
+    {
+        names.push_back(account.name);
+    }
+    EXPECT_THAT(names, ElementsAre("leaks more", "leaks", "keeps a descriptor"));
+    EXPECT_EQ(ledger.Accounts()[1].PerLife(), 10.0);
+}
+
+} // namespace
+} // namespace soak
