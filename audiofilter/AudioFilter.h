@@ -103,7 +103,8 @@ public:
     /// channel that a map names; without, one for each channel of the plug-in. `frames` must not exceed the block
     /// size. A set bit of inFlags says that the input holds silence: its buffer is not given to the plug-in, but with
     /// mapping it must still be there and be zero, since what passes by is read. A set bit of outFlags says that
-    /// the output may be taken as silent without reading it; the plug-in's own bits come in its channel order.
+    /// the output may be taken as silent without reading it; the plug-in's own bits come in its channel order. The
+    /// input and the output of a channel may be one buffer; no others may overlap.
     /// [process]
     virtual void ProcessWithMapping(float** in, float** out, int frames, ChannelFlags inFlags,
                                     ChannelFlags& outFlags);
@@ -429,6 +430,10 @@ protected:
     /// Sizes the render arrays, the scratch buffers and the delay line. Resume calls it. [main, suspended]
     void BuildChannelMaps();
 
+    /// False as long as nobody has asked for the automated-parameter signal: then firing it, which locks and counts
+    /// even when nobody listens, can be left out. [any]
+    bool CanAutomationBeHeard() const { return mAutomationCanBeHeard.load(std::memory_order_relaxed); }
+
     /// Rewrites the render arrays in place, so that running audio follows the maps; arrays whose size has changed
     /// wait for Resume. [main]
     void UpdateChannelMapArraysForRendering();
@@ -451,10 +456,13 @@ private:
     unsigned int LatencyForDelayLine() const;
     void CollectRenderIndices(RenderIndices& indices) const;
 
+    bool IsRoutedStraight(const RenderIndices& indices) const;
     float** RouteInputs(float** in, bool mapped, ChannelFlags& flags);
     float** RouteOutputs(float** out);
     void MarkSilentChannels(ChannelFlags& flags);
-    void PassDelayedChannels(float** in, float** out, int frames, ChannelFlags& flags);
+    void PassChannels(float** in, float** out, int frames, ChannelFlags& flags);
+    void PassAtOnce(float** in, float** out, unsigned int frames, ChannelFlags& flags);
+    void PassDelayed(float** in, float** out, unsigned int frames, ChannelFlags& flags);
 
     // The order is that of destruction, backwards: the connection to the tick goes before the signals above it. No
     // tick can come between, since both belong to the main thread.
@@ -462,6 +470,7 @@ private:
     AutomatedParameterChangeSignal mAutomatedParameterChangeSignal;
     ParameterPropertiesChangedSignal mParameterPropertiesChangedSignal;
     EditingStateSignal mEditingStateSignal;
+    std::atomic<bool> mAutomationCanBeHeard{false}; // Once set, stays; who connects orders nothing else by it
 
 protected:
     RenderingContext mRenderingContext = kRenderingContext_Realtime;
@@ -505,6 +514,12 @@ private:
     std::vector<int> mOutputChannelIndices; // Application channel of each plug-in output
     std::vector<int> mDelayedChannels;      // Application channels that pass by the plug-in
     std::vector<int> mSilentChannels;       // Application channels that only feed the plug-in
+
+    // Each plug-in channel is the application's of the same number, and none feeds it alone or passes by: a block may
+    // pass the application's own pointers. Says nothing while maps are not in use. As good as the elements above.
+    std::atomic<bool> mRoutedStraight{false};
+    bool mDelaying = false;                  // There is a latency, so the delay line takes in every block
+    unsigned long long mPluginInputBits = 0; // The bits of mInputPointers
 
     std::vector<float*> mInputPointers;
     std::vector<float*> mOutputPointers;

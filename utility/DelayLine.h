@@ -48,7 +48,20 @@ public:
     /// with more frames than the buffer size. Valid until the next operation. Does not allocate. [process]
     float** GetDelayedOutput(unsigned int frames);
 
+    /// Copies one channel's delayed samples for the block just written, without the detour over the room past the
+    /// ring's end. False, with nothing written, on an invalid line, without such a channel, or with more frames than
+    /// the buffer size. Does not allocate. [process]
+    bool CopyDelayedOutput(unsigned int channel, unsigned int frames, float* target) const;
+
 private:
+    /// Where a block of so many frames, the last that was written, lies in the ring.
+    struct Place
+    {
+        int start;
+        int past; // Frames that lie at the ring's start and belong behind its end; may be negative
+    };
+    Place FindDelayed(unsigned int frames) const;
+
     struct FreeSamples
     {
         void operator()(float* samples) const noexcept;

@@ -8,6 +8,7 @@
 #include <boost/smart_ptr/intrusive_ptr.hpp>
 
 #include <atomic>
+#include <cstddef>
 #include <vector>
 
 namespace zebaudiofilterhost
@@ -61,7 +62,8 @@ private:
     void RunMainStages();
 
     MessageRing mRing;
-    MessageList mMessages; // All living messages, in order of posting; main thread only
+    MessageList mMessages;        // All living messages, in order of posting; main thread only
+    std::size_t mFirstToLook = 0; // No message ahead of it is pending; main thread only
     std::atomic<bool> mProcessing;
     bool mRunningMainStages = false; // Main thread only
 };

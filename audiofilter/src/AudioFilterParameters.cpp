@@ -14,7 +14,8 @@ int AudioFilter::GetParameterCount() const
 void AudioFilter::SetParameterAutomated(int index, float value)
 {
     SetParameter(index, value);
-    mAutomatedParameterChangeSignal(index, value);
+    if (CanAutomationBeHeard())
+        mAutomatedParameterChangeSignal(index, value);
 }
 
 void AudioFilter::SetParameter(int, float)

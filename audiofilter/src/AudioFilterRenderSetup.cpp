@@ -22,6 +22,13 @@ std::size_t SizeOf(int count)
     return static_cast<std::size_t>(std::max(count, 0));
 }
 
+// Channels count modulo 64.
+unsigned long long BitsOfFirst(std::size_t channels)
+{
+    constexpr std::size_t kBits = 64;
+    return channels >= kBits ? ~0ULL : (1ULL << channels) - 1;
+}
+
 // The element stores are all that the process thread sees, and each index stands for itself: no order is needed.
 void Store(int& element, int value)
 {
@@ -76,27 +83,33 @@ void AudioFilter::BuildChannelMaps()
 {
     mSilenceBuffer.resize(SizeOf(mBlockSize));
     mDiscardBuffer.resize(SizeOf(mBlockSize));
+    const std::size_t inputs = SizeOf(GetNumberOfInputChannels());
+    mPluginInputBits = BitsOfFirst(inputs);
     if (!GetUseChannelMap())
     {
-        mInputPointers.resize(SizeOf(GetNumberOfInputChannels()));
+        mInputPointers.resize(inputs);
         return;
     }
 
     const boost::unique_lock<boost::recursive_mutex> lock(mChannelMapMutex);
-    const std::size_t inputs = SizeOf(GetNumberOfInputChannels());
     const std::size_t outputs = SizeOf(GetNumberOfOutputChannels());
     const int mainChannels = mMainTargetBus.GetChannelCount();
     mInputChannelIndices.assign(inputs, -1);
     mInputPointers.assign(inputs, mSilenceBuffer.data());
     mDelayLine.reset();
+    mDelaying = false;
     mDelayedChannels.assign(SizeOf(mainChannels), -1);
     mSilentChannels.assign(SizeOf(mainChannels), -1);
     mOutputChannelIndices.assign(outputs, -1);
     mOutputPointers.assign(outputs, mDiscardBuffer.data());
     // Without outputs nothing passes by either: the application keeps what it has.
     if (!mOutputBuses.empty() && mainChannels > 0)
-        mDelayLine = new DelayLine(static_cast<unsigned int>(std::max(mBlockSize, 0)), LatencyForDelayLine(),
+    {
+        const unsigned int latency = LatencyForDelayLine();
+        mDelayLine = new DelayLine(static_cast<unsigned int>(std::max(mBlockSize, 0)), latency,
                                    static_cast<unsigned int>(mainChannels));
+        mDelaying = latency > 0;
+    }
     UpdateChannelMapArraysForRendering();
 }
 
@@ -118,10 +131,29 @@ void AudioFilter::UpdateChannelMapArraysForRendering()
         std::vector<int>(mInputChannelIndices.size(), -1), std::vector<int>(mOutputChannelIndices.size(), -1),
         std::vector<int>(mDelayedChannels.size(), -1), std::vector<int>(mSilentChannels.size(), -1)};
     CollectRenderIndices(indices);
+    // A block that misses either store finds a complete map, the old one or the new one.
+    mRoutedStraight.store(false, std::memory_order_relaxed);
     Publish(indices.inputs, mInputChannelIndices);
     Publish(indices.outputs, mOutputChannelIndices);
     Publish(indices.delayed, mDelayedChannels);
     Publish(indices.silent, mSilentChannels);
+    mRoutedStraight.store(IsRoutedStraight(indices), std::memory_order_relaxed);
+}
+
+bool AudioFilter::IsRoutedStraight(const RenderIndices& indices) const
+{
+    const auto isIdentity = [](const std::vector<int>& channels)
+    {
+        int next = 0;
+        return !channels.empty() &&
+               std::all_of(channels.begin(), channels.end(), [&next](int channel) { return channel == next++; });
+    };
+    const auto isEmpty = [](const std::vector<int>& list)
+    {
+        return list.empty() || list.front() < 0;
+    };
+    return isIdentity(indices.inputs) && isIdentity(indices.outputs) && isEmpty(indices.delayed) &&
+           isEmpty(indices.silent);
 }
 
 void AudioFilter::CollectRenderIndices(RenderIndices& indices) const

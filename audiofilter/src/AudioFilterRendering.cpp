@@ -1,6 +1,7 @@
 // The process thread's road through a filter: nothing here may lock, allocate, free or call the system.
 #include "audiofilter/AudioFilter.h"
 
+#include "audiofilter/src/FloatingPointMode.h"
 #include "foundation/zebaccelerate/FloatBuffer.h"
 
 namespace zebaudiofilterhost
@@ -32,20 +33,27 @@ void AudioFilter::Process(float**, float**, int, ChannelFlags, ChannelFlags& out
 void AudioFilter::ProcessWithMapping(float** in, float** out, int frames, ChannelFlags inFlags,
                                      ChannelFlags& outFlags)
 {
+    const FloatingPointMode mode;
     const bool mapped = GetUseChannelMap();
+    const bool straight = !mapped || mRoutedStraight.load(std::memory_order_relaxed);
     ChannelFlags pluginFlags = inFlags;
-    float** const inputs = RouteInputs(in, mapped, pluginFlags);
-    float** const outputs = mapped ? RouteOutputs(out) : out;
+    float** inputs = in;
+    float** outputs = out;
+    if (straight && !inFlags.IsSet(mPluginInputBits))
+        pluginFlags = ChannelFlags(~mPluginInputBits);
+    else
+        inputs = RouteInputs(in, mapped, pluginFlags);
+    if (!straight)
+        outputs = RouteOutputs(out);
 
     PumpFromProcessThread(); // Parameter changes reach the plug-in ahead of this block
 
     ChannelFlags result;
     Process(inputs, outputs, frames, pluginFlags, result);
-    if (mapped)
-    {
+    if (!straight)
         MarkSilentChannels(result);
-        PassDelayedChannels(in, out, frames, result);
-    }
+    if (mapped && (!straight || mDelaying))
+        PassChannels(in, out, frames, result);
     outFlags = result;
 }
 
@@ -94,21 +102,43 @@ void AudioFilter::MarkSilentChannels(ChannelFlags& flags)
     }
 }
 
-void AudioFilter::PassDelayedChannels(float** in, float** out, int frames, ChannelFlags& flags)
+void AudioFilter::PassChannels(float** in, float** out, int frames, ChannelFlags& flags)
 {
     if (mDelayedChannels.empty() || !mDelayLine)
         return;
     const auto count = static_cast<unsigned int>(frames);
-    mDelayLine->WriteData(in, count);
-    float** const delayed = mDelayLine->GetDelayedOutput(count);
-    if (delayed == nullptr) // There was no memory for the line, or it was made for smaller blocks
-        return;
+    if (mDelaying)
+        PassDelayed(in, out, count, flags);
+    else
+        PassAtOnce(in, out, count, flags);
+}
+
+// Without latency the line would give back what was just written: nothing of it is ever needed again.
+void AudioFilter::PassAtOnce(float** in, float** out, unsigned int frames, ChannelFlags& flags)
+{
     for (int& element : mDelayedChannels)
     {
         const int channel = Load(element);
         if (channel < 0)
             return;
-        zebaccelerate::utility::Copy(count, delayed[channel], out[channel]);
+        if (in[channel] != out[channel])
+            zebaccelerate::utility::Copy(frames, in[channel], out[channel]);
+        flags.Clear(BitOf(channel));
+    }
+}
+
+// The line takes in all channels, also those that the plug-in has now: an edit of the maps may send any of them past
+// it, and what it played before comes first.
+void AudioFilter::PassDelayed(float** in, float** out, unsigned int frames, ChannelFlags& flags)
+{
+    mDelayLine->WriteData(in, frames);
+    for (int& element : mDelayedChannels)
+    {
+        const int channel = Load(element);
+        if (channel < 0)
+            return;
+        if (!mDelayLine->CopyDelayedOutput(static_cast<unsigned int>(channel), frames, out[channel]))
+            return; // There was no memory for the line, or it was made for smaller blocks
         flags.Clear(BitOf(channel));
     }
 }

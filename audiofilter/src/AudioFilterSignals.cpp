@@ -8,6 +8,7 @@ using boost::signals2::connection;
 
 AudioFilter::AutomatedParameterChangeSignal& AudioFilter::GetAutomatedParameterChangeSignal()
 {
+    mAutomationCanBeHeard.store(true, std::memory_order_relaxed);
     return mAutomatedParameterChangeSignal;
 }
 
@@ -23,7 +24,7 @@ AudioFilter::SuspendedStateChangedSignal& AudioFilter::GetSuspendedStateChangedS
 
 connection AudioFilter::ConnectAutomatedParameterChange(const AutomatedParameterChangeSignal::slot_type& slot)
 {
-    return mAutomatedParameterChangeSignal.connect(slot);
+    return GetAutomatedParameterChangeSignal().connect(slot);
 }
 
 connection AudioFilter::ConnectParameterPropertiesChanged(const ParameterPropertiesChangedSignal::slot_type& slot)

@@ -233,6 +233,43 @@ TEST_F(RenderingTest, EditsReachARunningFilter)
     EXPECT_EQ(mFlags.Value() & 0b1111, 0b1000ULL); // 3 feeds only, 2 passes by, 0 and 1 are written
 }
 
+TEST_F(RenderingTest, EditsReachARunningFilterWhoseMapsWereTheIdentity)
+{
+    const std::map<int, int> identity = {{0, 0}, {1, 1}};
+    const std::map<int, int> swapped = {{0, 1}, {1, 0}};
+    Start({2}, {2}, 2, identity, identity);
+    for (int round = 0; round < 2; ++round)
+    {
+        mFilter->SetChannelMap(MakeMap(2, swapped), kInput);
+        EXPECT_THAT(Block().in, ElementsAre(mIn.Channel(1), mIn.Channel(0)));
+        EXPECT_THAT(Block().out, ElementsAre(mOut.Channel(0), mOut.Channel(1)));
+        mFilter->SetChannelMap(MakeMap(2, swapped), kOutput);
+        EXPECT_THAT(Block().out, ElementsAre(mOut.Channel(1), mOut.Channel(0)));
+        mFilter->SetChannelMap(MakeMap(2, identity), kInput);
+        mFilter->SetChannelMap(MakeMap(2, identity), kOutput);
+        EXPECT_THAT(Block().in, ElementsAre(mIn.Channel(0), mIn.Channel(1)));
+        EXPECT_THAT(Block().out, ElementsAre(mOut.Channel(0), mOut.Channel(1)));
+        EXPECT_EQ(Block(0b10).inFlags.Value(), ~0b01ULL);
+        EXPECT_NE(Block(0b10).in[1], mIn.Channel(1)); // Silence of its own
+    }
+}
+
+TEST_F(RenderingTest, AChannelThatComesToPassBringsWhatItPlayedBefore)
+{
+    for (const int latency : {0, kFrames})
+    {
+        Start({2}, {2}, 2, {{0, 0}, {1, 1}}, {{0, 0}, {1, 1}}, latency);
+        mIn.Fill(1.0F);
+        Block();
+        mFilter->RemoveChannelMapping(kInput, 1);
+        mFilter->RemoveChannelMapping(kOutput, 1);
+        mIn.Fill(2.0F);
+        mOut.Fill(0.0F);
+        Block();
+        EXPECT_EQ(mOut.Channel(1)[0], latency == 0 ? 2.0F : 1.0F) << latency;
+    }
+}
+
 TEST_F(RenderingTest, EditsOfASuspendedFilterWaitForResume)
 {
     Start({1}, {1}, 2, {{0, 0}}, {{0, 0}});

@@ -56,6 +56,10 @@ TEST_P(DelayLineRun, GivesBackWhatWasWrittenDelayFramesAgo)
     {
         const unsigned int frames = run.blocks[static_cast<std::size_t>(round) % run.blocks.size()];
         line->WriteData(source.Next(frames), frames);
+        // First, since the other fills the room past the ring's end
+        std::vector<float> copied(frames + 1, 0.5F);
+        ASSERT_TRUE(line->CopyDelayedOutput(1, frames, copied.data()));
+        ASSERT_EQ(copied[frames], 0.5F);
         float** const out = line->GetDelayedOutput(frames);
         ASSERT_NE(out, nullptr);
         for (unsigned int i = 0; i < frames; ++i)
@@ -64,6 +68,7 @@ TEST_P(DelayLineRun, GivesBackWhatWasWrittenDelayFramesAgo)
             const float expected = position > 0 ? static_cast<float>(position) : 0.0F;
             ASSERT_EQ(out[0][i], expected) << "block " << round << ", frame " << i;
             ASSERT_EQ(out[1][i], -expected);
+            ASSERT_EQ(copied[i], -expected);
         }
     }
 }
@@ -124,6 +129,7 @@ TEST(DelayLine, InvalidLineIsHarmless)
     Source source;
     empty.WriteData(source.Next(1), 1);
     EXPECT_EQ(empty.GetDelayedOutput(1), nullptr);
+    EXPECT_FALSE(empty.CopyDelayedOutput(0, 1, nullptr));
 
     DelayLine tooLarge(1U << 31, 1U << 31, 64); // More than the counts can say
     tooLarge.WriteData(source.Next(1), 1);
@@ -132,8 +138,10 @@ TEST(DelayLine, InvalidLineIsHarmless)
     EXPECT_FALSE(tooLarge.SetBufferSize(1U << 31));
 
     const auto deleted = LineWithSamples(0);
+    EXPECT_FALSE(deleted->CopyDelayedOutput(2, 4, nullptr)); // No such channel
     deleted->DeleteAudioBuffer();
     EXPECT_EQ(deleted->GetDelayedOutput(1), nullptr);
+    EXPECT_FALSE(deleted->CopyDelayedOutput(0, 1, nullptr));
     EXPECT_TRUE(deleted->SetBufferSize(4)); // The same size, but there is no storage to keep
     EXPECT_NE(deleted->GetDelayedOutput(4), nullptr);
 }

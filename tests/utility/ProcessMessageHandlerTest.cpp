@@ -97,6 +97,19 @@ TEST_F(ProcessMessageHandlerTest, MessageGoesBackAndForthAsOftenAsItNeeds)
     EXPECT_EQ(message->GetState(), Message::kState_Finished);
 }
 
+TEST_F(ProcessMessageHandlerTest, AMessageThatComesBackGoesAheadOfLaterOnes)
+{
+    Post(0);
+    const auto message = Post(1);
+    message->mRefusalsOnProcessThread = 1;
+    message->mRefusalsOnMainThread = 1;
+    Post(2);
+    mHandler.PumpFromMainThread();
+    Post(3);
+    mHandler.PumpFromMainThread();
+    EXPECT_THAT(WithoutDestructions(), ElementsAre("p0", "p1", "p2", "m1", "p1", "p3"));
+}
+
 TEST_F(ProcessMessageHandlerTest, MainPumpLeavesTheRingToTheProcessThread)
 {
     mHandler.SetProcessing(true);

@@ -3,6 +3,8 @@
 
 #include "foundation/zebaccelerate/FloatBuffer.h"
 
+#include <algorithm>
+
 namespace zebaudiofilterhost
 {
 
@@ -46,25 +48,41 @@ void DelayLine::AppendWrapped(float** channelData, unsigned int frames)
     mWritePosition = over;
 }
 
+DelayLine::Place DelayLine::FindDelayed(unsigned int frames) const
+{
+    const int ringLength = static_cast<int>(mRingLength);
+    const int tail = static_cast<int>(mWritePosition) - static_cast<int>(mDelay);
+    const int wrap = tail - static_cast<int>(frames) < 0 ? ringLength : 0;
+    return {tail - static_cast<int>(frames) + wrap, tail + wrap - ringLength};
+}
+
 float** DelayLine::GetDelayedOutput(unsigned int frames)
 {
     if (!mValid || frames > mBufferSize) // A larger block would begin in front of the ring
         return nullptr;
 
-    const int ringLength = static_cast<int>(mRingLength);
-    const int tail = static_cast<int>(mWritePosition) - static_cast<int>(mDelay);
-    const int wrap = tail - static_cast<int>(frames) < 0 ? ringLength : 0;
-    const int start = tail - static_cast<int>(frames) + wrap;
-    const int past = tail + wrap - ringLength; // Frames that lie at the ring's start and belong behind its end
-
+    const Place place = FindDelayed(frames);
     for (unsigned int channel = 0; channel < mChannels; ++channel)
     {
         float* samples = mChannelPointers[channel];
-        if (past > 0)
-            Copy(static_cast<unsigned int>(past), samples, samples + ringLength);
-        mOutputPointers[channel] = samples + start;
+        if (place.past > 0)
+            Copy(static_cast<unsigned int>(place.past), samples, samples + mRingLength);
+        mOutputPointers[channel] = samples + place.start;
     }
     return mOutputPointers.get();
+}
+
+bool DelayLine::CopyDelayedOutput(unsigned int channel, unsigned int frames, float* target) const
+{
+    if (!mValid || frames > mBufferSize || channel >= mChannels)
+        return false;
+    const Place place = FindDelayed(frames);
+    const auto past = static_cast<unsigned int>(std::max(place.past, 0));
+    const unsigned int head = frames - past;
+    Copy(head, mChannelPointers[channel] + place.start, target);
+    if (past > 0)
+        Copy(past, mChannelPointers[channel], target + head);
+    return true;
 }
 
 } // namespace zebaudiofilterhost

@@ -65,8 +65,10 @@ void ProcessMessageHandler::SetProcessing(bool processing)
 
 void ProcessMessageHandler::TransferMessagesToQueue()
 {
-    for (const boost::intrusive_ptr<Message>& message : mMessages)
+    // From where the last look ended: an application that posts many messages at once has each looked at once.
+    for (; mFirstToLook < mMessages.size(); ++mFirstToLook)
     {
+        const boost::intrusive_ptr<Message>& message = mMessages[mFirstToLook];
         if (message->GetState() != Message::kState_Pending)
             continue;
         message->SetState(Message::kState_Queued); // First, since the consumer may finish it at once
@@ -86,15 +88,20 @@ void ProcessMessageHandler::RunMainStages()
     // By index and with a reference: a stage may post, which moves the list, or flush, which shortens it.
     for (std::size_t i = 0; i < mMessages.size(); ++i) // NOLINT(modernize-loop-convert)
     {
+        if (mMessages[i]->GetState() != Message::kState_ProcessDone)
+            continue;
         const boost::intrusive_ptr<Message> message = mMessages[i];
-        if (message->GetState() == Message::kState_ProcessDone)
-            message->SetState(message->ExecuteOnMainThread() ? Message::kState_Finished : Message::kState_Pending);
+        const bool done = message->ExecuteOnMainThread();
+        message->SetState(done ? Message::kState_Finished : Message::kState_Pending);
+        if (!done)
+            mFirstToLook = 0; // Not its index, which a flush in the stage may have changed
     }
 }
 
 void ProcessMessageHandler::PurgeProcessedMessages()
 {
     std::vector<Message*> finished;
+    finished.reserve(mMessages.size());
     for (const boost::intrusive_ptr<Message>& message : mMessages)
     {
         if (message->GetState() == Message::kState_Finished)
@@ -111,6 +118,7 @@ void ProcessMessageHandler::PurgeProcessedMessages()
     // Released last, when the list is in order again: a message may hold the last reference to this object's owner.
     const MessageList doomed(std::make_move_iterator(deletable), std::make_move_iterator(mMessages.end()));
     mMessages.erase(deletable, mMessages.end());
+    mFirstToLook = 0; // Places have changed
 }
 
 bool ProcessMessageHandler::CanDeleteMessage(boost::intrusive_ptr<Message> message)
