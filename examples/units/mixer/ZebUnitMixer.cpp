@@ -1,4 +1,4 @@
-// Two inputs, each with a level, into one output.
+// Two inputs, each with a level, into one output. Inputs and output may have any number of channels.
 
 #include "Unit.h"
 
@@ -15,6 +15,7 @@ public:
         : Unit({.component = component,
                 .parameters = {{kLevelA, "Level A", kAudioUnitParameterUnit_LinearGain, 0.0F, 2.0F, 1.0F},
                                {kLevelB, "Level B", kAudioUnitParameterUnit_LinearGain, 0.0F, 2.0F, 1.0F}},
+                .channels = {{-1, -2}},
                 .inputs = {"Voice", "Music"}})
     {
     }
@@ -33,8 +34,11 @@ protected:
     }
 
 private:
+    // A single channel is heard everywhere.
     static float Sample(const Channels& input, std::size_t channel, UInt32 frame)
     {
+        if (input.size() == 1)
+            return input[0][frame];
         return channel < input.size() ? input[channel][frame] : 0.0F;
     }
 };

@@ -50,6 +50,14 @@ bool Fits(SInt16 member, UInt32 channels)
     return member == -1 || channels <= static_cast<UInt32>(-member);
 }
 
+bool Allows(const AUChannelInfo& pair, UInt32 inputs, UInt32 outputs)
+{
+    if (pair.inChannels == -1 && pair.outChannels == -2)
+        return true; // in this order: any number on each side
+    const bool mustBeEqual = pair.inChannels == -1 && pair.outChannels == -1;
+    return Fits(pair.inChannels, inputs) && Fits(pair.outChannels, outputs) && (!mustBeEqual || inputs == outputs);
+}
+
 void SetNumber(CFMutableDictionaryRef dictionary, CFStringRef key, CFNumberType type, const void* value)
 {
     CFNumberRef number = CFNumberCreate(nullptr, type, value);
@@ -109,12 +117,7 @@ bool Unit::AllowsChannels() const
     const UInt32 inputs = mInputFormats.empty() ? 0 : mInputFormats.front().mChannelsPerFrame;
     const UInt32 outputs = mOutputFormat.mChannelsPerFrame;
     return std::any_of(mDescription.channels.begin(), mDescription.channels.end(),
-                       [&](const AUChannelInfo& info)
-                       {
-                           const bool mustBeEqual = info.inChannels == -1 && info.outChannels == -1;
-                           return Fits(info.inChannels, inputs) && Fits(info.outChannels, outputs) &&
-                                  (!mustBeEqual || inputs == outputs);
-                       });
+                       [&](const AUChannelInfo& pair) { return Allows(pair, inputs, outputs); });
 }
 
 const ParameterDescription* Unit::FindParameter(AudioUnitParameterID id) const
