@@ -2,15 +2,17 @@
 
 #include "foundation/zebcore/MainThreadLoop.h"
 #include "host/src/XAU/linux/view/ViewPainter.h"
-#include "tests/xau/support/CFTestObjects.h"
-#include "tests/xau/support/FakeUnit.h"
+#include "tests/xau/support/DescribedUnit.h"
 #include "utility/ThreadUtils.h"
 
 #include <gtest/gtest.h>
 #include <xcb/xcb.h>
 
+#include <array>
 #include <cstdlib>
 #include <cstring>
+#include <numeric>
+#include <set>
 
 namespace zebaudiofilterhost::xau
 {
@@ -69,26 +71,6 @@ protected:
         }
     }
 
-    // Steps 0 to `last` of parameter 1, with names if there are any.
-    void DescribeSteps(Float32 last, const std::vector<const char*>& names)
-    {
-        const FakeUnit::Key key(kAudioUnitProperty_ParameterInfo, kAudioUnitScope_Global, 1);
-        auto info = mUnit.Read<AudioUnitParameterInfo>(key);
-        info.maxValue = last;
-        mUnit.Answer(key, info);
-        const FakeUnit::Key strings(kAudioUnitProperty_ParameterValueStrings, kAudioUnitScope_Global, 1);
-        mUnit.Forget(strings);
-        if (names.empty())
-            return;
-        CFMutableArrayRef array = CFArrayCreateMutable(nullptr, 0, &kCFTypeArrayCallBacks);
-        for (const char* name : names)
-        {
-            const CFOwner text(MakeString(name));
-            CFArrayAppendValue(array, text.get());
-        }
-        mUnit.Answer<CFArrayRef>(strings, array); // the reference is that of the one row that reads it
-    }
-
     void Open()
     {
         mEditor->Open(reinterpret_cast<void*>(static_cast<std::uintptr_t>(mParent)));
@@ -124,11 +106,11 @@ protected:
         return std::set<std::uint32_t>(pixels.begin(), pixels.end()).size();
     }
 
-    void Send(std::uint8_t type, int x, int y, std::uint16_t state = 0) const
+    void Send(std::uint8_t type, int x, int y, std::uint16_t state = 0, xcb_button_t button = 1) const
     {
         xcb_button_press_event_t event = {}; // of the same form as the other two
         event.response_type = type;
-        event.detail = type == XCB_MOTION_NOTIFY ? 0 : 1;
+        event.detail = type == XCB_MOTION_NOTIFY ? xcb_button_t{0} : button;
         event.event = mView;
         event.event_x = static_cast<std::int16_t>(x);
         event.event_y = static_cast<std::int16_t>(y);
@@ -159,9 +141,9 @@ protected:
     }
 
     Float32 Value(AudioUnitParameterID id) { return mUnit.mValues[{kAudioUnitScope_Global, id}]; }
-    int RowMiddle(int row) const { return mEditor->GetEditorRect().bottom / 2 + (row - 1) * 26; }
+    static int RowMiddle(int row) { return ViewGeometry::kMargin + row * ViewGeometry::kRowHeight + 13; }
 
-    FakeUnit mUnit;
+    DescribedUnit mUnit;
     boost::intrusive_ptr<XAUAudioFilter> mFilter;
     boost::intrusive_ptr<AudioFilterEditor> mEditor;
     xcb_connection_t* mConnection = nullptr;
@@ -200,37 +182,73 @@ TEST_F(XAUEditorTest, AClickOnAControlChangesTheParameterWithinAGesture)
     EXPECT_EQ(Value(0), 1.0F);
 }
 
-TEST_F(XAUEditorTest, StepsHaveFieldsWhileTheirTextsFit)
+TEST_F(XAUEditorTest, ALevelIsFollowedAndNotToBeChanged)
 {
-    struct Case
+    mUnit.Describe(0, kAudioUnitParameterUnit_Generic,
+                   kAudioUnitParameterFlag_IsReadable | kAudioUnitParameterFlag_MeterReadOnly);
+    Open();
+    const std::vector<std::uint32_t> before = Pixels();
+    mUnit.mValues[{kAudioUnitScope_Global, 0}] = 0.5F; // told to nobody
+    EXPECT_TRUE(WaitFor([&] { return Pixels() != before; }));
+    Send(XCB_BUTTON_PRESS, mEditor->GetEditorRect().right / 3 + 60, RowMiddle(0));
+    Send(XCB_BUTTON_RELEASE, mEditor->GetEditorRect().right / 3 + 60, RowMiddle(0));
+    Send(XCB_BUTTON_PRESS, mEditor->GetEditorRect().right / 2 - 70, RowMiddle(2));
+    EXPECT_TRUE(WaitFor([&] { return Value(2) == 1.0F; }));
+    EXPECT_EQ(Value(0), 0.5F);
+}
+
+TEST_F(XAUEditorTest, ThousandsOfParametersAreScrolledThrough)
+{
+    constexpr AudioUnitParameterID kCount = 32768;
+    std::vector<AudioUnitParameterID> ids(kCount);
+    std::iota(ids.begin(), ids.end(), 0);
+    mUnit.SetParameters(ids, 0.0F, 1.0F);
+    Open();
+    const auto rect = mEditor->GetEditorRect();
+    EXPECT_LT(rect.bottom, 768);
+    EXPECT_GT(rect.bottom, 400);
+    const int middle = rect.right / 2;
+    const auto click = [&](int row)
     {
-        Float32 last;
-        std::vector<const char*> names;
-        int width;
-        bool hasFields;
-        const char* third; // the text of value 2
+        Send(XCB_BUTTON_PRESS, middle, RowMiddle(row));
+        Send(XCB_BUTTON_RELEASE, middle, RowMiddle(row));
     };
-    const std::vector<const char*> wide = {"Low shelving", "Peak", "High shelving"};
-    for (const Case& steps : {Case{2, {}, 480, true, "2"}, Case{7, {}, 480, true, "2"}, Case{8, {}, 2000, false, "2"},
-                              Case{15, {}, 2000, false, "2"}, Case{100, {}, 2000, false, "2"},
-                              Case{2, {"A", "B", "C"}, 320, true, "C"}, Case{2, wide, 480, false, "High shelving"},
-                              Case{2, wide, 1200, true, "High shelving"}, Case{3, {"A"}, 480, true, "2"}})
+    const auto changed = [&](AudioUnitParameterID id)
     {
-        DescribeSteps(steps.last, steps.names);
-        ParameterRow row(mUnit.GetInstance(), kAudioUnitScope_Global, 1);
-        EXPECT_EQ(HasStepFields(ViewGeometry::Fit(3, steps.width), row), steps.hasFields)
-            << steps.last << " at " << steps.width << ", " << steps.names.size() << " names";
-        row.SetPosition((2.0 + 0.4) / static_cast<double>(steps.last));
-        EXPECT_EQ(Value(1), 2.0F) << "the nearest step of " << steps.last;
-        EXPECT_EQ(row.GetText(), steps.third);
-    }
+        return WaitFor([&] { return Value(id) > 0.2F; });
+    };
+    Send(XCB_BUTTON_PRESS, middle, RowMiddle(0), 0, 4); // the wheel, at the top already
+    click(1);
+    EXPECT_TRUE(changed(1));
+    Send(XCB_BUTTON_PRESS, middle, RowMiddle(0), 0, 5);
+    click(1);
+    EXPECT_TRUE(changed(4)) << "three rows further";
+    Send(XCB_BUTTON_PRESS, rect.right - 3, rect.bottom / 2);
+    Send(XCB_MOTION_NOTIFY, rect.right - 3, rect.bottom - 5);
+    Send(XCB_BUTTON_RELEASE, rect.right - 3, rect.bottom - 5);
+    const auto shown = static_cast<int>(ViewGeometry::Fit(kCount, rect.right, rect.bottom).GetShown());
+    click(shown - 1);
+    EXPECT_TRUE(changed(kCount - 1)) << "the last one of all";
+    EXPECT_EQ(mUnit.mValues.size(), kCount);
+}
+
+TEST_F(XAUEditorTest, AViewThatGoesEndsItsGesture)
+{
+    Open();
+    std::vector<std::string> heard;
+    mFilter->ConnectEditingStateChange([&](int, bool starts) { heard.emplace_back(starts ? "begin" : "end"); });
+    Send(XCB_BUTTON_PRESS, mEditor->GetEditorRect().right / 2, RowMiddle(0));
+    EXPECT_TRUE(WaitFor([&] { return !heard.empty(); }));
+    mEditor->Open(reinterpret_cast<void*>(static_cast<std::uintptr_t>(mParent)));
+    EXPECT_TRUE(WaitFor([&] { return heard.size() == 2; }));
+    EXPECT_EQ(heard, (std::vector<std::string>{"begin", "end"}));
 }
 
 TEST_F(XAUEditorTest, ASliderOfStepsGoesToTheNearest)
 {
-    DescribeSteps(15, {});
+    mUnit.DescribeSteps(15, {});
     Open();
-    const ViewGeometry geometry = ViewGeometry::Fit(3, mEditor->GetEditorRect().right);
+    const ViewGeometry geometry = ViewGeometry::Fit(3, mEditor->GetEditorRect().right, 400);
     // Of 16 fields it would be the third.
     const int place = static_cast<int>(geometry.GetControlLeft() + geometry.GetControlWidth() * 2.8 / 15.0);
     Send(XCB_BUTTON_PRESS, place, RowMiddle(1));

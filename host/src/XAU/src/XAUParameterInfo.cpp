@@ -2,6 +2,7 @@
 
 #include "foundation/zebcore/StringStreams.h"
 #include "host/src/XAU/src/CFOwner.h"
+#include "host/src/XAU/src/CallGuarded.h"
 
 #include <algorithm>
 #include <array>
@@ -65,7 +66,11 @@ int CountSteps(float minimum, float maximum)
 ParameterRecord::ParameterRecord(AudioUnit instance, AudioUnitScope scope, AudioUnitParameterID id)
 {
     UInt32 size = sizeof(mInfo);
-    mIsKnown = AudioUnitGetProperty(instance, kAudioUnitProperty_ParameterInfo, scope, id, &mInfo, &size) == noErr;
+    mIsKnown =
+        CallGuarded(
+            [&] {
+                return AudioUnitGetProperty(instance, kAudioUnitProperty_ParameterInfo, scope, id, &mInfo, &size);
+            }) == noErr;
     const bool releases = mIsKnown && (mInfo.flags & kAudioUnitParameterFlag_CFNameRelease) != 0;
     mName.reset(releases && HasName() ? mInfo.cfNameString : nullptr);
     mUnitName.reset(releases && HasUnitName() ? mInfo.unitName : nullptr);

@@ -1,5 +1,7 @@
 #include "host/src/XAU/linux/view/GenericView.h"
 
+#include "foundation/zebcore/Threads.h"
+
 #include <cairo-xcb.h>
 
 #include <algorithm>
@@ -14,8 +16,13 @@ namespace
 {
 
 constexpr int kOpeningWidth = 480;
+constexpr int kOpeningHeight = 640; // at most: fits the smallest screens
+constexpr int kRowsPerTurn = 3;     // of the wheel
+constexpr unsigned int kLevelMs = 50;
 constexpr float kListenerSeconds = 0.03F;
 constexpr xcb_button_t kLeftButton = 1;
+constexpr xcb_button_t kWheelUp = 4;
+constexpr xcb_button_t kWheelDown = 5;
 constexpr std::uint8_t kSentMask = 0x80; // in an event's type: another client sent it
 
 struct FreeEvent
@@ -49,23 +56,21 @@ xcb_visualtype_t* FindVisual(const xcb_screen_t& screen)
 
 std::unique_ptr<GenericView> GenericView::Create(AudioUnit unit, xcb_window_t parent, boost::function<void()> resized)
 {
-    xcb_connection_t* connection = xcb_connect(nullptr, nullptr);
-    if (xcb_connection_has_error(connection) != 0)
-    {
-        xcb_disconnect(connection);
+    Connection connection(xcb_connect(nullptr, nullptr)); // never null
+    if (xcb_connection_has_error(connection.get()) != 0)
         return nullptr;
-    }
-    std::unique_ptr<GenericView> view(new GenericView(connection, unit, std::move(resized)));
+    std::unique_ptr<GenericView> view(new GenericView(std::move(connection), unit, std::move(resized)));
     if (!view->OpenWindow(parent))
         return nullptr;
     view->Listen();
     return view;
 }
 
-GenericView::GenericView(xcb_connection_t* connection, AudioUnit unit, boost::function<void()> resized)
-    : mConnection(connection)
-    , mRows(ReadParameterRows(unit))
-    , mGeometry(ViewGeometry::Fit(mRows.size(), kOpeningWidth))
+GenericView::GenericView(Connection connection, AudioUnit unit, boost::function<void()> resized)
+    : mConnection(std::move(connection))
+    , mUnit(unit)
+    , mIDs(ReadParameterIDs(unit))
+    , mGeometry(ViewGeometry::Fit(mIDs.size(), kOpeningWidth, kOpeningHeight))
     , mResized(std::move(resized))
 {
 }
@@ -73,71 +78,98 @@ GenericView::GenericView(xcb_connection_t* connection, AudioUnit unit, boost::fu
 GenericView::~GenericView()
 {
     *mIsAlive = false;
+    OnRelease(); // a gesture ends with the view
     if (mListener)
         AUListenerDispose(mListener);
+    zebcore::threads::RemoveTimerWatch(mLevelTimer);
     zebcore::threads::RemoveDescriptorWatch(mWatch);
     // cairo keeps what it knows of a connection under its address, which the next one may get.
     cairo_device_finish(mDevice);
     cairo_device_destroy(mDevice);
-    xcb_disconnect(mConnection); // the window goes with it
 }
 
 bool GenericView::OpenWindow(xcb_window_t parent)
 {
-    const xcb_screen_t* screen = FirstScreen(mConnection);
+    const xcb_screen_t* screen = FirstScreen(mConnection.get());
     mVisual = screen ? FindVisual(*screen) : nullptr;
     if (!mVisual)
         return false;
-    mWindow = xcb_generate_id(mConnection);
+    mWindow = xcb_generate_id(mConnection.get());
     const std::uint32_t events = XCB_EVENT_MASK_EXPOSURE | XCB_EVENT_MASK_BUTTON_PRESS |
                                  XCB_EVENT_MASK_BUTTON_RELEASE | XCB_EVENT_MASK_BUTTON_MOTION;
     // In the order of their bits. A parent of another depth lends neither its border nor its colours.
     const std::array<std::uint32_t, 3> values = {0, events, screen->default_colormap};
     const auto cookie = xcb_create_window_checked(
-        mConnection, screen->root_depth, mWindow, parent, 0, 0, static_cast<std::uint16_t>(mGeometry.width),
+        mConnection.get(), screen->root_depth, mWindow, parent, 0, 0, static_cast<std::uint16_t>(mGeometry.width),
         static_cast<std::uint16_t>(mGeometry.height), 0, XCB_WINDOW_CLASS_INPUT_OUTPUT, screen->root_visual,
         XCB_CW_BORDER_PIXEL | XCB_CW_EVENT_MASK | XCB_CW_COLORMAP, values.data());
-    const Reply<xcb_generic_error_t> error(xcb_request_check(mConnection, cookie));
+    const Reply<xcb_generic_error_t> error(xcb_request_check(mConnection.get(), cookie));
     if (error)
         return false;
-    xcb_map_window(mConnection, mWindow);
-    xcb_flush(mConnection);
+    xcb_map_window(mConnection.get(), mWindow);
+    xcb_flush(mConnection.get());
     return true;
 }
 
 void GenericView::Listen()
 {
-    mWatch =
-        zebcore::threads::AddDescriptorWatch(xcb_get_file_descriptor(mConnection), [this](int) { OnReadable(); });
+    mWatch = zebcore::threads::AddDescriptorWatch(xcb_get_file_descriptor(mConnection.get()),
+                                                  [this](int) { OnReadable(); });
     if (AUEventListenerCreate(OnParameterChanged, this, CFRunLoopGetCurrent(), kCFRunLoopDefaultMode,
                               kListenerSeconds, kListenerSeconds, &mListener) != noErr)
-        return;
-    for (ParameterRow& row : mRows)
-    {
-        AudioUnitEvent event = {};
-        event.mEventType = kAudioUnitEvent_ParameterValueChange;
-        event.mArgument.mParameter = row.GetParameter();
-        AUEventListenerAddEventType(mListener, &row, &event);
-    }
+        mListener = nullptr;
 }
 
 void GenericView::OnParameterChanged(void* userData, void* object, const AudioUnitEvent* /*event*/,
                                      UInt64 /*hostTime*/, AudioUnitParameterValue /*value*/)
 {
     if (static_cast<ParameterRow*>(object)->Refresh())
-        static_cast<GenericView*>(userData)->Paint();
+        static_cast<GenericView*>(userData)->PaintSoon();
+}
+
+ParameterRow& GenericView::GetRow(std::size_t index)
+{
+    const auto known = mRows.find(index);
+    if (known != mRows.end())
+        return known->second;
+    ParameterRow& row = mRows.try_emplace(index, mUnit, kAudioUnitScope_Global, mIDs[index]).first->second;
+    AudioUnitEvent event = {};
+    event.mEventType = kAudioUnitEvent_ParameterValueChange;
+    event.mArgument.mParameter = row.GetParameter();
+    if (mListener)
+        AUEventListenerAddEventType(mListener, &row, &event);
+    if (row.GetControl() == ParameterRow::Control::Level && mLevelTimer == zebcore::threads::kNoWatch)
+        mLevelTimer = zebcore::threads::AddTimerWatch(kLevelMs, [this] { WatchLevels(); });
+    return row;
+}
+
+std::vector<ParameterRow*> GenericView::GetShownRows()
+{
+    std::vector<ParameterRow*> shown;
+    for (std::size_t place = 0; place < mGeometry.GetShown(); ++place)
+        shown.push_back(&GetRow(mGeometry.first + place));
+    return shown;
+}
+
+void GenericView::WatchLevels()
+{
+    bool hasChanged = false;
+    for (ParameterRow* row : GetShownRows())
+        hasChanged = (row->GetControl() == ParameterRow::Control::Level && row->Refresh()) || hasChanged;
+    if (hasChanged)
+        Paint();
 }
 
 void GenericView::OnReadable()
 {
     const std::shared_ptr<bool> isAlive = mIsAlive;
-    while (const Reply<xcb_generic_event_t> event{xcb_poll_for_event(mConnection)})
+    while (const Reply<xcb_generic_event_t> event{xcb_poll_for_event(mConnection.get())})
     {
         OnEvent(*event);
         if (!*isAlive)
             return;
     }
-    if (xcb_connection_has_error(mConnection) != 0)
+    if (xcb_connection_has_error(mConnection.get()) != 0)
         zebcore::threads::RemoveDescriptorWatch(std::exchange(mWatch, zebcore::threads::kNoWatch));
 }
 
@@ -153,7 +185,8 @@ void GenericView::OnEvent(const xcb_generic_event_t& event)
         OnPress(reinterpret_cast<const xcb_button_press_event_t&>(event));
         break;
     case XCB_MOTION_NOTIFY:
-        OnMotion(reinterpret_cast<const xcb_motion_notify_event_t&>(event).event_x);
+        OnMotion(reinterpret_cast<const xcb_motion_notify_event_t&>(event).event_x,
+                 reinterpret_cast<const xcb_motion_notify_event_t&>(event).event_y);
         break;
     case XCB_BUTTON_RELEASE:
         OnRelease();
@@ -165,36 +198,49 @@ void GenericView::OnEvent(const xcb_generic_event_t& event)
 
 void GenericView::OnPress(const xcb_button_press_event_t& event)
 {
-    if (event.detail != kLeftButton || mHeldRow || mHoldsGrip)
+    if (mHeldRow || mHoldsGrip || mHoldsBar)
+        return;
+    if (event.detail == kWheelUp || event.detail == kWheelDown)
+        OnScroll(event.detail == kWheelUp ? -kRowsPerTurn : kRowsPerTurn);
+    if (event.detail != kLeftButton)
         return;
     mHoldsGrip = mGeometry.IsGrip(event.event_x, event.event_y);
-    const auto row = mHoldsGrip ? std::nullopt : mGeometry.FindControl(event.event_x, event.event_y);
-    if (!row || !mRows[*row].IsWritable())
+    mHoldsBar = !mHoldsGrip && mGeometry.IsScrollBar(event.event_x);
+    if (mHoldsBar)
+        Scroll(mGeometry.ScrolledToBar(event.event_y));
+    if (mHoldsGrip || mHoldsBar)
+        return;
+    const auto row = mGeometry.FindControl(event.event_x, event.event_y);
+    if (!row || !GetRow(*row).IsWritable())
         return;
     mHeldRow = row;
-    ParameterRow& held = mRows[*row];
+    ParameterRow& held = GetRow(*row);
     held.Notify(kAudioUnitEvent_BeginParameterChangeGesture);
     if ((event.state & XCB_MOD_MASK_CONTROL) != 0)
         held.SetDefault();
     else if (held.GetControl() == ParameterRow::Control::Switch)
         held.SetPosition(held.GetPosition() >= 0.5 ? 0.0 : 1.0);
     else
-        OnMotion(event.event_x);
+        DragControl(event.event_x);
     Paint();
 }
 
-void GenericView::OnMotion(int x)
+void GenericView::OnMotion(int x, int y)
 {
     if (mHoldsGrip)
+        Resize(x, y);
+    else if (mHoldsBar)
+        Scroll(mGeometry.ScrolledToBar(y));
+    else if (mHeldRow && GetRow(*mHeldRow).GetControl() != ParameterRow::Control::Switch)
     {
-        Resize(x);
-        return;
+        DragControl(x);
+        Paint();
     }
-    if (!mHeldRow)
-        return;
-    ParameterRow& row = mRows[*mHeldRow];
-    if (row.GetControl() == ParameterRow::Control::Switch)
-        return;
+}
+
+void GenericView::DragControl(int x)
+{
+    ParameterRow& row = GetRow(*mHeldRow);
     double position = mGeometry.GetPosition(x);
     if (HasStepFields(mGeometry, row))
     {
@@ -204,20 +250,36 @@ void GenericView::OnMotion(int x)
         position = field / (count - 1.0);
     }
     row.SetPosition(position);
-    Paint();
 }
 
 void GenericView::OnRelease()
 {
     mHoldsGrip = false;
+    mHoldsBar = false;
     if (const auto row = std::exchange(mHeldRow, std::nullopt))
-        mRows[*row].Notify(kAudioUnitEvent_EndParameterChangeGesture);
+        GetRow(*row).Notify(kAudioUnitEvent_EndParameterChangeGesture);
 }
 
-void GenericView::Resize(int width)
+void GenericView::OnScroll(int rows)
 {
-    const ViewGeometry geometry = ViewGeometry::Fit(mRows.size(), width);
-    if (geometry.width == mGeometry.width)
+    Scroll(mGeometry.ScrolledTo(static_cast<std::ptrdiff_t>(mGeometry.first) + rows));
+}
+
+void GenericView::Scroll(const ViewGeometry& geometry)
+{
+    if (geometry.first == mGeometry.first)
+        return;
+    mGeometry = geometry;
+    for (ParameterRow* row : GetShownRows())
+        row->Refresh(); // levels were not watched
+    Paint();
+}
+
+void GenericView::Resize(int width, int height)
+{
+    const ViewGeometry geometry = ViewGeometry::Fit(mIDs.size(), width, height + ViewGeometry::kRowHeight / 2)
+                                      .ScrolledTo(static_cast<std::ptrdiff_t>(mGeometry.first));
+    if (geometry.width == mGeometry.width && geometry.height == mGeometry.height)
         return;
     mGeometry = geometry;
     FitFrame();
@@ -243,24 +305,41 @@ void GenericView::FitFrame()
 {
     const std::array size = {static_cast<std::uint32_t>(mGeometry.width),
                              static_cast<std::uint32_t>(mGeometry.height)};
-    xcb_configure_window(mConnection, mWindow, XCB_CONFIG_WINDOW_WIDTH | XCB_CONFIG_WINDOW_HEIGHT, size.data());
-    xcb_flush(mConnection);
+    xcb_configure_window(mConnection.get(), mWindow, XCB_CONFIG_WINDOW_WIDTH | XCB_CONFIG_WINDOW_HEIGHT, size.data());
+    xcb_flush(mConnection.get());
+}
+
+// Once for all that changes at a time.
+void GenericView::PaintSoon()
+{
+    if (std::exchange(mPaintsSoon, true))
+        return;
+    zebcore::threads::AsyncCallFromMainThread(
+        [this, isAlive = mIsAlive]
+        {
+            if (!*isAlive)
+                return;
+            mPaintsSoon = false;
+            Paint();
+        },
+        0);
 }
 
 void GenericView::Paint()
 {
+    const std::vector<ParameterRow*> shown = GetShownRows();
     cairo_surface_t* surface =
-        cairo_xcb_surface_create(mConnection, mWindow, mVisual, mGeometry.width, mGeometry.height);
+        cairo_xcb_surface_create(mConnection.get(), mWindow, mVisual, mGeometry.width, mGeometry.height);
     if (!mDevice)
         mDevice = cairo_device_reference(cairo_surface_get_device(surface));
     cairo_t* context = cairo_create(surface);
     cairo_push_group(context); // at once, without flicker
-    PaintView(context, mGeometry, mRows);
+    PaintView(context, mGeometry, {shown.begin(), shown.end()});
     cairo_pop_group_to_source(context);
     cairo_paint(context);
     cairo_destroy(context);
     cairo_surface_destroy(surface);
-    xcb_flush(mConnection);
+    xcb_flush(mConnection.get());
 }
 
 // There are no views of the units' own on this system: what they could be made of is not here.

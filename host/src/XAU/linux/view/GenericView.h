@@ -7,6 +7,7 @@
 
 #include <xcb/xcb.h>
 
+#include <map>
 #include <memory>
 #include <optional>
 #include <vector>
@@ -14,8 +15,9 @@
 namespace zebaudiofilterhost::xau
 {
 
-/// All parameters of a unit in an X11 window of our own, which follows changes from elsewhere. It has a connection to
-/// the X server of its own, whose errors do not end the process when the parent has gone first. [main]
+/// All parameters of a unit in an X11 window of our own, which follows changes from elsewhere. A parameter is read,
+/// and listened to, when it is first shown: there may be thousands. It has a connection to the X server of its own,
+/// whose errors do not end the process when the parent has gone first. [main]
 class GenericView : public XAUView
 {
 public:
@@ -28,31 +30,49 @@ public:
     void FitFrame() override;
 
 private:
-    GenericView(xcb_connection_t* connection, AudioUnit unit, boost::function<void()> resized);
+    struct Disconnect
+    {
+        void operator()(xcb_connection_t* connection) const { xcb_disconnect(connection); } // the window goes with it
+    };
+    using Connection = std::unique_ptr<xcb_connection_t, Disconnect>;
+
+    GenericView(Connection connection, AudioUnit unit, boost::function<void()> resized);
 
     bool OpenWindow(xcb_window_t parent);
     void Listen();
     void OnReadable();
     void OnEvent(const xcb_generic_event_t& event);
     void OnPress(const xcb_button_press_event_t& event);
-    void OnMotion(int x);
+    void OnScroll(int rows);
+    void OnMotion(int x, int y);
     void OnRelease();
-    void Resize(int width);
+    void DragControl(int x);
+    void Scroll(const ViewGeometry& geometry);
+    void Resize(int width, int height);
+    void WatchLevels();
+    ParameterRow& GetRow(std::size_t index);
+    std::vector<ParameterRow*> GetShownRows();
+    void PaintSoon();
     void Paint();
     static void OnParameterChanged(void* userData, void* object, const AudioUnitEvent* event, UInt64 hostTime,
                                    AudioUnitParameterValue value);
 
-    xcb_connection_t* mConnection;
+    Connection mConnection;
+    AudioUnit mUnit;
     xcb_window_t mWindow = XCB_NONE;
     xcb_visualtype_t* mVisual = nullptr; // the connection's
     cairo_device_t* mDevice = nullptr;   // one reference, once something is drawn
     zebcore::threads::WatchID mWatch = zebcore::threads::kNoWatch;
+    zebcore::threads::WatchID mLevelTimer = zebcore::threads::kNoWatch; // units do not tell of levels
     AUEventListenerRef mListener = nullptr;
-    std::vector<ParameterRow> mRows;
+    std::vector<AudioUnitParameterID> mIDs;
+    std::map<std::size_t, ParameterRow> mRows; // those shown so far
     ViewGeometry mGeometry;
     boost::function<void()> mResized;
     std::optional<std::size_t> mHeldRow; // under a pressed button
     bool mHoldsGrip = false;
+    bool mHoldsBar = false;
+    bool mPaintsSoon = false;
     std::shared_ptr<bool> mIsAlive = std::make_shared<bool>(true); // for what may end it in the middle of an event
 };
 

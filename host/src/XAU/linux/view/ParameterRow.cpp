@@ -2,6 +2,7 @@
 
 #include "foundation/zebcore/StringConversion.h"
 #include "host/src/XAU/src/CFOwner.h"
+#include "host/src/XAU/src/CallGuarded.h"
 #include "host/src/XAU/src/XAUParameterInfo.h"
 
 #include <boost/smart_ptr/intrusive_ptr.hpp>
@@ -17,36 +18,75 @@ namespace zebaudiofilterhost::xau
 namespace
 {
 
-constexpr UInt32 kMaxRows = 512;   // a longer window could not be shown anyway
+constexpr UInt32 kMaxParameters = 32768;
 constexpr double kMaxNames = 64.0; // of steps: the unit is asked for each
+constexpr std::size_t kMaxText = 256;
 
-std::string ToNarrow(const UTF16String& text)
+constexpr char16_t kReplacement = 0xFFFD;
+
+bool IsControl(char32_t point)
 {
-    const UTF8String bytes = zebcore::utility::UTF16to8(text);
-    std::string narrow(bytes.begin(), bytes.end());
-    std::replace_if(
-        narrow.begin(), narrow.end(), [](char unit) { return unit >= '\0' && unit < ' '; }, ' ');
-    return narrow;
+    return point < 0x20 || (point >= 0x7F && point < 0xA0);
+}
+
+// Cairo draws nothing any more once it has met another one.
+bool IsCharacter(char32_t point)
+{
+    const bool isSurrogate = point >= 0xD800 && point < 0xE000;
+    return !isSurrogate && (point & 0xFFFE) != 0xFFFE && (point < 0xFDD0 || point > 0xFDEF);
+}
+
+// The character that begins there, or half of one.
+char32_t PointAt(const UTF16String& text, std::size_t index)
+{
+    const char32_t first = text[index];
+    const char32_t second = index + 1 < text.size() ? text[index + 1] : 0;
+    const bool isPair = first >= 0xD800 && first < 0xDC00 && second >= 0xDC00 && second < 0xE000;
+    return isPair ? 0x10000 + ((first - 0xD800) << 10) + (second - 0xDC00) : first;
 }
 
 } // namespace
+
+std::string ToShownText(const UTF16String& text)
+{
+    UTF16String shown;
+    for (std::size_t index = 0; index < text.size() && shown.size() < kMaxText;)
+    {
+        const char32_t point = PointAt(text, index);
+        const std::size_t units = point > 0xFFFF ? 2 : 1;
+        if (IsControl(point))
+            shown += u' ';
+        else if (IsCharacter(point))
+            shown.append(text, index, units);
+        else
+            shown += kReplacement;
+        index += units;
+    }
+    const UTF8String bytes = zebcore::utility::UTF16to8(shown);
+    return {bytes.begin(), bytes.end()};
+}
 
 ParameterRow::ParameterRow(AudioUnit unit, AudioUnitScope scope, AudioUnitParameterID id)
     : mUnit(unit), mScope(scope), mID(id)
 {
     const boost::intrusive_ptr<XAUParameterInfo> names(new XAUParameterInfo(unit, scope, id));
-    mName = ToNarrow(names->GetName());
-    mLabel = ToNarrow(names->GetLabel());
+    mName = ToShownText(names->GetName());
+    mLabel = ToShownText(names->GetLabel());
     const ParameterRecord record(unit, scope, id);
     const AudioUnitParameterInfo& info = record.mInfo;
     mMinimum = static_cast<double>(info.minValue);
     mMaximum = static_cast<double>(info.maxValue);
     mDefault = static_cast<double>(info.defaultValue);
-    mIsWritable = (info.flags & kAudioUnitParameterFlag_IsWritable) != 0;
-    if (info.unit == kAudioUnitParameterUnit_Boolean)
+    mIsNonRealTime = (info.flags & kAudioUnitParameterFlag_NonRealTime) != 0;
+    mIsSwitch = info.unit == kAudioUnitParameterUnit_Boolean;
+    if (mIsSwitch)
         mControl = Control::Switch;
     else if (info.unit == kAudioUnitParameterUnit_Indexed)
         ReadSteps();
+    const bool isOnlyToBeWatched = (info.flags & kAudioUnitParameterFlag_IsWritable) == 0 ||
+                                   (info.flags & kAudioUnitParameterFlag_MeterReadOnly) != 0;
+    if (isOnlyToBeWatched)
+        mControl = mControl == Control::Slider ? Control::Level : Control::None;
     Refresh();
 }
 
@@ -56,19 +96,23 @@ void ParameterRow::ReadSteps()
     if (!(steps >= 2.0))
         return;
     mControl = Control::Steps;
+    mIsStepped = true;
     if (steps > kMaxNames)
         return;
     CFArrayRef names = nullptr;
     UInt32 size = sizeof(CFTypeRef);
-    const bool hasNames =
-        AudioUnitGetProperty(mUnit, kAudioUnitProperty_ParameterValueStrings, mScope, mID, &names, &size) == noErr &&
-        names != nullptr;
+    const OSStatus result = CallGuarded(
+        [&] {
+            return AudioUnitGetProperty(mUnit, kAudioUnitProperty_ParameterValueStrings, mScope, mID, &names, &size);
+        });
+    const bool hasNames = result == noErr && names != nullptr;
     const CFOwner owner(hasNames ? names : nullptr);
     for (std::size_t step = 0; step < static_cast<std::size_t>(steps); ++step)
     {
         const auto index = static_cast<CFIndex>(step);
         if (hasNames && index < CFArrayGetCount(names))
-            mStepNames.push_back(ToNarrow(MACtoZEB(static_cast<CFStringRef>(CFArrayGetValueAtIndex(names, index)))));
+            mStepNames.push_back(
+                ToShownText(MACtoZEB(static_cast<CFStringRef>(CFArrayGetValueAtIndex(names, index)))));
         else
             mStepNames.push_back(
                 ReadText(static_cast<AudioUnitParameterValue>(mMinimum + static_cast<double>(step))));
@@ -81,8 +125,13 @@ std::string ParameterRow::ReadText(AudioUnitParameterValue value) const
     request.inParamID = mID;
     request.inValue = &value;
     UInt32 size = sizeof(request);
-    if (AudioUnitGetProperty(mUnit, kAudioUnitProperty_ParameterStringFromValue, mScope, 0, &request, &size) == noErr)
-        return ToNarrow(MACtoZEB(request.outString)); // not released, as everywhere: units differ in whose it is
+    const OSStatus result = CallGuarded(
+        [&] {
+            return AudioUnitGetProperty(mUnit, kAudioUnitProperty_ParameterStringFromValue, mScope, 0, &request,
+                                        &size);
+        });
+    if (result == noErr)
+        return ToShownText(MACtoZEB(request.outString)); // not released, as everywhere: units differ in whose it is
     return MakeText(static_cast<double>(value));
 }
 
@@ -92,15 +141,17 @@ std::string ParameterRow::MakeText(double value) const
     const double step = std::round(value - mMinimum);
     if (step >= 0.0 && step < static_cast<double>(mStepNames.size()))
         return mStepNames[static_cast<std::size_t>(step)];
+    if (mIsSwitch)
+        return value >= (mMinimum + mMaximum) / 2.0 ? "On" : "Off";
     std::array<char, 48> text = {};
-    std::snprintf(text.data(), text.size(), mControl == Control::Steps ? "%.0f" : "%.2f", value);
+    std::snprintf(text.data(), text.size(), mIsStepped ? "%.0f" : "%.2f", value);
     return text.data();
 }
 
 bool ParameterRow::Refresh()
 {
     AudioUnitParameterValue value = 0.0F;
-    if (AudioUnitGetParameter(mUnit, mID, mScope, 0, &value) != noErr)
+    if (CallGuarded([&] { return AudioUnitGetParameter(mUnit, mID, mScope, 0, &value); }) != noErr)
         return false;
     const double range = mMaximum > mMinimum ? mMaximum - mMinimum : 1.0;
     const double position = std::clamp((static_cast<double>(value) - mMinimum) / range, 0.0, 1.0);
@@ -122,7 +173,8 @@ std::size_t ParameterRow::GetStep() const
 void ParameterRow::SetValue(double value)
 {
     const AudioUnitParameter parameter = GetParameter();
-    AUParameterSet(nullptr, nullptr, &parameter, static_cast<AudioUnitParameterValue>(value), 0);
+    CallGuarded(
+        [&] { return AUParameterSet(nullptr, nullptr, &parameter, static_cast<AudioUnitParameterValue>(value), 0); });
     Refresh();
 }
 
@@ -145,23 +197,27 @@ void ParameterRow::Notify(AudioUnitEventType gesture) const
     AUEventListenerNotify(nullptr, nullptr, &event);
 }
 
-std::vector<ParameterRow> ReadParameterRows(AudioUnit unit)
+std::vector<AudioUnitParameterID> ReadParameterIDs(AudioUnit unit)
 {
+    const auto read = [unit](void* data, UInt32& size)
+    {
+        return CallGuarded(
+            [&] {
+                return AudioUnitGetProperty(unit, kAudioUnitProperty_ParameterList, kAudioUnitScope_Global, 0, data,
+                                            &size);
+            });
+    };
     UInt32 size = 0;
-    std::vector<ParameterRow> rows;
-    if (AudioUnitGetProperty(unit, kAudioUnitProperty_ParameterList, kAudioUnitScope_Global, 0, nullptr, &size) !=
-        noErr)
-        return rows;
-    std::vector<AudioUnitParameterID> ids(std::clamp<std::size_t>(size / sizeof(AudioUnitParameterID), 1, kMaxRows));
-    const auto announced = std::min(size, static_cast<UInt32>(ids.size() * sizeof(AudioUnitParameterID)));
+    if (read(nullptr, size) != noErr)
+        return {};
+    const UInt32 count = std::min(static_cast<UInt32>(size / sizeof(AudioUnitParameterID)), kMaxParameters);
+    const auto announced = static_cast<UInt32>(count * sizeof(AudioUnitParameterID));
+    std::vector<AudioUnitParameterID> ids(std::max<std::size_t>(count, 1)); // null would ask for the size
     size = announced;
-    if (AudioUnitGetProperty(unit, kAudioUnitProperty_ParameterList, kAudioUnitScope_Global, 0, ids.data(), &size) !=
-        noErr)
-        return rows;
+    if (read(ids.data(), size) != noErr)
+        return {};
     ids.resize(std::min(size, announced) / sizeof(AudioUnitParameterID));
-    for (const AudioUnitParameterID id : ids)
-        rows.emplace_back(unit, kAudioUnitScope_Global, id);
-    return rows;
+    return ids;
 }
 
 } // namespace zebaudiofilterhost::xau

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "foundation/zebcore/StringTypes.h"
+#include "utility/CommonTypes.h"
 
 #include <AudioToolbox/AudioToolbox.h>
 
@@ -18,14 +18,18 @@ public:
     {
         Slider,
         Steps, // one of whole numbers, named by the unit
-        Switch
+        Switch,
+        Level, // of what is only to be watched
+        None   // the same, where the text says all
     };
 
     ParameterRow(AudioUnit unit, AudioUnitScope scope, AudioUnitParameterID id);
 
     const std::string& GetName() const { return mName; }
     Control GetControl() const { return mControl; }
-    bool IsWritable() const { return mIsWritable; }
+    bool IsWritable() const { return mControl != Control::Level && mControl != Control::None; }
+    /// Not to be changed while sound is rendered.
+    bool IsNonRealTime() const { return mIsNonRealTime; }
     /// Names of the steps; their values where the unit has no names. Empty if there are too many to be named.
     const std::vector<std::string>& GetStepNames() const { return mStepNames; }
 
@@ -60,7 +64,9 @@ private:
     std::string mLabel;
     Control mControl = Control::Slider;
     std::vector<std::string> mStepNames;
-    bool mIsWritable = true;
+    bool mIsSwitch = false;
+    bool mIsStepped = false;
+    bool mIsNonRealTime = false;
     double mMinimum = 0.0;
     double mMaximum = 1.0;
     double mDefault = 0.0;
@@ -68,7 +74,10 @@ private:
     std::string mText;
 };
 
-/// The rows of all parameters that are global and meant to be shown, in the unit's order. [main]
-std::vector<ParameterRow> ReadParameterRows(AudioUnit unit);
+/// A unit's text as it can be drawn: in one line, of some length at most, and without what is no character. [any]
+std::string ToShownText(const UTF16String& text);
+
+/// All global parameters, in the unit's order. [main]
+std::vector<AudioUnitParameterID> ReadParameterIDs(AudioUnit unit);
 
 } // namespace zebaudiofilterhost::xau

@@ -13,6 +13,7 @@ constexpr double kNameShare = 0.34; // of the width, for names; then controls; t
 constexpr double kTextShare = 0.24;
 constexpr double kGap = 8.0;
 constexpr double kFontSize = 12.0;
+constexpr double kFootFontSize = 10.0;
 constexpr double kTrackHeight = 6.0;
 constexpr double kKnobRadius = 7.0;
 constexpr std::size_t kMaxFields = 8; // of steps
@@ -97,11 +98,18 @@ void DrawSlider(cairo_t* context, const ViewGeometry& geometry, const ParameterR
 {
     const double left = geometry.GetControlLeft();
     const double length = geometry.GetControlWidth() * row.GetPosition();
-    const Colour& colour = row.IsWritable() ? kFill : kIdle;
     FillRectangle(context, kTrack, left, middle - kTrackHeight / 2.0, geometry.GetControlWidth(), kTrackHeight);
-    FillRectangle(context, colour, left, middle - kTrackHeight / 2.0, length, kTrackHeight);
-    if (row.IsWritable())
-        FillCircle(context, colour, left + length, middle, kKnobRadius);
+    FillRectangle(context, kFill, left, middle - kTrackHeight / 2.0, length, kTrackHeight);
+    FillCircle(context, kFill, left + length, middle, kKnobRadius);
+}
+
+// Nothing to take hold of.
+void DrawLevel(cairo_t* context, const ViewGeometry& geometry, const ParameterRow& row, double middle)
+{
+    const double left = geometry.GetControlLeft();
+    FillRectangle(context, kTrack, left, middle - kTrackHeight, geometry.GetControlWidth(), 2.0 * kTrackHeight);
+    FillRectangle(context, kIdle, left, middle - kTrackHeight, geometry.GetControlWidth() * row.GetPosition(),
+                  2.0 * kTrackHeight);
 }
 
 void DrawSteps(cairo_t* context, const ViewGeometry& geometry, const ParameterRow& row, double top)
@@ -112,8 +120,7 @@ void DrawSteps(cairo_t* context, const ViewGeometry& geometry, const ParameterRo
     {
         const bool isOn = step == row.GetStep();
         const double left = geometry.GetControlLeft() + width * static_cast<double>(step);
-        const Colour& on = row.IsWritable() ? kFill : kIdle;
-        FillRectangle(context, isOn ? on : kTrack, left, top + 3.0, width - kFieldSpacing,
+        FillRectangle(context, isOn ? kFill : kTrack, left, top + 3.0, width - kFieldSpacing,
                       ViewGeometry::kRowHeight - 6.0);
         DrawText(context, isOn ? kPaper : kInk, names[step], left + kFieldMargin, top,
                  width - kFieldMargin - kFieldSpacing);
@@ -148,7 +155,35 @@ void DrawControl(cairo_t* context, const ViewGeometry& geometry, const Parameter
     case ParameterRow::Control::Switch:
         DrawSwitch(context, geometry, row, middle);
         return;
+    case ParameterRow::Control::Level:
+        DrawLevel(context, geometry, row, middle);
+        return;
+    case ParameterRow::Control::None:
+        return;
     }
+}
+
+void DrawScrollBar(cairo_t* context, const ViewGeometry& geometry)
+{
+    if (!geometry.IsScrolled())
+        return;
+    constexpr double kThickness = 4.0;
+    const double length = geometry.height - ViewGeometry::kMargin - ViewGeometry::kFoot;
+    const double perRow = length / static_cast<double>(geometry.rows);
+    const double left = geometry.width - ViewGeometry::kMargin + kThickness / 2.0;
+    FillRectangle(context, kTrack, left, ViewGeometry::kMargin, kThickness, length);
+    FillRectangle(context, kIdle, left, ViewGeometry::kMargin + perRow * static_cast<double>(geometry.first),
+                  kThickness, std::max(perRow * static_cast<double>(geometry.GetShown()), kThickness));
+}
+
+void DrawRemark(cairo_t* context, const ViewGeometry& geometry, const std::vector<const ParameterRow*>& shown)
+{
+    if (std::none_of(shown.begin(), shown.end(), [](const ParameterRow* row) { return row->IsNonRealTime(); }))
+        return;
+    cairo_set_font_size(context, kFootFontSize);
+    const double top = geometry.height - (ViewGeometry::kFoot + ViewGeometry::kRowHeight) / 2.0;
+    DrawText(context, kIdle, "* cannot be automated: change it while nothing plays", ViewGeometry::kMargin, top,
+             geometry.width - ViewGeometry::kMargin - ViewGeometry::kGrip);
 }
 
 void DrawGrip(cairo_t* context, const ViewGeometry& geometry)
@@ -167,10 +202,32 @@ void DrawGrip(cairo_t* context, const ViewGeometry& geometry)
 
 } // namespace
 
-ViewGeometry ViewGeometry::Fit(std::size_t rows, int width)
+ViewGeometry ViewGeometry::Fit(std::size_t rows, int width, int height)
 {
-    const auto shown = static_cast<int>(std::max<std::size_t>(rows, 1));
-    return {std::max(width, kMinWidth), 2 * kMargin + shown * kRowHeight, rows};
+    const int room = std::clamp(height, 0, kMaxHeight) - kMargin - kFoot;
+    const auto fitting = static_cast<std::size_t>(std::max(room, 0) / kRowHeight);
+    const std::size_t shown = std::max<std::size_t>(std::min(rows, std::max(fitting, kMinRows)), 1);
+    return {std::clamp(width, kMinWidth, kMaxWidth), kMargin + static_cast<int>(shown) * kRowHeight + kFoot, rows};
+}
+
+std::size_t ViewGeometry::GetShown() const
+{
+    return std::min(rows, static_cast<std::size_t>((height - kMargin - kFoot) / kRowHeight));
+}
+
+ViewGeometry ViewGeometry::ScrolledTo(std::ptrdiff_t row) const
+{
+    ViewGeometry scrolled = *this;
+    const auto last = static_cast<std::ptrdiff_t>(rows - GetShown());
+    scrolled.first = static_cast<std::size_t>(std::clamp<std::ptrdiff_t>(row, 0, last));
+    return scrolled;
+}
+
+ViewGeometry ViewGeometry::ScrolledToBar(int y) const
+{
+    const double share = static_cast<double>(y - kMargin) / (height - kMargin - kFoot);
+    const double row = share * static_cast<double>(rows) - static_cast<double>(GetShown()) / 2.0;
+    return ScrolledTo(static_cast<std::ptrdiff_t>(row));
 }
 
 double ViewGeometry::GetControlLeft() const
@@ -188,9 +245,9 @@ double ViewGeometry::GetTextLeft() const
     return width - kMargin - kTextShare * (width - 2 * kMargin);
 }
 
-double ViewGeometry::GetRowTop(std::size_t row) const
+double ViewGeometry::GetRowTop(std::size_t place) const
 {
-    return kMargin + static_cast<double>(row) * kRowHeight;
+    return kMargin + static_cast<double>(place) * kRowHeight;
 }
 
 std::optional<std::size_t> ViewGeometry::FindControl(int x, int y) const
@@ -198,8 +255,8 @@ std::optional<std::size_t> ViewGeometry::FindControl(int x, int y) const
     const bool isBeside = x < GetControlLeft() - kKnobRadius || x > GetTextLeft() - kGap;
     if (isBeside || y < kMargin)
         return std::nullopt;
-    const auto row = static_cast<std::size_t>((y - kMargin) / kRowHeight);
-    return row < rows ? std::optional(row) : std::nullopt;
+    const auto place = static_cast<std::size_t>((y - kMargin) / kRowHeight);
+    return place < GetShown() ? std::optional(first + place) : std::nullopt;
 }
 
 bool ViewGeometry::IsGrip(int x, int y) const
@@ -221,24 +278,28 @@ bool HasStepFields(const ViewGeometry& geometry, const ParameterRow& row)
     return MeasureWidest(names) <= width - kFieldMargin - kFieldSpacing;
 }
 
-void PaintView(cairo_t* context, const ViewGeometry& geometry, const std::vector<ParameterRow>& rows)
+void PaintView(cairo_t* context, const ViewGeometry& geometry, const std::vector<const ParameterRow*>& shown)
 {
     FillRectangle(context, kBackground, 0.0, 0.0, geometry.width, geometry.height);
     SetFont(context);
     const double nameWidth = geometry.GetControlLeft() - ViewGeometry::kMargin - kGap - kKnobRadius;
     const double textWidth = geometry.width - ViewGeometry::kMargin - geometry.GetTextLeft();
-    for (std::size_t index = 0; index < rows.size(); ++index)
+    for (std::size_t place = 0; place < shown.size(); ++place)
     {
-        const double top = geometry.GetRowTop(index);
-        if (index % 2 == 1)
+        const ParameterRow& row = *shown[place];
+        const double top = geometry.GetRowTop(place);
+        if ((geometry.first + place) % 2 == 1)
             FillRectangle(context, kStripe, 0.0, top, geometry.width, ViewGeometry::kRowHeight);
-        DrawText(context, kInk, rows[index].GetName(), ViewGeometry::kMargin, top, nameWidth);
-        DrawControl(context, geometry, rows[index], top);
-        DrawText(context, kInk, rows[index].GetText(), geometry.GetTextLeft(), top, textWidth);
+        const std::string name = row.IsNonRealTime() ? "* " + row.GetName() : row.GetName();
+        DrawText(context, kInk, name, ViewGeometry::kMargin, top, nameWidth);
+        DrawControl(context, geometry, row, top);
+        DrawText(context, kInk, row.GetText(), geometry.GetTextLeft(), top, textWidth);
     }
-    if (rows.empty())
+    if (shown.empty())
         DrawText(context, kInk, "This unit has no parameters.", ViewGeometry::kMargin, ViewGeometry::kMargin,
                  geometry.width - 2.0 * ViewGeometry::kMargin);
+    DrawScrollBar(context, geometry);
+    DrawRemark(context, geometry, shown);
     DrawGrip(context, geometry);
 }
 
