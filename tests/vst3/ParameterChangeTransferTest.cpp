@@ -50,6 +50,29 @@ TEST(ParameterChangeTransfer, FoldsChangesOfOneOffsetIntoTheNewest)
     EXPECT_FALSE(transfer.TransferChangesTo(changes));
 }
 
+TEST(ParameterChangeTransfer, MovesToChangesThatHoldSomeAlready)
+{
+    ParameterChangeTransfer transfer;
+    transfer.SetParameterIDs({4, 5});
+    transfer.AddChange(4, .1, 0);
+    ParameterChanges changes;
+    AddPoint(changes, 5, 7, .7);
+    AddPoint(changes, 4, 0, .9);
+    EXPECT_TRUE(transfer.TransferChangesTo(changes));
+    transfer.SetParameterIDs({5, 6});
+    EXPECT_FALSE(transfer.TransferChangesTo(changes));
+    for (const ParamID id : {5U, 6U})
+        transfer.AddChange(id, .2, 0);
+    EXPECT_TRUE(transfer.TransferChangesTo(changes));
+
+    ASSERT_EQ(changes.getParameterCount(), 3);
+    EXPECT_EQ(changes.getParameterData(0)->getParameterId(), 5U);
+    EXPECT_EQ(changes.getParameterData(0)->getPointCount(), 2);
+    EXPECT_EQ(changes.getParameterData(1)->getParameterId(), 4U);
+    EXPECT_EQ(changes.getParameterData(1)->getPointCount(), 1);
+    EXPECT_EQ(changes.getParameterData(2)->getParameterId(), 6U);
+}
+
 TEST(ParameterChangeTransfer, KeepsTheNewestHundred)
 {
     for (const int count : {99, 100, 101, 250, 1000})

@@ -21,3 +21,7 @@ else()
         src/linux/PlatformView.cpp
         src/linux/RunLoop.cpp)
 endif()
+
+# Its loops run over a handful of buses and channels, where vector code costs more to set up than it saves.
+set_source_files_properties(src/VST3Processing.cpp PROPERTIES
+    COMPILE_OPTIONS "-fno-tree-vectorize;-fno-semantic-interposition")

@@ -16,7 +16,7 @@ ParameterChangeTable::ParameterChangeTable(std::vector<Steinberg::Vst::ParamID> 
     {
         std::size_t bucket = BucketOf(mIDs[position]);
         while (mBuckets[bucket] != mIDs.size())
-            bucket = (bucket + 1) % mBuckets.size();
+            bucket = Next(bucket);
         mBuckets[bucket] = position;
     }
 }
@@ -25,12 +25,12 @@ std::size_t ParameterChangeTable::BucketOf(Steinberg::Vst::ParamID id) const
 {
     // Multiplication by the golden ratio spreads IDs that count up in steps of any size; the upper half is the best.
     constexpr std::uint64_t kGoldenRatio = 0x9e3779b97f4a7c15;
-    return static_cast<std::size_t>((id * kGoldenRatio) >> 32) % mBuckets.size();
+    return static_cast<std::size_t>((id * kGoldenRatio) >> 32) & (mBuckets.size() - 1);
 }
 
 std::size_t ParameterChangeTable::Find(Steinberg::Vst::ParamID id) const
 {
-    for (std::size_t bucket = BucketOf(id);; bucket = (bucket + 1) % mBuckets.size())
+    for (std::size_t bucket = BucketOf(id);; bucket = Next(bucket))
     {
         const std::size_t position = mBuckets[bucket];
         if (position == mIDs.size() || mIDs[position] == id)

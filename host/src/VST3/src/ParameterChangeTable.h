@@ -50,10 +50,11 @@ private:
     /// The position of the ID, or the number of IDs.
     std::size_t Find(Steinberg::Vst::ParamID id) const;
     std::size_t BucketOf(Steinberg::Vst::ParamID id) const;
+    std::size_t Next(std::size_t bucket) const { return (bucket + 1) & (mBuckets.size() - 1); }
 
     const std::vector<Steinberg::Vst::ParamID> mIDs;
-    /// Open addressing, at most half full: positions in mIDs, and their number for a free bucket. A look-up costs the
-    /// same however many IDs there are.
+    /// Open addressing, at most half full: positions in mIDs, and their number for a free bucket. A power of two of
+    /// them. A look-up costs the same however many IDs there are.
     std::vector<std::uint32_t> mBuckets;
     std::vector<ParameterRing> mRings;
     DirtySet mDirty;

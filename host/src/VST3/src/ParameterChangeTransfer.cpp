@@ -13,12 +13,37 @@ using Steinberg::Vst::ParamID;
 namespace
 {
 
-void AppendTo(ParameterChanges& changes, ParamID id, const ParameterQueueValue& value)
+// Takes changes by ascending ID, so that each ID is looked up once.
+class Appender
 {
-    int32 index = 0;
-    if (Steinberg::Vst::IParamValueQueue* queue = changes.addParameterData(id, index))
-        queue->addPoint(value.mSampleOffset, value.mValue, index);
-}
+public:
+    explicit Appender(ParameterChanges& changes) : mChanges(changes), mWasEmpty(changes.IsEmpty()) {}
+
+    void Add(ParamID id, const ParameterQueueValue& value)
+    {
+        if (mQueue == nullptr || mID != id)
+            mQueue = Find(id);
+        mID = id;
+        int32 index = 0;
+        mQueue->addPoint(value.mSampleOffset, value.mValue, index);
+        mAny = true;
+    }
+
+    bool HasAny() const { return mAny; }
+
+private:
+    ParameterValueQueue* Find(ParamID id)
+    {
+        int32 index = 0;
+        return mWasEmpty ? &mChanges.Append(id) : mChanges.FindOrAppend(id, index);
+    }
+
+    ParameterChanges& mChanges;
+    const bool mWasEmpty;
+    ParameterValueQueue* mQueue = nullptr;
+    ParamID mID = 0;
+    bool mAny = false;
+};
 
 // True if a point could be read, whether its ID is known or not.
 bool ReadQueue(ParameterChangeTable& table, Steinberg::Vst::IParamValueQueue& queue)
@@ -72,6 +97,14 @@ void ParameterChangeTransfer::AddChange(ParamID id, double value, int32 sampleOf
     const Table::Reader reader(mTable);
     ParameterChangeTable& table = **reader;
     table.Write(id, {value, sampleOffset});
+    MarkWritten();
+}
+
+// Behind the write. An exchange, and not a store, so that who takes the mark off sees what everybody wrote who had
+// set it.
+void ParameterChangeTransfer::MarkWritten()
+{
+    mWritten.exchange(true, std::memory_order_acq_rel);
 }
 
 bool ParameterChangeTransfer::HasChanges() const
@@ -93,21 +126,18 @@ bool ParameterChangeTransfer::GetNextChange(ParamID id, double& value, int32& sa
     return true;
 }
 
-bool ParameterChangeTransfer::TransferChangesTo(ParameterChanges& changes)
+bool ParameterChangeTransfer::MoveAll(ParameterChanges& changes)
 {
+    // Ahead of the look: what is written from here on is marked anew, also when it goes into another table.
+    mWritten.exchange(false, std::memory_order_acq_rel);
     const Table::Reader reader(mTable);
     ParameterChangeTable& table = **reader;
-    bool any = false;
-    table.TakeAll(
-        [&](ParamID id, const ParameterQueueValue& value)
-        {
-            AppendTo(changes, id, value);
-            any = true;
-        });
-    return any;
+    Appender appender(changes);
+    table.TakeAll([&appender](ParamID id, const ParameterQueueValue& value) { appender.Add(id, value); });
+    return appender.HasAny();
 }
 
-bool ParameterChangeTransfer::TransferChangesFrom(ParameterChanges& changes)
+bool ParameterChangeTransfer::ReadAll(ParameterChanges& changes)
 {
     const Table::Reader reader(mTable);
     ParameterChangeTable& table = **reader;
@@ -117,6 +147,7 @@ bool ParameterChangeTransfer::TransferChangesFrom(ParameterChanges& changes)
         if (Steinberg::Vst::IParamValueQueue* queue = changes.getParameterData(index))
             any = ReadQueue(table, *queue) || any;
     }
+    MarkWritten();
     return any;
 }
 
@@ -132,6 +163,7 @@ void ParameterChangeTransfer::CopyTo(ParameterChangeTransfer& other) const
         table.CopyTo(*copy);
     }
     other.mTable.Publish(std::move(copy));
+    other.MarkWritten();
     other.FreeRetired();
 }
 

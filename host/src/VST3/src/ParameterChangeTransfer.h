@@ -6,6 +6,7 @@
 
 #include <pluginterfaces/vst/vsttypes.h>
 
+#include <atomic>
 #include <memory>
 #include <vector>
 
@@ -51,11 +52,14 @@ public:
     /// Moves what is pending, by ascending ID and oldest first. Changes of an ID behind one that another thread is
     /// just writing keep their order and come with a later call. True if something was moved. [process], or
     /// [main, suspended]
-    bool TransferChangesTo(ParameterChanges& changes);
+    bool TransferChangesTo(ParameterChanges& changes)
+    {
+        return mWritten.load(std::memory_order_relaxed) && MoveAll(changes);
+    }
 
     /// Reads all points; those of unknown IDs are lost. True if a point could be read. [process], or
     /// [main, suspended]
-    bool TransferChangesFrom(ParameterChanges& changes);
+    bool TransferChangesFrom(ParameterChanges& changes) { return !changes.IsEmpty() && ReadAll(changes); }
 
     /// Gives `other` these IDs and a copy of what is pending here. Allocates. [any but process]
     void CopyTo(ParameterChangeTransfer& other) const;
@@ -63,7 +67,15 @@ public:
 private:
     using Table = Published<std::unique_ptr<ParameterChangeTable>>;
 
+    void MarkWritten();
+    bool MoveAll(ParameterChanges& changes);
+    bool ReadAll(ParameterChanges& changes);
+
     Table mTable; // never holds null after construction
+
+    /// False: nothing was written since TransferChangesTo looked last. Blocks without changes, which most are, look
+    /// no further.
+    std::atomic<bool> mWritten = false;
 };
 
 } // namespace zebaudiofilterhost::vst3

@@ -50,11 +50,6 @@ void ParameterChanges::Swap(Queues& queues)
     mUsedCount = 0;
 }
 
-void ParameterChanges::ClearQueue()
-{
-    mUsedCount = 0;
-}
-
 tresult PLUGIN_API ParameterChanges::queryInterface(const Steinberg::TUID interfaceID, void** object)
 {
     return QueryHostObject<Steinberg::Vst::IParameterChanges>(*this, interfaceID, object);
@@ -84,15 +79,26 @@ Steinberg::Vst::IParamValueQueue* PLUGIN_API ParameterChanges::getParameterData(
 
 Steinberg::Vst::IParamValueQueue* PLUGIN_API ParameterChanges::addParameterData(const ParamID& id, int32& index)
 {
+    return FindOrAppend(id, index);
+}
+
+ParameterValueQueue* ParameterChanges::FindOrAppend(ParamID id, int32& index)
+{
     for (int32 used = 0; used < mUsedCount; ++used)
     {
         ParameterValueQueue& queue = *mQueues[static_cast<std::size_t>(used)];
-        if (queue.getParameterId() == id)
+        if (queue.GetParameterID() == id)
         {
             index = used;
             return &queue;
         }
     }
+    index = mUsedCount;
+    return &Append(id);
+}
+
+ParameterValueQueue& ParameterChanges::Append(ParamID id)
+{
     const auto next = static_cast<std::size_t>(mUsedCount);
     if (next < mQueues.size())
     {
@@ -101,8 +107,8 @@ Steinberg::Vst::IParamValueQueue* PLUGIN_API ParameterChanges::addParameterData(
     }
     else
         mQueues.push_back(MakeQueue(id));
-    index = mUsedCount++;
-    return mQueues[next].Get();
+    ++mUsedCount;
+    return *mQueues[next];
 }
 
 } // namespace zebaudiofilterhost::vst3

@@ -36,7 +36,8 @@ public:
     void Swap(Queues& queues);
 
     /// Nothing counts as used any more; the queues keep their points until they are used again.
-    void ClearQueue();
+    void ClearQueue() { mUsedCount = 0; }
+    bool IsEmpty() const { return mUsedCount == 0; }
 
     Steinberg::tresult PLUGIN_API queryInterface(const Steinberg::TUID interfaceID, void** object) override;
     Steinberg::uint32 PLUGIN_API addRef() override;
@@ -49,6 +50,11 @@ public:
     /// Owned by this object.
     Steinberg::Vst::IParamValueQueue* PLUGIN_API addParameterData(const Steinberg::Vst::ParamID& id,
                                                                   Steinberg::int32& index) override;
+
+    /// What addParameterData does.
+    ParameterValueQueue* FindOrAppend(Steinberg::Vst::ParamID id, Steinberg::int32& index);
+    /// The same for an ID that is known not to be in use yet, without a look.
+    ParameterValueQueue& Append(Steinberg::Vst::ParamID id);
 
 private:
     HostReferenceCount mReferenceCount;

@@ -65,14 +65,4 @@ tresult PLUGIN_API ParameterValueQueue::addPoint(int32 sampleOffset, Steinberg::
     return Steinberg::kResultOk;
 }
 
-void ParameterValueQueue::Clear()
-{
-    mValues.clear();
-}
-
-void ParameterValueQueue::SetParameterID(Steinberg::Vst::ParamID id)
-{
-    mParameterID = id;
-}
-
 } // namespace zebaudiofilterhost::vst3

@@ -36,8 +36,9 @@ public:
                                            Steinberg::int32& index) override;
 
     /// Keeps the memory.
-    void Clear();
-    void SetParameterID(Steinberg::Vst::ParamID id);
+    void Clear() { mValues.clear(); }
+    void SetParameterID(Steinberg::Vst::ParamID id) { mParameterID = id; }
+    Steinberg::Vst::ParamID GetParameterID() const { return mParameterID; }
 
 private:
     ~ParameterValueQueue() = default;

@@ -197,7 +197,8 @@ private:
     Published<ParameterTable> mParameters;
     std::vector<Steinberg::Vst::AudioBusBuffers> mInputBuffers; // between Resume and Suspend
     std::vector<Steinberg::Vst::AudioBusBuffers> mOutputBuffers;
-    std::vector<float*> mInputChannels; // what the bus buffers point into, by channel of the filter
+    std::vector<unsigned long long> mInputBits; // of each input bus, the bits of its channels in the filter's flags
+    std::vector<float*> mInputChannels;         // what the bus buffers point into, by channel of the filter
     std::vector<float*> mOutputChannels;
     PluginPtr<VST3EventList> mInputEvents;  // null without an event bus
     ParameterChanges mInputChanges;         // what process reads

@@ -23,7 +23,7 @@ tresult PLUGIN_API VST3AudioFilter::beginEdit(ParamID id)
 // processor, too.
 tresult PLUGIN_API VST3AudioFilter::performEdit(ParamID id, Steinberg::Vst::ParamValue value)
 {
-    const int index = FindParameterIndex(id);
+    const int index = CanAutomationBeHeard() ? FindParameterIndex(id) : -1;
     if (index >= 0)
         GetAutomatedParameterChangeSignal()(index, static_cast<float>(value));
     mInputTransfer.AddChange(id, value, 0);

@@ -21,11 +21,6 @@ void VST3EventList::SetMaxSize(int32 maxSize)
     mEvents.resize(static_cast<std::size_t>(std::max(maxSize, 0)), Event{});
 }
 
-void VST3EventList::Clear()
-{
-    mEventCount = 0;
-}
-
 Event* VST3EventList::GetEventByIndex(int32 index)
 {
     if (index < 0 || index >= mEventCount || static_cast<std::size_t>(index) >= mEvents.size())

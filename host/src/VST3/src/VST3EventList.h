@@ -22,7 +22,7 @@ public:
 
     /// Leaves the count alone; events beyond the store are out of range. [main, suspended]
     void SetMaxSize(Steinberg::int32 maxSize);
-    void Clear();
+    void Clear() { mEventCount = 0; }
     /// Null for an index out of range.
     Steinberg::Vst::Event* GetEventByIndex(Steinberg::int32 index);
 

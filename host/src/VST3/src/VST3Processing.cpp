@@ -134,13 +134,8 @@ void VST3AudioFilter::UpdateMusicalTime(const utility::Tempo& tempo)
 // gives back for its outputs, which count from 0 in each bus.
 void VST3AudioFilter::PassInputSilence(ChannelFlags inFlags)
 {
-    unsigned int channel = 0;
-    for (AudioBusBuffers& bus : mInputBuffers)
-    {
-        bus.silenceFlags = 0;
-        for (int index = 0; index < bus.numChannels; ++index)
-            bus.silenceFlags |= inFlags.Value() & ChannelBit(channel++);
-    }
+    for (std::size_t bus = 0; bus < mInputBuffers.size(); ++bus)
+        mInputBuffers[bus].silenceFlags = inFlags.Value() & mInputBits[bus];
     for (AudioBusBuffers& bus : mOutputBuffers)
         bus.silenceFlags = 0;
 }

@@ -27,6 +27,20 @@ void AllocateBuses(const std::vector<AudioFilterBusDescription>& descriptions, i
     }
 }
 
+// The bits of each bus's channels among all channels of the filter.
+std::vector<unsigned long long> BitsOfBuses(const std::vector<AudioFilterBusDescription>& descriptions)
+{
+    std::vector<unsigned long long> bits;
+    unsigned int channel = 0;
+    for (const AudioFilterBusDescription& description : descriptions)
+    {
+        bits.push_back(0);
+        for (int index = 0; index < description.GetChannelCount(); ++index)
+            bits.back() |= ChannelBit(channel++);
+    }
+    return bits;
+}
+
 // Takes the buses out of `data`, and puts them back in the end.
 class WithoutBuses
 {
@@ -137,12 +151,14 @@ void VST3AudioFilter::AllocateBusBuffers()
 {
     FreeBusBuffers();
     AllocateBuses(GetInputBuses(), GetNumberOfInputChannels(), mInputBuffers, mInputChannels);
+    mInputBits = BitsOfBuses(GetInputBuses());
     AllocateBuses(GetOutputBuses(), GetNumberOfOutputChannels(), mOutputBuffers, mOutputChannels);
 }
 
 void VST3AudioFilter::FreeBusBuffers()
 {
     mInputBuffers.clear();
+    mInputBits.clear();
     mOutputBuffers.clear();
     mInputChannels.clear();
     mOutputChannels.clear();
