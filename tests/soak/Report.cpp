@@ -27,8 +27,14 @@ std::string Joined(const std::vector<std::string>& names)
 
 Json ToJson(const Ledger::Account& account)
 {
-    return {{"effect", account.name},     {"turns", account.turns},       {"filters", account.lives},
-            {"editors", account.editors}, {"grownBytes", account.growth}, {"bytesPerFilter", account.PerLife()}};
+    return {{"effect", account.name},
+            {"turns", account.turns},
+            {"filters", account.lives},
+            {"editors", account.editors},
+            {"grownBytes", account.growth},
+            {"bytesPerFilter", account.PerLife()},
+            {"descriptors", account.descriptors},
+            {"threads", account.threads}};
 }
 
 Json ToJson(const Sample& sample)
