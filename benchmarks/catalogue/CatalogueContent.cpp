@@ -138,10 +138,16 @@ bool CatalogueHolds(int plugins)
     return same && index == plugins;
 }
 
-std::vector<int> Shuffled(int count)
+std::vector<int> Ordered(int count)
 {
     std::vector<int> numbers(static_cast<std::size_t>(count));
     std::iota(numbers.begin(), numbers.end(), 0);
+    return numbers;
+}
+
+std::vector<int> Shuffled(int count)
+{
+    std::vector<int> numbers = Ordered(count);
     std::shuffle(numbers.begin(), numbers.end(), std::mt19937(1));
     return numbers;
 }

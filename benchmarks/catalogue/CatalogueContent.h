@@ -26,7 +26,8 @@ void EmptyCatalogue();
 /// Whether the catalogue holds these plug-ins, with the fields they were made with, in order.
 bool CatalogueHolds(int plugins);
 
-/// The numbers from 0 to below `count` in an order without a pattern, the same in each run.
+/// The numbers from 0 to below `count`, in order and in an order without a pattern, the same in each run.
+std::vector<int> Ordered(int count);
 std::vector<int> Shuffled(int count);
 
 /// A folder of this process, on a file system in memory where there is one; it goes when the process ends.

@@ -72,12 +72,12 @@ void Save(State& state, int plugins)
         state.SkipWithError("a save lost plug-ins");
 }
 
-void FindByID(State& state, int plugins)
+void FindIDs(State& state, int plugins, const std::vector<int>& numbers)
 {
     if (!LoadFromFile(state, plugins))
         return;
     std::vector<UTF16String> ids;
-    for (const int index : Shuffled(plugins))
+    for (const int index : numbers)
         ids.push_back(FilterIDOf(index));
     const AudioFilterDescriptorManager& manager = AudioFilterDescriptorManager::GetInstance();
     for ([[maybe_unused]] auto round : state)
@@ -93,12 +93,12 @@ void FindByID(State& state, int plugins)
     }
 }
 
-void FindByLocator(State& state, int plugins)
+void FindLocators(State& state, int plugins, const std::vector<int>& numbers)
 {
     if (!LoadFromFile(state, plugins))
         return;
     std::vector<PluginLocator> locators;
-    for (const int index : Shuffled(plugins))
+    for (const int index : numbers)
         locators.push_back(LocatorOf(index));
     const PluginModuleInfoManager& manager = PluginModuleInfoManager::GetInstance();
     for ([[maybe_unused]] auto round : state)
@@ -114,6 +114,28 @@ void FindByLocator(State& state, int plugins)
     }
 }
 
+// One after the other, as a list or a project asks for them.
+void FindByID(State& state, int plugins)
+{
+    FindIDs(state, plugins, Ordered(plugins));
+}
+
+void FindByLocator(State& state, int plugins)
+{
+    FindLocators(state, plugins, Ordered(plugins));
+}
+
+// All over the catalogue, so that a large one is seen to leave the processor's cache.
+void FindByIDAnywhere(State& state, int plugins)
+{
+    FindIDs(state, plugins, Shuffled(plugins));
+}
+
+void FindByLocatorAnywhere(State& state, int plugins)
+{
+    FindLocators(state, plugins, Shuffled(plugins));
+}
+
 std::vector<boost::intrusive_ptr<PluginModuleInfo>> Records(const std::vector<int>& numbers)
 {
     std::vector<boost::intrusive_ptr<PluginModuleInfo>> records;
@@ -125,7 +147,7 @@ std::vector<boost::intrusive_ptr<PluginModuleInfo>> Records(const std::vector<in
 // A first scan: each plug-in is new.
 void AddNew(State& state, int plugins)
 {
-    const auto records = Records(Shuffled(plugins));
+    const auto records = Records(Ordered(plugins));
     PluginModuleInfoManager& manager = PluginModuleInfoManager::GetInstance();
     for ([[maybe_unused]] auto round : state)
     {
@@ -144,7 +166,7 @@ void AddKnown(State& state, int plugins)
 {
     if (!LoadFromFile(state, plugins))
         return;
-    const auto records = Records(Shuffled(plugins));
+    const auto records = Records(Ordered(plugins));
     PluginModuleInfoManager& manager = PluginModuleInfoManager::GetInstance();
     for ([[maybe_unused]] auto round : state)
     {
@@ -222,6 +244,8 @@ void RegisterRows()
         Register("save", Save, plugins);
         Register("find-id", FindByID, plugins);
         Register("find-locator", FindByLocator, plugins);
+        Register("find-id-anywhere", FindByIDAnywhere, plugins);
+        Register("find-locator-anywhere", FindByLocatorAnywhere, plugins);
         Register("add", AddNew, plugins);
         Register("add-known", AddKnown, plugins);
     }

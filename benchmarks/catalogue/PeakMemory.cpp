@@ -27,9 +27,15 @@ std::size_t Status(const std::string& name)
 
 } // namespace
 
+void PeakMemory::ReturnLargeBlocks()
+{
+    constexpr int kLargeBlock = 1 << 20;
+    mallopt(M_MMAP_THRESHOLD, kLargeBlock);
+}
+
 PeakMemory::PeakMemory()
 {
-    malloc_trim(0);                                // What was freed before must not serve unseen
+    malloc_trim(0);
     std::ofstream("/proc/self/clear_refs") << "5"; // The peak begins anew
     mBefore = Status("VmRSS");
 }

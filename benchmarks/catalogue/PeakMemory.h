@@ -10,6 +10,10 @@ namespace zebaudiofilterhost::benchmarks
 class PeakMemory
 {
 public:
+    /// From now on what is freed goes back to the system at once, so that it does not count any more. Call it before
+    /// all else.
+    static void ReturnLargeBlocks();
+
     PeakMemory();
 
     std::size_t Bytes() const;

@@ -1,5 +1,5 @@
 // bench_peer_scan FOLDER LIST: what an application of the peer does to know the VST 3 plug-ins in a folder: reads its
-// list, scans what is new, and writes the list.
+// list, scans what is new, with a note of the plug-in at hand in case it crashes, and writes the list.
 #include <juce_audio_processors/juce_audio_processors.h>
 
 #include <cstdio>
@@ -18,7 +18,7 @@ int main(int argc, char** argv)
         list.recreateFromXml(*known);
     juce::VST3PluginFormat format;
     juce::PluginDirectoryScanner scanner(list, format, juce::FileSearchPath(juce::String::fromUTF8(argv[1])), true,
-                                         juce::File());
+                                         file.getSiblingFile("scanning"));
     juce::String name;
     while (scanner.scanNextFile(true, name))
     {

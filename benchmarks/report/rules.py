@@ -24,7 +24,7 @@ RULES = [
     Rule(r'P3/.*', AddedRatio('ours', over='peer'), 0.5, 'added cost of parameter changes, over the peer\'s'),
 
     Rule(r'P4/load/plugins:8000', Ratio('ours', over=('peer',)), 0.05, 'time, over the peer\'s'),
-    Rule(r'P4/.*/plugins:10000', PerEntryGrowth('ours', 'plugins', 10000, 1000), 1.3,
+    Rule(r'P4/(load|save|find-id|find-locator|add|add-known)/plugins:10000', PerEntryGrowth('ours', 'plugins', 10000, 1000), 1.3,
          'time per plug-in at 10000, over that at 1000'),
 
     Rule(r'P5/first/in-process', Ratio('ours', over=('peer',)), 1.1, 'time, over the peer\'s'),
