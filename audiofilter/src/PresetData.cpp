@@ -2,6 +2,9 @@
 
 #include "foundation/zebcore/BinaryText.h"
 #include "foundation/zebcore/PropListUtils.h"
+#include "foundation/zebcore/PropListVisitor.h"
+
+#include <utility>
 
 namespace zebaudiofilterhost
 {
@@ -24,6 +27,24 @@ T ValueOr(const PropList* propList, const UTF8String& key, T value)
         propList->GetValue(key, value);
     return value;
 }
+
+// Finds the text of the chunk where it lies: it may have megabytes.
+class ChunkText final : public zebcore::proplist::PropListVisitor
+{
+public:
+    using PropListVisitor::VisitValue;
+    void VisitValue(const UTF8String& key, const UTF8String& value) override
+    {
+        if (key == PresetData::kChunkDataKey)
+            mText = &value;
+    }
+
+    // Null if there is none.
+    const UTF8String* Get() const { return mText; }
+
+private:
+    const UTF8String* mText = nullptr;
+};
 
 } // namespace
 
@@ -91,15 +112,21 @@ void PresetData::SetParamList(const std::list<float>& params)
 bool PresetData::GetChunkData(std::vector<unsigned char>& chunk) const
 {
     chunk.clear();
-    const UTF8String text = ValueOr(mPropList, kChunkDataKey, UTF8String());
-    return !text.empty() && zebcore::utility::DecodeBinaryDataFromUTF8String(text, chunk);
+    ChunkText finder;
+    if (mPropList != nullptr)
+        mPropList->Visit(finder);
+    const UTF8String* const text = finder.Get();
+    return text != nullptr && !text->empty() && zebcore::utility::DecodeBinaryDataFromUTF8String(*text, chunk);
 }
 
 void PresetData::SetChunkData(const unsigned char* data, unsigned long size)
 {
     UTF8String text;
     if (mPropList != nullptr && zebcore::utility::EncodeBinaryDataToUTF8String(data, size, text))
-        Store(kChunkDataKey, text);
+    {
+        mPropList->SetValue(kChunkDataKey, std::move(text));
+        Signal();
+    }
 }
 
 PropList* PresetData::GetCustomDataSection()

@@ -39,6 +39,19 @@ void AppendGroup(UTF8String& text, const unsigned char* bytes, std::size_t count
         text += i <= count ? kDigits[bits >> (18U - 6U * i) & 63U] : kPadding;
 }
 
+void EncodeFullGroups(const unsigned char* bytes, std::size_t groups, char8_t* digits)
+{
+    for (; groups > 0; --groups, bytes += kGroupBytes, digits += kGroupDigits)
+    {
+        const std::uint32_t bits = static_cast<std::uint32_t>(bytes[0]) << 16U |
+                                   static_cast<std::uint32_t>(bytes[1]) << 8U | static_cast<std::uint32_t>(bytes[2]);
+        digits[0] = kDigits[bits >> 18U];
+        digits[1] = kDigits[bits >> 12U & 63U];
+        digits[2] = kDigits[bits >> 6U & 63U];
+        digits[3] = kDigits[bits & 63U];
+    }
+}
+
 // `digits` are two to four, the group's padding not counted. False if one is no digit, or bits that no byte holds are
 // set.
 bool AppendBytes(std::vector<unsigned char>& data, std::u8string_view digits)
@@ -59,20 +72,34 @@ bool AppendBytes(std::vector<unsigned char>& data, std::u8string_view digits)
     return (bits & (0xFFFFFFU >> (8U * count))) == 0;
 }
 
-bool Decode(std::u8string_view text, std::vector<unsigned char>& data)
+// Groups of four digits each. False if one is no digit.
+bool DecodeFullGroups(std::u8string_view text, unsigned char* bytes)
 {
-    if (text.size() % kGroupDigits != 0)
-        return false;
-    data.reserve(text.size() / kGroupDigits * kGroupBytes);
-    for (; !text.empty(); text.remove_prefix(kGroupDigits))
+    for (; !text.empty(); text.remove_prefix(kGroupDigits), bytes += kGroupBytes)
     {
-        std::u8string_view digits = text.substr(0, kGroupDigits);
-        if (text.size() == kGroupDigits) // only the last group may be padded
-            digits = digits.substr(0, digits.find_last_not_of(kPadding) + 1);
-        if (digits.size() < 2 || !AppendBytes(data, digits))
+        const std::uint32_t a = kDigitValues[text[0]];
+        const std::uint32_t b = kDigitValues[text[1]];
+        const std::uint32_t c = kDigitValues[text[2]];
+        const std::uint32_t d = kDigitValues[text[3]];
+        if (((a | b | c | d) & kNoDigit) != 0)
             return false;
+        bytes[0] = static_cast<unsigned char>(a << 2U | b >> 4U);
+        bytes[1] = static_cast<unsigned char>(b << 4U | c >> 2U);
+        bytes[2] = static_cast<unsigned char>(c << 6U | d);
     }
     return true;
+}
+
+bool Decode(std::u8string_view text, std::vector<unsigned char>& data)
+{
+    if (text.empty() || text.size() % kGroupDigits != 0)
+        return text.empty();
+    const std::size_t full = text.size() - kGroupDigits; // only the last group may be padded
+    data.reserve(text.size() / kGroupDigits * kGroupBytes);
+    data.resize(full / kGroupDigits * kGroupBytes);
+    const std::u8string_view last = text.substr(full);
+    const std::u8string_view digits = last.substr(0, last.find_last_not_of(kPadding) + 1);
+    return DecodeFullGroups(text.substr(0, full), data.data()) && digits.size() >= 2 && AppendBytes(data, digits);
 }
 
 } // namespace
@@ -82,9 +109,12 @@ bool EncodeBinaryDataToUTF8String(const unsigned char* data, unsigned long lengt
     text.clear();
     if (data == nullptr && length != 0)
         return false;
+    const std::size_t full = length / kGroupBytes;
     text.reserve((length + kGroupBytes - 1) / kGroupBytes * kGroupDigits);
-    for (; length > kGroupBytes; data += kGroupBytes, length -= kGroupBytes)
-        AppendGroup(text, data, kGroupBytes);
+    text.resize(full * kGroupDigits);
+    EncodeFullGroups(data, full, text.data());
+    data += full * kGroupBytes;
+    length -= full * kGroupBytes;
     if (length > 0)
         AppendGroup(text, data, length);
     return true;

@@ -15,7 +15,8 @@ namespace
 {
 
 constexpr XML_Char kNameSeparator = '\n';
-constexpr std::size_t kBlockSize = std::size_t{1} << 30U;
+// Expat copies each block that it is given. Small ones would make it read a long attribute again and again.
+constexpr std::size_t kBlockSize = std::size_t{1} << 20U;
 
 std::u8string_view View(const XML_Char* text)
 {

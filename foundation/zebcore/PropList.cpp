@@ -5,6 +5,7 @@
 #include "foundation/zebcore/internal/PropListEntries.h"
 
 #include <type_traits>
+#include <typeinfo>
 #include <utility>
 
 namespace zebcore::proplist
@@ -23,6 +24,26 @@ bool Get(const Value* stored, T& target)
 }
 
 } // namespace
+
+// A wrapper has its own idea of setting a value.
+template <typename Text>
+void PropList::Take(const UTF8String& key, Text&& value)
+{
+    if (typeid(*this) == typeid(PropList))
+        mEntries->Set(key, std::forward<Text>(value));
+    else
+        SetValue(key, std::as_const(value));
+}
+
+void PropList::SetValue(const UTF8String& key, UTF16String&& value)
+{
+    Take(key, std::move(value));
+}
+
+void PropList::SetValue(const UTF8String& key, UTF8String&& value)
+{
+    Take(key, std::move(value));
+}
 
 PropList::PropList() : mEntries(std::make_unique<Entries>())
 {

@@ -77,8 +77,15 @@ public:
     template <typename T>
     void SetValue(const UTF8String& key, T* value) = delete;
 
+    /// A text that its owner is done with is taken over instead of copied.
+    void SetValue(const UTF8String& key, UTF16String&& value);
+    void SetValue(const UTF8String& key, UTF8String&& value);
+
 private:
     class Entries;
+
+    template <typename Text>
+    void Take(const UTF8String& key, Text&& value);
 
     std::unique_ptr<Entries> mEntries;
 };

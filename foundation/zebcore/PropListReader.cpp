@@ -42,23 +42,34 @@ bool ParseFloat(std::u8string_view text, float& value)
     return true;
 }
 
-template <typename String>
-bool SetString(PropList& list, const UTF8String& key, std::u8string_view text)
+bool SetUTF16(PropList& list, const UTF8String& key, UTF8String& text)
 {
-    String value;
+    UTF16String value;
     xml::UnescapeXmlText(text, value);
-    list.SetValue(key, value);
+    list.SetValue(key, std::move(value));
     return true;
 }
 
-bool SetBool(PropList& list, const UTF8String& key, std::u8string_view text)
+// What holds no escape may be long, and goes on as it is.
+bool SetUTF8(PropList& list, const UTF8String& key, UTF8String& text)
+{
+    UTF8String value;
+    if (text.find(u8'\\') == UTF8String::npos)
+        value.swap(text);
+    else
+        xml::UnescapeXmlText(text, value);
+    list.SetValue(key, std::move(value));
+    return true;
+}
+
+bool SetBool(PropList& list, const UTF8String& key, UTF8String& text)
 {
     list.SetValue(key, text == kTrue);
     return text == kTrue || text == kFalse;
 }
 
 template <typename T>
-bool SetInteger(PropList& list, const UTF8String& key, std::u8string_view text)
+bool SetInteger(PropList& list, const UTF8String& key, UTF8String& text)
 {
     T value = 0;
     const bool isNumber = ParseNumber(text, value);
@@ -66,7 +77,7 @@ bool SetInteger(PropList& list, const UTF8String& key, std::u8string_view text)
     return isNumber;
 }
 
-bool SetFloat(PropList& list, const UTF8String& key, std::u8string_view text)
+bool SetFloat(PropList& list, const UTF8String& key, UTF8String& text)
 {
     float value = 0;
     const bool isNumber = ParseFloat(text, value);
@@ -74,8 +85,9 @@ bool SetFloat(PropList& list, const UTF8String& key, std::u8string_view text)
     return isNumber;
 }
 
-bool SetFloats(PropList& list, const UTF8String& key, std::u8string_view text)
+bool SetFloats(PropList& list, const UTF8String& key, UTF8String& whole)
 {
+    const std::u8string_view text = whole;
     std::list<float> values;
     for (std::size_t begin = text.find_first_not_of(kBlanks); begin != std::u8string_view::npos;)
     {
@@ -98,12 +110,9 @@ const xml::XmlAttribute* Find(const std::vector<xml::XmlAttribute>& attributes, 
 } // namespace
 
 const PropListReader::ValueElement PropListReader::kValueElements[] = {
-    {kUTF16Element, SetString<UTF16String>},
-    {kUTF8Element, SetString<UTF8String>},
-    {kBoolElement, SetBool},
-    {kUnsignedElement, SetInteger<unsigned int>},
-    {kIntElement, SetInteger<int>},
-    {kFloatElement, SetFloat},
+    {kUTF16Element, SetUTF16},      {kUTF8Element, SetUTF8},
+    {kBoolElement, SetBool},        {kUnsignedElement, SetInteger<unsigned int>},
+    {kIntElement, SetInteger<int>}, {kFloatElement, SetFloat},
     {kFloatsElement, SetFloats},
 };
 

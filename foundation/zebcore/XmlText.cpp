@@ -122,6 +122,8 @@ std::size_t AppendPlain(UTF8String& out, std::basic_string_view<Unit> text)
     const auto end = std::find_if_not(text.begin(), text.end(), IsPlain<Unit>);
     const auto length = static_cast<std::size_t>(end - text.begin());
     const std::size_t before = out.size();
+    if (out.capacity() - before < length) // Room for what follows too: a chunk of megabytes is not to be moved again
+        out.reserve(before + length + length / 8);
     out.resize(before + length);
     std::transform(text.begin(), end, out.begin() + static_cast<std::ptrdiff_t>(before),
                    [](Unit unit) { return static_cast<char8_t>(unit); });

@@ -59,6 +59,24 @@ TEST_F(PluginModuleInfoManagerTest, NewRecordReplacesTheOldOneAtTheEnd)
     EXPECT_EQ(Texts(mManager.GetPluginLocators()), (Strings{"2:/c", "3:/b"}));
 }
 
+TEST_F(PluginModuleInfoManagerTest, OrderOfArrivalSurvivesReplacingAndRemovingMany)
+{
+    const auto locator = [](int index)
+    {
+        return VST3(u"/" + UTF16String(1, static_cast<char16_t>(u'a' + index)));
+    };
+    for (const int index : {0, 1, 2, 3, 4, 1, 1, 3, 0, 1, 1, 1, 1})
+    {
+        mManager.AddPluginModuleInfo(MakeInfo(locator(index), true));
+    }
+    mManager.RemovePluginLocators({locator(3), locator(3), locator(9)});
+    EXPECT_EQ(RecordPaths(), (Strings{"/c", "/e", "/a", "/b"}));
+    mManager.AddPluginModuleInfo(MakeInfo(locator(3), true));
+    mManager.AddPluginModuleInfo(MakeInfo(locator(2), true));
+    EXPECT_EQ(RecordPaths(), (Strings{"/e", "/a", "/b", "/d", "/c"}));
+    EXPECT_EQ(Texts(mManager.GetPluginLocators()), (Strings{"3:/a", "3:/b", "3:/c", "3:/d", "3:/e"}));
+}
+
 TEST_F(PluginModuleInfoManagerTest, EnabledFlagIsTheRecordsOrTheCallersDefault)
 {
     mManager.AddPluginModuleInfo(MakeInfo(VST3(u"/on"), true));

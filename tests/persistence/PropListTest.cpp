@@ -1,6 +1,7 @@
 #include "foundation/zebcore/PropList.h"
 
 #include "foundation/zebcore/PropListVisitor.h"
+#include "foundation/zebcore/StringConversion.h"
 
 #include <gtest/gtest.h>
 
@@ -193,6 +194,35 @@ TEST(PropList, ClearAndRemoveEmptyIt)
     EXPECT_TRUE(list.IsEmpty());
     int value = 5;
     EXPECT_FALSE(list.GetValue(u8"a", value));
+}
+
+// Long lists are searched in another way than short ones.
+TEST(PropList, ManyKeysAreFoundWhileTheyComeAndGo)
+{
+    const auto key = [](int index)
+    {
+        return zebcore::utility::UTF8FromNarrow("key" + std::to_string(index));
+    };
+    PropList list;
+    for (int index = 0; index < 100; ++index)
+    {
+        list.SetValue(key(index), index);
+        list.SetValue(key(index / 2), index / 2);
+    }
+    for (int index = 0; index < 100; index += 3)
+        list.RemoveValue(key(index));
+    for (int index = 0; index < 100; ++index)
+    {
+        int value = -1;
+        EXPECT_EQ(list.GetValue(key(index), value), index % 3 != 0) << index;
+        EXPECT_EQ(value, index % 3 == 0 ? -1 : index);
+    }
+    for (int index = 0; index < 95; ++index)
+        list.RemoveValue(key(index));
+    list.SetValue(u8"last", true);
+    int value = 0;
+    EXPECT_TRUE(list.GetValue(key(97), value));
+    EXPECT_FALSE(list.GetValue(key(94), value));
 }
 
 TEST(PropList, CopiesAreDeep)

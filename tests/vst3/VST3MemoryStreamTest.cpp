@@ -188,6 +188,27 @@ TEST(VST3MemoryStream, RefusesWhatNobodyCanStore)
     EXPECT_EQ(ContentOf(stream), "hello");
 }
 
+TEST(VST3MemoryStream, WritingLeavesBorrowedBytesAlone)
+{
+    const std::string lent = "abcdef";
+    VST3MemoryStream stream;
+    Write(stream, "before");
+    stream.Borrow(lent);
+    EXPECT_EQ(PositionOf(stream), 0);
+    EXPECT_EQ(ContentOf(stream), lent);
+    std::array<char, 8> bytes{};
+    int32 read = 0;
+    stream.read(bytes.data(), 3, &read);
+    EXPECT_EQ(std::string(bytes.data(), 3), "abc");
+    EXPECT_EQ(Write(stream, "X"), 1);
+    EXPECT_EQ(ContentOf(stream), "abcX");
+    EXPECT_EQ(lent, "abcdef");
+
+    stream.Borrow(lent);
+    EXPECT_TRUE(stream.SetSize(2));
+    EXPECT_EQ(ContentOf(stream), "ab");
+}
+
 TEST(VST3MemoryStream, SetSizeLeavesThePosition)
 {
     VST3MemoryStream stream;

@@ -40,12 +40,16 @@ std::string TextOf(const PropList& list, const char8_t* key)
 // Nothing if the file is no preset of ours.
 std::optional<PropList> ReadPreset(const fs::path& file)
 {
-    PropList list;
+    std::optional<PropList> list(std::in_place); // Filled where it stays: a preset may have megabytes
     unsigned int version = 0;
-    const bool sound = zebcore::proplist::utils::LoadPropList(ToFile(file).FullPath(), list, false) &&
-                       list.GetValue(kVersionKey, version) && version == kVersion &&
-                       list.GetSubList(kPresetKey) != nullptr;
-    return sound ? std::optional<PropList>(list) : std::nullopt;
+    const bool sound = zebcore::proplist::utils::LoadPropList(ToFile(file).FullPath(), *list, false) &&
+                       list->GetValue(kVersionKey, version) && version == kVersion &&
+                       list->GetSubList(kPresetKey) != nullptr;
+    if (!sound)
+    {
+        list.reset();
+    }
+    return list;
 }
 
 void WritePreset(AudioFilter& filter, const fs::path& file)

@@ -20,7 +20,8 @@ public:
     bool OnCharacters(std::u8string_view text) override;
 
 private:
-    using SetFunction = bool (*)(PropList& list, const UTF8String& key, std::u8string_view text);
+    // May take the text over.
+    using SetFunction = bool (*)(PropList& list, const UTF8String& key, UTF8String& text);
 
     struct ValueElement
     {

@@ -30,12 +30,27 @@ int64 SaturatedSum(int64 left, int64 right)
 
 int64 VST3MemoryStream::GetSize() const
 {
-    return static_cast<int64>(mData.size());
+    return static_cast<int64>(mBorrowed.empty() ? mData.size() : mBorrowed.size());
 }
 
 const char* VST3MemoryStream::GetData() const
 {
-    return mData.data();
+    return mBorrowed.empty() ? mData.data() : mBorrowed.data();
+}
+
+void VST3MemoryStream::Borrow(std::span<const char> bytes)
+{
+    mData.clear();
+    mBorrowed = bytes;
+    mPosition = 0;
+}
+
+void VST3MemoryStream::TakeOver()
+{
+    if (mBorrowed.empty())
+        return;
+    mData.assign(mBorrowed.begin(), mBorrowed.end());
+    mBorrowed = {};
 }
 
 bool VST3MemoryStream::SetSize(int64 size)
@@ -45,6 +60,7 @@ bool VST3MemoryStream::SetSize(int64 size)
     const auto end = static_cast<std::size_t>(std::max<int64>(size, 0));
     try
     {
+        TakeOver();
         if (end > mData.size() && mData.capacity() < 2 * end)
             mData.reserve(2 * end);
         mData.resize(end);
@@ -84,7 +100,7 @@ tresult PLUGIN_API VST3MemoryStream::read(void* buffer, int32 count, int32* numR
     // There is nothing to read before the first byte.
     if (count <= 0 || mPosition < 0 || !buffer)
         return Steinberg::kResultOk;
-    std::memcpy(buffer, mData.data() + mPosition, static_cast<std::size_t>(count));
+    std::memcpy(buffer, GetData() + mPosition, static_cast<std::size_t>(count));
     mPosition += count;
     if (numRead)
         *numRead = count;

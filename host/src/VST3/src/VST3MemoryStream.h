@@ -4,6 +4,7 @@
 
 #include <pluginterfaces/base/ibstream.h>
 
+#include <span>
 #include <vector>
 
 namespace zebaudiofilterhost::vst3
@@ -23,6 +24,10 @@ public:
 
     VST3MemoryStream(const VST3MemoryStream&) = delete;
     VST3MemoryStream& operator=(const VST3MemoryStream&) = delete;
+
+    /// Shows these bytes, from the first on, and copies them only when somebody writes. They must outlive that, or
+    /// the stream.
+    void Borrow(std::span<const char> bytes);
 
     /// In bytes.
     Steinberg::int64 GetSize() const;
@@ -46,7 +51,10 @@ public:
 
 private:
     HostReferenceCount mReferenceCount;
+    void TakeOver();
+
     std::vector<char> mData;
+    std::span<const char> mBorrowed; // in place of mData unless empty
     Steinberg::int64 mPosition = 0;
 };
 

@@ -5,7 +5,6 @@
 #include "host/src/VST3/src/VST3MemoryStream.h"
 
 #include <cstdint>
-#include <limits>
 #include <span>
 
 namespace zebaudiofilterhost::vst3
@@ -65,15 +64,33 @@ bool ParseChunk(Bytes chunk, StateChunk& state)
 }
 
 // False for more than a stream takes.
-bool FillStream(VST3MemoryStream& stream, Bytes bytes)
+bool ShowBytes(VST3MemoryStream& stream, Bytes bytes)
 {
-    if (bytes.size() > static_cast<std::size_t>(std::numeric_limits<int32>::max()))
+    if (bytes.size() > static_cast<std::size_t>(VST3MemoryStream::kMaxSize))
         return false;
-    auto* source = const_cast<unsigned char*>(bytes.data()); // the published signature; a write only reads
-    if (!bytes.empty() && stream.write(source, static_cast<int32>(bytes.size()), nullptr) != kResultOk)
-        return false;
-    stream.seek(0, IBStream::kIBSeekSet, nullptr);
+    // NOLINTNEXTLINE(cppcoreguidelines-pro-type-reinterpret-cast): bytes, under the stream's name for them
+    stream.Borrow({reinterpret_cast<const char*>(bytes.data()), bytes.size()});
     return true;
+}
+
+// Empty if neither has a state. The streams go before the chunk is put into text: states may have megabytes.
+std::vector<unsigned char> CollectChunk(Steinberg::Vst::IComponent& plugin, Steinberg::Vst::IEditController* editor)
+{
+    VST3MemoryStream component;
+    if (plugin.getState(&component) != kResultOk)
+        component.SetSize(0);
+    VST3MemoryStream controller;
+    if (editor != nullptr && editor->getState(&controller) != kResultOk)
+        controller.SetSize(0);
+    std::vector<unsigned char> chunk;
+    if (component.GetSize() == 0 && controller.GetSize() == 0)
+        return chunk;
+    chunk.reserve(kHeaderLength + static_cast<std::size_t>(component.GetSize() + controller.GetSize()));
+    AppendSize(chunk, static_cast<std::uint64_t>(component.GetSize()));
+    AppendSize(chunk, static_cast<std::uint64_t>(controller.GetSize()));
+    AppendStream(chunk, component);
+    AppendStream(chunk, controller);
+    return chunk;
 }
 
 } // namespace
@@ -87,21 +104,9 @@ bool VST3AudioFilter::SaveChunkData(PresetData& presetData) const
 {
     if (!mComponent)
         return false;
-    VST3MemoryStream component;
-    if (mComponent->getState(&component) != kResultOk)
-        component.SetSize(0);
-    VST3MemoryStream controller;
-    if (mController && mController->getState(&controller) != kResultOk)
-        controller.SetSize(0);
-    if (component.GetSize() == 0 && controller.GetSize() == 0)
+    const std::vector<unsigned char> chunk = CollectChunk(*mComponent, mController.Get());
+    if (chunk.empty())
         return true;
-
-    std::vector<unsigned char> chunk;
-    chunk.reserve(kHeaderLength + static_cast<std::size_t>(component.GetSize() + controller.GetSize()));
-    AppendSize(chunk, static_cast<std::uint64_t>(component.GetSize()));
-    AppendSize(chunk, static_cast<std::uint64_t>(controller.GetSize()));
-    AppendStream(chunk, component);
-    AppendStream(chunk, controller);
     presetData.SetChunkData(chunk.data(), static_cast<unsigned long>(chunk.size()));
     presetData.SetVersion(GetCurrentPresetVersion());
     presetData.SetPresetType(PresetData::kPresetType_Chunk);
@@ -117,7 +122,7 @@ bool VST3AudioFilter::LoadChunkData(const PresetData& presetData)
         return false;
     StateChunk state;
     VST3MemoryStream component;
-    if (!ParseChunk(chunk, state) || !FillStream(component, state.component))
+    if (!ParseChunk(chunk, state) || !ShowBytes(component, state.component))
         return true;
     mComponent->setState(&component);
     component.seek(0, IBStream::kIBSeekSet, nullptr);
@@ -125,7 +130,7 @@ bool VST3AudioFilter::LoadChunkData(const PresetData& presetData)
         return true;
     mController->setComponentState(&component);
     VST3MemoryStream controller;
-    if (!state.controller.empty() && FillStream(controller, state.controller))
+    if (!state.controller.empty() && ShowBytes(controller, state.controller))
         mController->setState(&controller);
     return true;
 }
