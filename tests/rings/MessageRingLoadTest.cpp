@@ -46,10 +46,10 @@ public:
             {
                 const LetterPtr& letter = mLetters.at(asked % kTravellers);
                 letter->mQuestion = asked;
-                mWrongAnswers += mThere.Push(letter) ? 0 : 1;
+                mWrongAnswers += mThere.Push(letter) ? 0U : 1U;
             }
             for (boost::intrusive_ptr<Message> back; mBack.Pop(back); ++answered)
-                mWrongAnswers += static_cast<const Letter&>(*back).mAnswer == ~answered ? 0 : 1;
+                mWrongAnswers += static_cast<const Letter&>(*back).mAnswer == ~answered ? 0U : 1U;
         }
     }
 
@@ -60,9 +60,9 @@ public:
             for (boost::intrusive_ptr<Message> message; mThere.Pop(message); ++heard)
             {
                 auto& letter = static_cast<Letter&>(*message);
-                mWrongQuestions += letter.mQuestion == heard ? 0 : 1;
+                mWrongQuestions += letter.mQuestion == heard ? 0U : 1U;
                 letter.mAnswer = ~letter.mQuestion;
-                mWrongQuestions += mBack.Push(message) ? 0 : 1;
+                mWrongQuestions += mBack.Push(message) ? 0U : 1U;
             }
         }
     }
