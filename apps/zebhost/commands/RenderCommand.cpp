@@ -2,6 +2,7 @@
 #include "commands/Commands.h"
 #include "commands/FileRenderer.h"
 #include "filter/Interrupt.h"
+#include "filter/ProcessFailures.h"
 #include "output/Strings.h"
 
 #include <filesystem>
@@ -67,6 +68,7 @@ ExitCode RunRender(CommandContext& context)
     interrupt::Watch();
     Json document = context.NewDocument();
     document["files"] = Json::array();
+    const ProcessFailures failures;
     for (std::size_t index = 0; index < pairs.size(); ++index)
     {
         const std::string number =
@@ -74,6 +76,13 @@ ExitCode RunRender(CommandContext& context)
         FileRenderer renderer(context, options, number);
         document["files"].push_back(renderer.Render(pairs[index].input, pairs[index].output));
         document["filter"] = renderer.FilterDocument();
+    }
+    document["processFailed"] = !failures.First().empty();
+    if (!failures.First().empty())
+    {
+        context.console.Warn("zebhost: " + document["filter"]["name"].get<std::string>() +
+                             " could not process every block (" + failures.First() +
+                             "): the output is silent where it gave nothing; its maker should know");
     }
     if (context.WantsJson())
     {
