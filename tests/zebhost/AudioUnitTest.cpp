@@ -13,6 +13,7 @@ namespace
 
 using testing::ElementsAre;
 using testing::HasSubstr;
+using testing::Not;
 
 constexpr std::size_t kFrames = 5000;
 constexpr const char* kGainID = "4:1635083896 2053595497 2053464696";
@@ -73,6 +74,51 @@ TEST_F(AudioUnitTest, AUnitThatIsGoneIsDropped)
     EXPECT_THAT(result.LastLine(), HasSubstr("is gone"));
     EXPECT_THAT(Succeed({"scan"}).LastLine(), HasSubstr("4 dropped"));
     EXPECT_EQ(Succeed({"list", "--names"}).out, "");
+}
+
+TEST_F(AudioUnitTest, BlocksTellOfUnitsByTheirNames)
+{
+    constexpr const char* kFullName = "Zeb: Zeb Unit Gain";
+    for (const char* selector : {"Zeb Unit Gain", kGainID})
+    {
+        EXPECT_THAT(Succeed({"block", selector}).err, HasSubstr(std::string(kFullName) + " is blocked"));
+        EXPECT_THAT(Succeed({"blocks"}).out, testing::AllOf(HasSubstr(kFullName), Not(HasSubstr("1635083896"))));
+        const RunResult refused = Run({"info", kGainID});
+        EXPECT_EQ(refused.code, 6);
+        EXPECT_THAT(refused.LastLine(), testing::AllOf(HasSubstr(kFullName), HasSubstr(kGainID)));
+        EXPECT_THAT(Succeed({"unblock", selector}).err, HasSubstr(kFullName));
+    }
+    Succeed({"block", kGainID});
+    const nlohmann::json blocked = Succeed({"blocks", "--json"}).Json().at("blocked").at(0);
+    EXPECT_EQ(blocked.at("place"), kFullName);
+    EXPECT_EQ("4:" + blocked.at("path").get<std::string>(), kGainID);
+    Succeed({"unblock", kFullName});
+    EXPECT_EQ(Run({"unblock", kFullName}).code, 3);
+}
+
+// Its name has gone with it.
+TEST_F(AudioUnitTest, ABlockedUnitThatIsGoneIsToldOfByItsCodes)
+{
+    Succeed({"block", kGainID});
+    mVariables["AUDIO_COMPONENT_PATH"] = Path("none");
+    EXPECT_THAT(Succeed({"blocks"}).out, HasSubstr("aufx zgai zebx"));
+    EXPECT_THAT(Succeed({"unblock", "aufx zgai zebx"}).err, HasSubstr("aufx zgai zebx is not blocked any more"));
+}
+
+TEST_F(AudioUnitTest, AUnitThatFailsToRenderIsToldOf)
+{
+    mVariables["AUDIO_COMPONENT_PATH"] = ZEB_UNIT_FIXTURES;
+    mVariables["ZEB_FIXTURE_RENDER_RESULT"] = "-10876";
+    Succeed({"scan", "--quiet"});
+    const RunResult result =
+        Succeed({"render", "Recorder", Path("in.wav"), Path("out.wav"), "--overwrite", "--quiet", "--json"});
+    EXPECT_THAT(result.err, testing::AllOf(HasSubstr("Recorder could not process every block"), HasSubstr("-10876")));
+    EXPECT_EQ(result.Json().at("processFailed"), true);
+    EXPECT_EQ(ReadSound(Path("out.wav")).channels[0], std::vector<int>(kFrames, 0));
+    mVariables.erase("ZEB_FIXTURE_RENDER_RESULT");
+    const RunResult works = Succeed({"render", "Recorder", Path("in.wav"), Path("out.wav"), "--overwrite", "--json"});
+    EXPECT_EQ(works.Json().at("processFailed"), false);
+    EXPECT_TRUE(ReadSound(Path("out.wav")).channels == mInput.channels);
 }
 
 TEST_F(AudioUnitTest, NameAndIDSelectTheSameUnit)

@@ -1,10 +1,10 @@
 #include "catalogue/Catalogue.h"
 
+#include "catalogue/PluginFinder.h"
 #include "cli/Failure.h"
 #include "output/PrintableText.h"
 
 #include <foundation/zebcore/FileExceptions.h>
-#include <foundation/zebcore/NativePath.h>
 #include <foundation/zebcore/PropListUtils.h>
 #include <host/AudioFilterDescriptor.h>
 #include <host/BannedPluginManager.h>
@@ -238,15 +238,15 @@ bool Catalogue::IsBlocked(const PluginLocator& locator) const
 
 std::string Catalogue::BlockedBecause(const PluginLocator& locator) const
 {
-    const std::string path = zebcore::filesupport::ToNativePath(locator.GetPath());
+    const std::string place = PlaceOf(locator);
     if (!BannedPluginManager::GetInstance().IsPluginBanned(locator))
     {
-        return path + " is on the permanent block list, " + mFolder.PermanentBlocks().string() +
+        return place + " is on the permanent block list, " + mFolder.PermanentBlocks().string() +
                ": it is not used; take it off that list if you must";
     }
     const BlockReason why = mReasons.Get(locator);
-    return path + " is blocked" + (why.since.empty() ? "" : " since " + why.since) +
-           (why.reason.empty() ? "" : " (" + why.reason + ")") + ": 'zebhost unblock " + path +
+    return place + " is blocked" + (why.since.empty() ? "" : " since " + why.since) +
+           (why.reason.empty() ? "" : " (" + why.reason + ")") + ": 'zebhost unblock " + SelectorWord(locator) +
            "' lets it be used again";
 }
 

@@ -10,7 +10,9 @@
 
 #include <algorithm>
 #include <array>
+#include <cstdint>
 #include <set>
+#include <sstream>
 #include <utility>
 
 namespace zebhost
@@ -46,6 +48,25 @@ TechnologyType TechnologyOf(const fs::path& path)
         }
     }
     return zebaudiofilterhost::kTechnologyNone;
+}
+
+// "1635083896 2053595497 2053464696" as "aufx zgai zebx". Codes of other characters than visible ones stay numbers.
+std::string SpelledCodes(const std::string& id)
+{
+    std::istringstream numbers(id);
+    std::string spelled;
+    for (std::uint32_t code = 0; numbers >> code;)
+    {
+        std::string characters;
+        for (int shift = 24; shift >= 0; shift -= 8)
+        {
+            characters += static_cast<char>(code >> shift & 0xFFU);
+        }
+        const bool isVisible =
+            std::all_of(characters.begin(), characters.end(), [](char each) { return each >= ' ' && each <= '~'; });
+        spelled += (spelled.empty() ? "" : " ") + (isVisible ? characters : std::to_string(code));
+    }
+    return spelled.empty() ? id : spelled;
 }
 
 fs::path Normal(const fs::path& path)
@@ -117,11 +138,28 @@ std::string PathOf(const PluginLocator& locator)
 
 std::string PlaceOf(const PluginLocator& locator)
 {
-    const TechnologyType type = locator.GetTechnologyType();
-    const auto technology = PluginModuleInfoManager::GetInstance().GetPluginTechnology(type);
-    return technology != nullptr && type == zebaudiofilterhost::kTechnologyAudioUnit
-               ? Printable(technology->GetPathDisplayString(locator.GetPath()))
-               : PathOf(locator);
+    const std::string path = PathOf(locator);
+    if (locator.GetTechnologyType() != zebaudiofilterhost::kTechnologyAudioUnit)
+    {
+        return path;
+    }
+    const auto technology =
+        PluginModuleInfoManager::GetInstance().GetPluginTechnology(zebaudiofilterhost::kTechnologyAudioUnit);
+    const std::string name =
+        technology != nullptr ? Printable(technology->GetPathDisplayString(locator.GetPath())) : path;
+    return name == path ? SpelledCodes(path) : name;
+}
+
+std::string SelectorOf(const PluginLocator& locator)
+{
+    return locator.GetTechnologyType() == zebaudiofilterhost::kTechnologyAudioUnit ? "4:" + PathOf(locator)
+                                                                                   : PathOf(locator);
+}
+
+std::string SelectorWord(const PluginLocator& locator)
+{
+    const std::string selector = SelectorOf(locator);
+    return selector.find(' ') == std::string::npos ? selector : '"' + selector + '"';
 }
 
 bool IsInstalled(const PluginLocator& locator)

@@ -17,7 +17,7 @@ IScanObserver::Outcome ScanUnderGuard(const PluginLocator& locator, const ScanSe
                                       const std::string& advice,
                                       const std::function<void(const std::string&)>& beforeStep)
 {
-    const CrashGuard guard(PathOf(locator), advice, options.timeoutSeconds);
+    const CrashGuard guard(PlaceOf(locator), advice, options.timeoutSeconds);
     return ScanPlugin(locator, options.skipCategory,
                       [&guard, &beforeStep](const std::string& detail)
                       {

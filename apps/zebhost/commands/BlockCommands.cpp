@@ -2,6 +2,7 @@
 #include "catalogue/PluginFinder.h"
 #include "cli/Failure.h"
 #include "commands/Commands.h"
+#include "output/Strings.h"
 #include "output/TextTable.h"
 
 #include <host/BannedPluginManager.h>
@@ -24,6 +25,15 @@ std::vector<PluginLocator> Blocked()
     return {manager.BannedBegin(), manager.BannedEnd()};
 }
 
+// The full name of one that is no file, or what stands behind its maker.
+bool IsPlace(const PluginLocator& locator, const std::string& text)
+{
+    const std::string place = PlaceOf(locator);
+    const std::size_t colon = place.find(':');
+    return place == text ||
+           (place != PathOf(locator) && colon != std::string::npos && Trimmed(place.substr(colon + 1)) == text);
+}
+
 // A blocked plug-in may be gone from disk and catalogue, so its file name alone will do.
 PluginLocator BlockedPlugin(const CommandContext& context, const std::string& text)
 {
@@ -31,7 +41,8 @@ PluginLocator BlockedPlugin(const CommandContext& context, const std::string& te
     for (const PluginLocator& locator : Blocked())
     {
         const std::filesystem::path path = PathOf(locator);
-        if (path == text || path.filename() == text || path.stem() == text || locator == BundleLocator(text))
+        if (path == text || path.filename() == text || path.stem() == text || locator == BundleLocator(text) ||
+            SelectorOf(locator) == text || IsPlace(locator, text))
         {
             fitting.push_back(locator);
         }
@@ -46,7 +57,7 @@ PluginLocator BlockedPlugin(const CommandContext& context, const std::string& te
         const PluginLocator locator = FilterSelector(context.catalogue).SelectPlugin(text);
         if (!BannedPluginManager::GetInstance().IsPluginBanned(locator))
         {
-            throw Failure(ExitCode::NotFound, PathOf(locator) + " is not blocked: 'zebhost blocks' shows what is");
+            throw Failure(ExitCode::NotFound, PlaceOf(locator) + " is not blocked: 'zebhost blocks' shows what is");
         }
         return locator;
     }
@@ -59,9 +70,10 @@ void Tell(const CommandContext& context, const PluginLocator& locator, const std
     {
         Json document = context.NewDocument();
         document["path"] = PathOf(locator);
+        document["place"] = PlaceOf(locator);
         context.Print(document);
     }
-    context.console.Remark("zebhost: " + PathOf(locator) + what);
+    context.console.Remark("zebhost: " + PlaceOf(locator) + what);
 }
 
 // So that the next scan tries it.
@@ -106,8 +118,9 @@ ExitCode RunBlocks(CommandContext& context)
     for (const PluginLocator& locator : Blocked())
     {
         const BlockReason why = context.catalogue.Reasons().Get(locator);
-        table.AddRow({PathOf(locator), why.since, why.reason});
-        document["blocked"].push_back(Json{{"path", PathOf(locator)}, {"since", why.since}, {"reason", why.reason}});
+        table.AddRow({PlaceOf(locator), why.since, why.reason});
+        document["blocked"].push_back(Json{
+            {"path", PathOf(locator)}, {"place", PlaceOf(locator)}, {"since", why.since}, {"reason", why.reason}});
     }
     if (context.WantsJson())
     {

@@ -11,8 +11,9 @@ namespace zebhost
 
 FilterOfCommand::FilterOfCommand(const CommandContext& context, unsigned int settleMs)
     : mDescriptor(FilterSelector(context.catalogue).Select(context.arguments.Text("FILTER")))
-    , mGuard(PathOf(mDescriptor->GetLocator()), "its maker should know; 'zebhost block " +
-                                                    PathOf(mDescriptor->GetLocator()) + "' keeps it from being used")
+    , mGuard(PlaceOf(mDescriptor->GetLocator()), "its maker should know; 'zebhost block " +
+                                                     SelectorWord(mDescriptor->GetLocator()) +
+                                                     "' keeps it from being used")
     , mFilter(LoadFilter(mDescriptor, settleMs))
 {
 }

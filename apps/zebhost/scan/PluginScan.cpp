@@ -49,7 +49,7 @@ void Step(const PluginLocator& locator, bool skipCategory, const BeforeStep& bef
 // What a plug-in throws ends its own scan, and no other's. Returns it as a sentence.
 std::string StepGuarded(const PluginLocator& locator, bool skipCategory, const BeforeStep& beforeStep)
 {
-    const std::string what = PathOf(locator) + " could not be scanned: it threw an exception";
+    const std::string what = PlaceOf(locator) + " could not be scanned: it threw an exception";
     try
     {
         Step(locator, skipCategory, beforeStep);
