@@ -5,9 +5,9 @@
 namespace zebhost
 {
 
-// While one lives, it hears when the library says that a plug-in's call for a block has failed: the sound of the block
-// is then whatever the plug-in has left of it. The library says so of a plug-in's first failure alone, and for Audio
-// Units of the process's first. One at a time. [main]
+// While one lives, it hears when the library says that a plug-in's call for a block has failed: the sound of the
+// block is then whatever the plug-in has left of it. The library says so of a plug-in's first failure alone, and for
+// Audio Units of the process's first. One at a time. [main]
 class ProcessFailures
 {
 public:
