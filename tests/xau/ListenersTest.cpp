@@ -335,6 +335,33 @@ TEST_F(ListenersCostTest, ListeningAndTellingDoNotGetExpensiveWithManyParameters
     EXPECT_LT(many.tell / few.tell, kMost);
 }
 
+TEST_F(ListenersTest, ChangesOfOtherThreadsAreHeardOnTheListenersOwn)
+{
+    Ear ear(0.0F);
+    ear.Listen(Change(1));
+    std::thread([&] { Notify(Change(1)); }).join();
+    mClock.Pass(kInterval);
+    EXPECT_THAT(ear.mHeard, testing::ElementsAre("1=0"));
+}
+
+TEST_F(ListenersTest, AForeignThreadHearsInItsOwnLoop)
+{
+    std::vector<std::string> heard;
+    std::thread(
+        [&]
+        {
+            EXPECT_EQ(CFRunLoopRunInMode(kCFRunLoopDefaultMode, 10.0, 0), kCFRunLoopRunFinished);
+            Ear ear;
+            ear.Listen(Change(1));
+            Set(1, 6.0F);
+            EXPECT_EQ(CFRunLoopRunInMode(kCFRunLoopDefaultMode, 10.0, 1), kCFRunLoopRunHandledSource);
+            EXPECT_EQ(CFRunLoopRunInMode(kCFRunLoopDefaultMode, 0.0, 0), kCFRunLoopRunTimedOut);
+            heard = ear.mHeard;
+        })
+        .join();
+    EXPECT_THAT(heard, testing::ElementsAre("1=6"));
+}
+
 // Rows come and go on one thread while others tell of changes: nobody may see a row that has gone.
 class ListenerTableTest : public testing::Test
 {
