@@ -17,9 +17,10 @@ struct Handed
     CFIndex references; // at first, those kept here included
 };
 
+// Never destroyed: what is in it is not lost, for whoever looks for leaks at the end.
 std::vector<Handed>& All()
 {
-    static std::vector<Handed> sAll;
+    static std::vector<Handed>& sAll = *new std::vector<Handed>;
     return sAll;
 }
 
