@@ -2,6 +2,7 @@
 import dataclasses
 
 from figures import NoFigure
+from measurements import in_order
 
 MOST_CONTROL = 0.05  # the control may be off by this much
 
@@ -61,7 +62,7 @@ def judge(rules, measurements, complete=False, quick=False):
     word."""
     judgements = []
     for rule in rules:
-        rows = [row for row in rule.figure.rows(measurements) if rule.applies(row)]
+        rows = in_order(row for row in rule.figure.rows(measurements) if rule.applies(row))
         judgements += [judge_row(rule, measurements, row) for row in rows]
         if complete and not rows:
             judgements.append(Judgement(rule.rows, rule.text, rule.bound, 'not measured'))

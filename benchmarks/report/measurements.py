@@ -14,6 +14,12 @@ STANDARD = {'family_index', 'per_family_instance_index', 'repetitions', 'repetit
             'real_time', 'cpu_time'}
 
 
+def in_order(rows):
+    """Rows by name, numbers by size: Google Benchmark has interleaved them at random."""
+    return sorted(rows, key=lambda row: [(part.isdigit(), int(part) if part.isdigit() else part)
+                                         for part in re.split(r'(\d+)', row)])
+
+
 class Sample:
     """The times of one way of one row, in nanoseconds, and the counters that its program reported."""
 

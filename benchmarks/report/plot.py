@@ -40,7 +40,7 @@ def bar(judgement, y, place):
     colour = COLOURS.get(judgement.verdict.split(' ')[0], UNDECIDED)
     yield f'<rect x="{start:.1f}" y="{y + 4}" width="{max(end - start, 2):.1f}" height="{ROW - 7}" fill="{colour}"/>'
     figure = '' if judgement.figure is None else f'{number(judgement.figure)} of {number(judgement.bound)}: '
-    yield text(max(end, start) + 6, y + 14, f'{figure}{judgement.verdict}', fill='#2d3748')
+    yield text(LEFT + WIDTH + 12, y + 14, f'{figure}{judgement.verdict}', fill='#2d3748')
 
 
 def svg(judgements, title):

@@ -1,5 +1,6 @@
 """The tables on standard output."""
 from judge import control
+from measurements import in_order
 
 
 def number(value):
@@ -31,7 +32,8 @@ def times(measurements):
     ways = sorted({way for row in measurements.rows.values() for way in row if way != 'again'},
                   key=lambda way: (('direct', 'ours', 'peer') + (way,)).index(way))
     lines = []
-    for row, samples in measurements.rows.items():
+    for row in in_order(measurements.rows):
+        samples = measurements.rows[row]
         cells = [duration(samples[way].median()) if way in samples else '-' for way in ways]
         lines.append([row, *cells, percent(control(measurements, row)),
                       percent(max(sample.spread() for sample in samples.values()))])
