@@ -31,7 +31,7 @@ RULES = [
     Rule(r'P5/first/worker', Ratio('ours', over=('peer',)), 1.6, 'time, over the peer\'s in process'),
     Rule(r'P5/again/.*', Counter('opened', 'ours'), 0, 'plug-in binaries opened'),
 
-    Rule(r'P6/.*', Ratio('ours', over=('spsc', 'moodycamel', 'folly', 'deque', 'other')), 1.1,
+    Rule(r'P6/.*', Ratio('ours', over=('spsc', 'other')), 1.1,
          'time, over the best other ring\'s'),
 
     Rule(r'P7/(save|load)/bytes:10000', Ratio('ours', over=('peer',)), 0.2, 'time, over the peer\'s'),
