@@ -6,6 +6,8 @@
 
 #include <algorithm>
 #include <bit>
+#include <cstring>
+#include <map>
 #include <string_view>
 #include <utility>
 #include <vector>
@@ -81,13 +83,25 @@ AudioFilterBusDescription CreateFromCount(int channelCount, const BusNames& name
     return CreateNamed(ArrangementTypeOfCount(channelCount), channelCount, names);
 }
 
-// Plug-ins may keep the addresses of the arrangements that they were asked with, so these stay for good, and stay
-// reachable. Returns the arrangement for the plug-in.
-VstSpeakerArrangement* KeepForever(SpeakerArrangementPtr arrangement)
+enum class Side
 {
-    static auto& kept = *new std::vector<SpeakerArrangementPtr>();
-    kept.push_back(std::move(arrangement));
-    return kept.back().get();
+    Input,
+    Output
+};
+
+// Plug-ins may keep the addresses of the arrangements that they were asked with, so these stay for good, and stay
+// reachable. One for each side and number of channels serves all, since nothing else of a layout counts: a filter
+// that is configured again and again leaves no more behind. What a plug-in may have written into it is made good.
+VstSpeakerArrangement* LastingArrangement(Side side, const ChannelLayout& layout)
+{
+    static auto& kept = *new std::map<std::pair<Side, std::size_t>, SpeakerArrangementPtr>();
+    SpeakerArrangementPtr fresh = BuildSpeakerArrangement(layout);
+    SpeakerArrangementPtr& lasting = kept[{side, layout.size()}];
+    if (lasting)
+        std::memcpy(lasting.get(), fresh.get(), SpeakerArrangementSize(layout.size()));
+    else
+        lasting = std::move(fresh);
+    return lasting.get();
 }
 
 // Pointers travel as numbers.
@@ -118,8 +132,8 @@ struct Agreement
 
 bool OfferArrangements(const VSTDispatcherBase& plugin, const ChannelLayout& input, const ChannelLayout& output)
 {
-    const long long inputAddress = AddressOf(KeepForever(BuildSpeakerArrangement(input)));
-    VstSpeakerArrangement* const outputArrangement = KeepForever(BuildSpeakerArrangement(output));
+    const long long inputAddress = AddressOf(LastingArrangement(Side::Input, input));
+    VstSpeakerArrangement* const outputArrangement = LastingArrangement(Side::Output, output);
     const bool taken = plugin.Dispatcher(effSetSpeakerArrangement, 0, inputAddress, outputArrangement, 0.0F) != 0;
     ZEB_TRACE(kTraceCategory,
               (taken ? "effSetSpeakerArrangement succeeded, inputs= " : "effSetSpeakerArrangement failed, inputs= ")
