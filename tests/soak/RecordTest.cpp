@@ -41,7 +41,7 @@ TEST(RecordTest, TellsSteadyGrowthFromNoise)
     EXPECT_THAT(OutcomesOf([](int, Resources&) {}), ElementsAre(kHolds, kHolds, kHolds, kHolds));
     // A single peak at the end is no growth, nor is a fifth more for a moment ahead of the last quarter.
     EXPECT_THAT(OutcomesOf([](int second, Resources& resources)
-                           { resources.resident += second % 15 == 14 || second == 80 ? 20000000 : 0; }),
+                           { resources.resident += second % 15 == 14 || second == 80 ? 20000000U : 0U; }),
                 ElementsAre(kHolds, kHolds, kHolds, kHolds));
     // From the middle of the first quarter to that of the last are 90 s: 6 % are too much, 4 % are not.
     EXPECT_THAT(OutcomesOf([](int second, Resources& resources)
