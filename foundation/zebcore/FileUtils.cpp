@@ -1,12 +1,9 @@
 #include "foundation/zebcore/FileUtils.h"
 
-#include "foundation/zebcore/FileExceptions.h"
-#include "foundation/zebcore/IPlatformByteStream.h"
 #include "foundation/zebcore/internal/FileDescriptor.h"
+#include "foundation/zebcore/internal/TextFile.h"
 
 #include <fcntl.h>
-
-#include <cerrno>
 
 namespace zebcore::utility::FileUtils
 {
@@ -14,7 +11,6 @@ namespace zebcore::utility::FileUtils
 namespace
 {
 
-constexpr std::size_t kMaxSize = std::size_t{1} << 31U;
 constexpr std::size_t kBlockSize = std::size_t{1} << 16U;
 constexpr mode_t kReadableAndWritable = 0666; // less what the user masks
 
@@ -29,22 +25,17 @@ void SimpleWriteStringToFile(const UTF16String& path, const UTF8String& text)
 
 UTF8String SimpleReadStringFromFile(const UTF16String& path)
 {
-    using Stream = filesupport::IPlatformByteStream;
-    Stream stream{filesupport::File(path), Flags<unsigned int>(Stream::kOpenForReading)};
-    const unsigned long long length = stream.Length();
+    filesupport::TextFile file(path);
     UTF8String text;
     std::size_t block = 0;
     std::size_t read = 0;
     do
     {
         const std::size_t done = text.size();
-        if (done > kMaxSize || length > kMaxSize)
-            throw filesupport::file_exception("cannot read", path, EFBIG);
         // One byte more than the length finds the end at once. A length that lies only costs more steps.
-        block = length > done ? static_cast<std::size_t>(length) - done + 1 : kBlockSize;
+        block = file.Length() > done ? static_cast<std::size_t>(file.Length()) - done + 1 : kBlockSize;
         text.resize(done + block);
-        read =
-            stream.ReadBlock(reinterpret_cast<unsigned char*>(text.data() + done), static_cast<unsigned int>(block));
+        read = file.ReadBlock(reinterpret_cast<unsigned char*>(text.data() + done), static_cast<unsigned int>(block));
         text.resize(done + read);
     } while (read == block);
     return text;

@@ -17,6 +17,9 @@ namespace
 constexpr XML_Char kNameSeparator = '\n';
 // Expat copies each block that it is given. Small ones would make it read a long attribute again and again.
 constexpr std::size_t kBlockSize = std::size_t{1} << 20U;
+// Blocks that are read into Expat's own buffer. They grow while one attribute or tag takes all of them.
+constexpr int kFirstReadSize = 1 << 16;
+constexpr int kLargestReadSize = 1 << 28;
 
 std::u8string_view View(const XML_Char* text)
 {
@@ -69,12 +72,37 @@ public:
             status = XML_Parse(mParser.get(), reinterpret_cast<const char*>(block.data()),
                                static_cast<int>(block.size()), last ? XML_TRUE : XML_FALSE);
         }
+        return Conclude(status);
+    }
+
+    XmlResult Parse(const XmlSource& source)
+    {
+        XML_Status status = XML_STATUS_OK;
+        int size = kFirstReadSize;
+        for (bool last = false; !last && status == XML_STATUS_OK;)
+        {
+            void* const buffer = XML_GetBuffer(mParser.get(), size);
+            if (buffer == nullptr)
+                return Fault();
+            const XML_Index before = XML_GetCurrentByteIndex(mParser.get());
+            const auto read =
+                static_cast<int>(source(static_cast<unsigned char*>(buffer), static_cast<unsigned int>(size)));
+            last = read < size;
+            status = XML_ParseBuffer(mParser.get(), read, last ? XML_TRUE : XML_FALSE);
+            if (XML_GetCurrentByteIndex(mParser.get()) == before)
+                size = std::min(2 * size, kLargestReadSize);
+        }
+        return Conclude(status);
+    }
+
+private:
+    XmlResult Conclude(XML_Status status) const
+    {
         if (mThrown)
             std::rethrow_exception(mThrown);
         return status == XML_STATUS_OK ? XmlResult() : Fault();
     }
 
-private:
     XmlResult Fault() const
     {
         const XML_Error code = XML_GetErrorCode(mParser.get());
@@ -204,6 +232,11 @@ private:
 XmlResult ParseXml(std::u8string_view text, XmlEvents& events)
 {
     return Run(events).Parse(text);
+}
+
+XmlResult ParseXml(const XmlSource& source, XmlEvents& events)
+{
+    return Run(events).Parse(source);
 }
 
 } // namespace zebcore::xml

@@ -8,6 +8,9 @@
 #include "foundation/zebcore/internal/PropListCopier.h"
 #include "foundation/zebcore/internal/PropListReader.h"
 #include "foundation/zebcore/internal/PropListWriter.h"
+#include "foundation/zebcore/internal/TextFile.h"
+
+#include <typeinfo>
 
 namespace zebcore::proplist::utils
 {
@@ -15,15 +18,42 @@ namespace zebcore::proplist::utils
 namespace
 {
 
-// Replaces the content of `list`. Returns what is wrong with the text, and then leaves the list empty.
-xml::XmlResult Read(const UTF8String& text, PropList& list)
+// Replaces the content of `list`. `document` is a text or a source of one. Returns what is wrong with it, and then
+// leaves the list empty.
+template <typename Document>
+xml::XmlResult Read(const Document& document, PropList& list)
 {
     list.Clear();
     PropListReader reader(list);
-    xml::XmlResult result = xml::ParseXml(text, reader);
+    xml::XmlResult result = xml::ParseXml(document, reader);
     if (result.mCode != 0)
         list.Clear();
     return result;
+}
+
+xml::XmlResult ReadFile(const UTF16String& path, PropList& list)
+{
+    filesupport::TextFile file(path);
+    const xml::XmlSource source = [&file](unsigned char* buffer, unsigned int size)
+    {
+        return file.ReadBlock(buffer, size);
+    };
+    return Read(source, list);
+}
+
+void CopyTo(PropList& list, const PropList& added)
+{
+    PropListCopier copier(list);
+    added.Visit(copier);
+}
+
+// A wrapper has its own idea of setting a value.
+void Replace(PropList& list, PropList& content)
+{
+    if (typeid(list) == typeid(PropList))
+        return list.Swap(content);
+    list.Clear();
+    CopyTo(list, content);
 }
 
 bool IsBelow(const UTF16String& path, const UTF16String& folder)
@@ -42,13 +72,14 @@ void MakePreferenceFolder(const filesupport::File& file)
 
 bool LoadPropList(const UTF16String& path, PropList& list, bool merge)
 {
-    const UTF8String text = zebcore::utility::FileUtils::SimpleReadStringFromFile(path);
-    PropList added;
-    const xml::XmlResult result = Read(text, merge ? added : list);
+    PropList content; // not the caller's list: a file that can't be read to its end must not leave half of it there
+    const xml::XmlResult result = ReadFile(path, content);
     if (result.mCode != 0)
         ZEB_TRACE("PropList", path << ": " << result.mFault);
-    PropListCopier copier(list);
-    added.Visit(copier);
+    if (merge)
+        CopyTo(list, content);
+    else
+        Replace(list, content);
     return result.mCode == 0;
 }
 

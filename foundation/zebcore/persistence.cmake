@@ -31,6 +31,7 @@ set(ZEB_PERSISTENCE_SOURCES
     zebcore/PropListWriter.cpp
     zebcore/SafeSave.cpp
     zebcore/TempFiles.cpp
+    zebcore/TextFile.cpp
     zebcore/XmlParser.cpp
     zebcore/XmlText.cpp
     zebcore/XmlUtils.cpp

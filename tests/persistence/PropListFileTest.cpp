@@ -65,6 +65,7 @@ TEST_F(PropListFile, MissingAndUnreadableFilesThrow)
         {filesupport::File(mFolder.Dir().FullPath()), EISDIR},
         {filesupport::File(u""), ENOENT},
         {filesupport::File(UTF16String(u"/etc/passwd\0.xml", 16)), EINVAL},
+        {filesupport::File(u"/proc/self/mem"), EIO}, // opens, and fails at the first byte
     };
     for (const auto& [file, error] : samples)
         try
@@ -90,6 +91,61 @@ TEST_F(PropListFile, MalformedFileReadsAsEmpty)
     PropList list = OneEntry(u8"stale", 1);
     EXPECT_FALSE(LoadPropList(mFolder.File("settings.xml").FullPath(), list, false));
     EXPECT_TRUE(list.IsEmpty());
+}
+
+// Wherever a block ends: within a character, an entity, an escape, a name.
+TEST_F(PropListFile, FileOfManyBlocksReadsAsItsText)
+{
+    constexpr std::size_t kBlock = 1U << 16U;
+    for (std::size_t shift = 0; shift < 40; ++shift)
+    {
+        PropList list;
+        list.SetValue(u8"first", UTF16String(kBlock - 100 - shift, u'a'));
+        list.SetValue(u8"second", UTF16String(u"\u00e9&\u0001\U0001f600\u20ac<end"));
+        list.SetValue(u8"third", UTF8String(3 * kBlock, u8'b'));
+        UTF8String text;
+        WritePropList(text, list);
+        mFolder.Write("settings.xml", utility::NarrowFromUTF8(text));
+        PropList read;
+        ASSERT_TRUE(LoadPropList(mFolder.File("settings.xml").FullPath(), read, false));
+        UTF8String again;
+        WritePropList(again, read);
+        ASSERT_TRUE(again == text) << shift;
+    }
+}
+
+TEST_F(PropListFile, TagsLongerThanABlockAreRead)
+{
+    const std::string key(300000, 'k');
+    mFolder.Write("settings.xml", "<proplist format='1'><!--" + key + "--><int key='" + key + "'>1</int></proplist>");
+    PropList list;
+    EXPECT_TRUE(LoadPropList(mFolder.File("settings.xml").FullPath(), list, false));
+    EXPECT_EQ(ValueOf(list, UTF8String(key.begin(), key.end())), 1);
+}
+
+TEST_F(PropListFile, FaultInALaterBlockLeavesNothing)
+{
+    const std::string lines(200000, '\n');
+    mFolder.Write("settings.xml", "<proplist format='1'><int key='a'>1</int>" + lines + "</wrong>");
+    PropList list = OneEntry(u8"stale", 1);
+    EXPECT_FALSE(LoadPropList(mFolder.File("settings.xml").FullPath(), list, false));
+    EXPECT_TRUE(list.IsEmpty());
+}
+
+TEST_F(PropListFile, WrapperIsFilledThroughItsAccessors)
+{
+    class Wrapper final : public PropList
+    {
+    public:
+        using PropList::SetValue;
+        void SetValue(const UTF8String& key, const int& value) override { PropList::SetValue(key, value + 100); }
+    };
+    Wrapper list;
+    list.SetValue(u8"stale", 1);
+    mFolder.Write("settings.xml", "<proplist format='1'><int key='a'>1</int></proplist>");
+    EXPECT_TRUE(LoadPropList(mFolder.File("settings.xml").FullPath(), list, false));
+    EXPECT_EQ(ValueOf(list, u8"a"), 101);
+    EXPECT_EQ(ValueOf(list, u8"stale"), -1);
 }
 
 TEST_F(PropListFile, MergingAddsToWhatIsThere)
