@@ -1,10 +1,7 @@
 #include "foundation/zebcore/Guid.h"
 
-#include "foundation/zebcore/StringStreams.h"
-
 #include <algorithm>
 #include <cstddef>
-#include <iomanip>
 #include <optional>
 #include <random>
 #include <string_view>
@@ -43,6 +40,13 @@ std::uint32_t HexValue(std::u16string_view digits)
     return value;
 }
 
+void AppendHex(UTF16String& text, std::uint32_t value, unsigned int digits)
+{
+    constexpr std::u16string_view kDigits = u"0123456789abcdef";
+    while (digits-- > 0)
+        text += kDigits[(value >> (4 * digits)) & 15U];
+}
+
 } // namespace
 
 Guid Guid::CreateUnique()
@@ -76,16 +80,19 @@ Guid Guid::StringToGUID(const UTF16String& text)
 
 UTF16String Guid::AsString() const
 {
-    oUTF16StringStream text;
-    text << std::hex << std::setfill('0');
-    text << std::setw(8) << mData1 << '-' << std::setw(4) << mData2 << '-' << std::setw(4) << mData3 << '-';
+    UTF16String text;
+    text.reserve(kForm.size());
+    AppendHex(text, mData1, 8);
+    AppendHex(text += u'-', mData2, 4);
+    AppendHex(text += u'-', mData3, 4);
+    text += u'-';
     for (std::size_t i = 0; i < mBytes.size(); ++i)
     {
         if (i == 2)
-            text << '-';
-        text << std::setw(2) << static_cast<unsigned int>(mBytes[i]);
+            text += u'-';
+        AppendHex(text, mBytes[i], 2);
     }
-    return text.str();
+    return text;
 }
 
 } // namespace zebcore::utility

@@ -3,7 +3,10 @@
 #include "foundation/zebcore/CompareFileNames.h"
 #include "foundation/zebcore/StringStreams.h"
 
+#include <array>
+#include <charconv>
 #include <limits>
+#include <string_view>
 #include <utility>
 
 namespace zebaudiofilterhost
@@ -14,8 +17,18 @@ namespace
 
 constexpr char16_t kSeparator = u':';
 
+// Every technology there is has a number of one digit. A stream costs more than all the rest of a locator.
+bool IsOneDigit(std::u16string_view text)
+{
+    return text.size() == 1 && text.front() >= u'0' && text.front() <= u'9';
+}
+
 TechnologyType ParseTechnologyType(const UTF16String& text)
 {
+    if (IsOneDigit(text))
+    {
+        return static_cast<TechnologyType>(text.front() - u'0');
+    }
     zebcore::utility::iUTF16StringStream stream(text);
     long value = 0;
     if (!(stream >> value))
@@ -88,9 +101,13 @@ UTF16String PluginLocator::GetPath() const
 
 UTF16String PluginLocator::ToString() const
 {
-    zebcore::utility::oUTF16StringStream stream;
-    stream << static_cast<std::int32_t>(mType);
-    return stream.str() + kSeparator + mPath;
+    std::array<char, std::numeric_limits<std::int32_t>::digits10 + 2> number{};
+    const char* const end =
+        std::to_chars(number.data(), number.data() + number.size(), static_cast<std::int32_t>(mType)).ptr;
+    UTF16String text;
+    text.reserve(number.size() + 1 + mPath.size());
+    text.append(std::as_const(number).data(), end).append(1, kSeparator).append(mPath);
+    return text;
 }
 
 void PluginLocator::FromString(const UTF16String& text)
