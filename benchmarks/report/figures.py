@@ -24,6 +24,14 @@ def added(measurements, row, way, base):
     return median(measurements, row, way) - median(measurements, row, base)
 
 
+def refuse_noise(measurements, rows, base, smallest):
+    """The control may be off by a part of the whole time, of which what is added may be a small part."""
+    for row in rows:
+        ways = measurements.rows.get(row, {})
+        if 'again' in ways and abs(added(measurements, row, 'again', base)) > smallest / 2:
+            raise NoFigure('no verdict: control off by more than half of what is added')
+
+
 class Timed:
     """A formula on times: it applies to rows that were timed."""
 
@@ -42,13 +50,12 @@ class Counted:
 
 @dataclasses.dataclass
 class Ratio(Timed):
-    """A way's time over that of another; over several others, of the fastest of them."""
+    """A way's time over that of another; over several others, which must all be there, of the fastest of them."""
     way: str
     over: tuple
 
     def of(self, measurements, row):
-        present = [way for way in self.over if way in measurements.rows[row]] or self.over[:1]
-        best = min(median(measurements, row, way) for way in present)
+        best = min(median(measurements, row, way) for way in self.over)
         return Figure(median(measurements, row, self.way) / best, [row])
 
 
@@ -63,6 +70,7 @@ class AddedRatio(Timed):
         theirs = added(measurements, row, self.over, self.base)
         if theirs <= 0:
             raise NoFigure(f'no verdict: {self.over} adds nothing')
+        refuse_noise(measurements, [row], self.base, theirs)
         return Figure(max(added(measurements, row, self.way, self.base), 0) / theirs, [row])
 
 
@@ -79,7 +87,8 @@ class AddedGrowth(Timed):
         small = added(measurements, other, self.way, self.base)
         if small <= 0:
             raise NoFigure('no verdict: nothing added')
-        return Figure(added(measurements, row, self.way, self.base) / small, [row, other])
+        refuse_noise(measurements, [row, other], self.base, small)
+        return Figure(max(added(measurements, row, self.way, self.base), 0) / small, [row, other])
 
 
 @dataclasses.dataclass

@@ -39,6 +39,8 @@ def count(program, environment, row, way, profile):
                     f'--callgrind-out-file={profile}', program, row, way, str(BLOCKS)],
                    env=environment, capture_output=True, text=True, check=True)
     total = re.search(r'^(?:summary|totals): (\d+)', profile.read_text(), re.MULTILINE)
+    if total is None or int(total[1]) == 0:
+        raise SystemExit(f'{row} {way}: nothing was counted')
     return int(total[1]) / BLOCKS
 
 

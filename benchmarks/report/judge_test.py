@@ -11,6 +11,9 @@ from measurements import Measurements
 from rules import RULES, Rule
 
 
+NOISE = 'no verdict: control off by more than half of what is added'
+
+
 def measured(times, instructions=()):
     """Measurements of {"row/way:x": time or (time, counters)}."""
     measurements = Measurements()
@@ -39,15 +42,29 @@ class JudgeTest(unittest.TestCase):
             ('nothing added', added, 0.5, {**steady, 'r/way:ours': 99, 'r/way:peer': 120}, 'r', 0, 'meets'),
             ('nothing to compare', added, 0.5, {**steady, 'r/way:ours': 99, 'r/way:peer': 99}, 'r', None,
              'no verdict: peer adds nothing'),
+            ('out of noise', added, 0.5,
+             {'r/way:direct': 200, 'r/way:again': 209, 'r/way:ours': 199, 'r/way:peer': 203}, 'r', None, NOISE),
+            ('noise of half', added, 0.5, {**steady, 'r/way:ours': 104, 'r/way:peer': 108}, 'r', 0.5, 'meets'),
+            ('noise of more', added, 0.5, {**steady, 'r/way:ours': 103, 'r/way:peer': 107}, 'r', None, NOISE),
+            ('noise downwards', added, 0.5, {**steady, 'r/way:again': 96, 'r/way:ours': 103, 'r/way:peer': 107}, 'r',
+             None, NOISE),
+            ('no control', added, 0.5, {'r/way:direct': 100, 'r/way:ours': 103, 'r/way:peer': 107}, 'r', 3 / 7,
+             'no verdict: no control'),
             ('no peer', added, 0.5, {**steady, 'r/way:ours': 110}, 'r', None, 'peer missing'),
-            ('fastest of the others', Ratio('ours', over=('a', 'b', 'c')), 1.1,
+            ('fastest of the others', Ratio('ours', over=('a', 'b')), 1.1,
              {**steady, 'r/way:ours': 120, 'r/way:a': 200, 'r/way:b': 100}, 'r', 1.2, 'misses'),
-            ('others missing', Ratio('ours', over=('a', 'b')), 1.1, {**steady, 'r/way:ours': 120}, 'r', None,
-             'no verdict: a missing'),
+            ('one of the others missing', Ratio('ours', over=('a', 'b')), 1.1,
+             {**steady, 'r/way:ours': 120, 'r/way:a': 200}, 'r', None, 'no verdict: b missing'),
             ('growth', AddedGrowth('ours', 'n:40', 'n:4'), 1.1, {**small, **large, 'n:40/way:ours': 211}, 'n:40', 1.1,
              'meets'),
             ('too much growth', AddedGrowth('ours', 'n:40', 'n:4'), 1.1, {**small, **large, 'n:40/way:ours': 212},
              'n:40', 1.2, 'misses'),
+            ('growth out of noise', AddedGrowth('ours', 'n:40', 'n:4'), 1.1,
+             {**small, **large, 'n:40/way:again': 206, 'n:40/way:ours': 200}, 'n:40', None, NOISE),
+            ('growth over noise', AddedGrowth('ours', 'n:40', 'n:4'), 1.1,
+             {**small, **large, 'n:4/way:again': 94, 'n:40/way:ours': 200}, 'n:40', None, NOISE),
+            ('shrinking', AddedGrowth('ours', 'n:40', 'n:4'), 1.1, {**small, **large, 'n:40/way:ours': 190}, 'n:40', 0,
+             'meets'),
             ('growth of nothing', AddedGrowth('ours', 'n:40', 'n:4'), 1.1, {**large, 'n:40/way:ours': 211}, 'n:40',
              None, 'no verdict: ours missing'),
             ('per entry', PerEntryGrowth('ours', 'n', 40, 4), 1.3,
@@ -108,6 +125,13 @@ class JudgeTest(unittest.TestCase):
         ways = {'r/way:ours': 1, 'r/way:again': 1, 'r/way:peer': 1}
         self.assertEqual(verdict(Ratio('ours', over=('peer',)), 1, measured(ways), quick=True)[1], 'meets (quick)')
 
+    def test_ways_through_latency_and_look_ups_have_their_rules(self):
+        cases = ['P9/bypass/channels:6/latency:0', 'P9/bypass/channels:6/latency:1000', 'P4/find-id/plugins:10000',
+                 'P4/find-locator-anywhere/plugins:10000', 'P4/add-known/plugins:10000']
+        texts = [[rule.text for rule in RULES if rule.applies(row)] for row in cases]
+        self.assertEqual([len(found) for found in texts], [1] * len(cases))
+        self.assertEqual(len({found[0] for found in texts}), len(cases))
+
     def test_every_group_has_a_rule(self):
         self.assertEqual({rule.rows.split('/')[0] for rule in RULES}, {f'P{i}' for i in range(1, 10)})
 
@@ -129,6 +153,12 @@ class MeasurementsTest(unittest.TestCase):
         self.assertEqual(measurements.rows['P4/load/plugins:8']['ours'].median(), 4e6)
         self.assertEqual(len(measurements.problems), 2)
         self.assertIn('lost', measurements.problems[0])
+
+    def test_rounds_that_are_missing_are_told(self):
+        measurements = measured({'r/way:ours': 1, 'r/way:peer': 1})
+        measurements.add_run({'name': 'r/way:ours', 'cpu_time': 1, 'time_unit': 'ns'})
+        measurements.expect_rounds(2)
+        self.assertEqual(measurements.problems, ['r/way:peer: 1 rounds instead of 2'])
 
 
 class ReportTest(unittest.TestCase):

@@ -71,6 +71,12 @@ class Measurements:
                 if isinstance(run[counter], (int, float)) and not isinstance(run[counter], bool):
                     sample.counters.setdefault(counter, []).append(run[counter])
 
+    def expect_rounds(self, rounds):
+        for row, ways in self.rows.items():
+            for way, sample in ways.items():
+                if len(sample.times) != rounds:
+                    self.problems.append(f'{row}/way:{way}: {len(sample.times)} rounds instead of {rounds}')
+
     def add_instructions(self, text):
         for entry in json.loads(text)['rows']:
             self.instructions.setdefault(entry['row'], {})[entry['way']] = entry['instructions']
