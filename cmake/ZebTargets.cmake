@@ -19,7 +19,7 @@ target_compile_options(zeb_options INTERFACE
 # Sources of like flags are compiled as one text there, which takes a third of the time. What only neighbours cause is
 # no fault; the other presets compile each source alone, under all warnings.
 if(CMAKE_UNITY_BUILD)
-    set(CMAKE_UNITY_BUILD_BATCH_SIZE 12)
+    set(CMAKE_UNITY_BUILD_BATCH_SIZE 0) # All of a target: which sources are neighbours does not change with another file
     target_compile_options(zeb_options INTERFACE
         -Wno-shadow $<$<CXX_COMPILER_ID:GNU>:-Wno-subobject-linkage>)
 endif()
