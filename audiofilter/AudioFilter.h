@@ -92,7 +92,8 @@ public:
     virtual void SetCurrentOffset(long long frames);
 
     /// One block in the plug-in's own channels; a set bit says that the channel is silent, outFlags start clear. The
-    /// application calls ProcessWithMapping instead. Here: all of outFlags is set and no buffer is touched. [process]
+    /// application calls ProcessWithMapping instead. The arrays `in` and `out` may be the application's own, so the
+    /// pointers in them must not be changed. Here: all of outFlags is set and no buffer is touched. [process]
     virtual void Process(float** in, float** out, int frames, ChannelFlags inFlags, ChannelFlags& outFlags);
 
     /// One block in the application's channels: routes them through the channel maps if they are in use, runs queued

@@ -14,8 +14,9 @@ namespace zebaudiofilterhost::vst3
 {
 
 /// A mailbox of parameter changes between threads: for each known ID the newest kMaxPointsPerParameter changes. Any
-/// number of threads may write while one reads and another gives it new IDs. Nothing here locks, and nothing
-/// allocates but SetParameterIDs and CopyTo.
+/// number of threads may write while one reads and another gives it new IDs. One reads at a time, be it by
+/// GetNextChange or by TransferChangesTo: what one of them is just looking at, the other would take for read. Nothing
+/// here locks, and nothing allocates but SetParameterIDs and CopyTo.
 ///
 /// How it holds together:
 /// - The shape (which IDs there are) is a ParameterChangeTable, published as a whole and never changed after that. A
@@ -46,12 +47,13 @@ public:
     /// False when nothing is pending; cheap however many IDs there are. Can be true once without reason. [any]
     bool HasChanges() const;
 
-    /// Takes the oldest change of the ID out. False, with nothing written, when there is none. [any], one at a time
+    /// Takes the oldest change of the ID out. False, with nothing written, when there is none. [any], one reader
+    /// at a time
     bool GetNextChange(Steinberg::Vst::ParamID id, double& value, Steinberg::int32& sampleOffset);
 
     /// Moves what is pending, by ascending ID and oldest first. Changes of an ID behind one that another thread is
     /// just writing keep their order and come with a later call. True if something was moved. [process], or
-    /// [main, suspended]
+    /// [main, suspended]; one reader at a time
     bool TransferChangesTo(ParameterChanges& changes)
     {
         return mWritten.load(std::memory_order_relaxed) && MoveAll(changes);
