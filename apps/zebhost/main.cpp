@@ -13,7 +13,9 @@
 #include <algorithm>
 #include <array>
 #include <exception>
+#include <filesystem>
 #include <functional>
+#include <memory>
 #include <optional>
 #include <string_view>
 
@@ -45,6 +47,26 @@ bool ChangesSettings(const Arguments& arguments)
            (arguments.command == "scan" && !arguments.Has("dry-run"));
 }
 
+// A command that changes nothing still clears up behind a scan that was killed, unless it may not, or another program
+// is at work: what that scan has found out counts in any case.
+void LoadToRead(const SettingsFolder& folder, Catalogue& catalogue)
+{
+    const std::unique_ptr<SettingsLock> lock =
+        std::filesystem::exists(folder.Journal()) ? SettingsLock::IfFree(folder.Path()) : nullptr;
+    catalogue.Load();
+    try
+    {
+        if (lock)
+        {
+            catalogue.SaveNoted();
+        }
+    }
+    catch (const Failure&)
+    {
+        // Whoever changes the settings next is told.
+    }
+}
+
 ExitCode RunWithLibrary(const Arguments& arguments, Console& console)
 {
     const auto command = std::find_if(kCommands.begin(), kCommands.end(),
@@ -63,7 +85,15 @@ ExitCode RunWithLibrary(const Arguments& arguments, Console& console)
         lock.emplace(folder.Path());
     }
     Catalogue catalogue(folder, console);
-    catalogue.Load();
+    if (lock)
+    {
+        catalogue.Load();
+        catalogue.SaveNoted();
+    }
+    else
+    {
+        LoadToRead(folder, catalogue);
+    }
     UseStandardPlaces();
     CommandContext context{arguments, console, catalogue};
     const ExitCode code = command->second(context);

@@ -9,19 +9,9 @@ BinaryStamps::BinaryStamps(const std::filesystem::path& file) : mTable(file, "bi
 {
 }
 
-std::optional<BinaryStamps::Entry> BinaryStamps::Find(const PluginLocator& locator) const
+Json BinaryStamps::ToJson(const Entry& entry)
 {
-    const Json* const entry = mTable.Find(locator);
-    if (entry == nullptr)
-    {
-        return std::nullopt;
-    }
-    return Entry{StampIn(*entry), TextIn(*entry, "problem"), TextIn(*entry, "visit")};
-}
-
-void BinaryStamps::Set(const PluginLocator& locator, const Entry& entry)
-{
-    Json json{{"binary", ToJson(entry.binary)}};
+    Json json{{"binary", zebhost::ToJson(entry.binary)}};
     if (!entry.problem.empty())
     {
         json["problem"] = entry.problem;
@@ -30,7 +20,23 @@ void BinaryStamps::Set(const PluginLocator& locator, const Entry& entry)
     {
         json["visit"] = entry.visit;
     }
-    mTable.Set(locator, std::move(json));
+    return json;
+}
+
+BinaryStamps::Entry BinaryStamps::EntryIn(const Json& json)
+{
+    return {StampIn(json), TextIn(json, "problem"), TextIn(json, "visit")};
+}
+
+std::optional<BinaryStamps::Entry> BinaryStamps::Find(const PluginLocator& locator) const
+{
+    const Json* const entry = mTable.Find(locator);
+    return entry == nullptr ? std::nullopt : std::optional(EntryIn(*entry));
+}
+
+void BinaryStamps::Set(const PluginLocator& locator, const Entry& entry)
+{
+    mTable.Set(locator, ToJson(entry));
 }
 
 } // namespace zebhost

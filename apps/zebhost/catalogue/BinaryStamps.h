@@ -25,6 +25,8 @@ public:
         std::string problem; // why it could not be loaded; empty if it could
         std::string visit;   // of the scan that found this out: see BlockReason
     };
+    static Json ToJson(const Entry& entry);
+    static Entry EntryIn(const Json& json);
     std::optional<Entry> Find(const zebaudiofilterhost::PluginLocator& locator) const;
     void Set(const zebaudiofilterhost::PluginLocator& locator, const Entry& entry);
     void Remove(const zebaudiofilterhost::PluginLocator& locator) { mTable.Remove(locator); }

@@ -36,11 +36,7 @@ std::string TimeOfNow()
     return text.data();
 }
 
-BlockReasons::BlockReasons(const std::filesystem::path& file) : mTable(file, "blocked")
-{
-}
-
-void BlockReasons::Set(const PluginLocator& locator, const BlockReason& reason)
+Json ToJson(const BlockReason& reason)
 {
     Json entry{{kReason, reason.reason}, {kSince, reason.since}};
     if (!reason.binary.IsEmpty())
@@ -57,18 +53,28 @@ void BlockReasons::Set(const PluginLocator& locator, const BlockReason& reason)
     {
         entry[kByHand] = true;
     }
-    mTable.Set(locator, std::move(entry));
+    return entry;
+}
+
+BlockReason BlockReasonIn(const Json& entry)
+{
+    return {TextIn(entry, kReason), TextIn(entry, kSince), StampIn(entry),        FlagIn(entry, kAtHand),
+            FlagIn(entry, kKnown),  TextIn(entry, kVisit), FlagIn(entry, kByHand)};
+}
+
+BlockReasons::BlockReasons(const std::filesystem::path& file) : mTable(file, "blocked")
+{
+}
+
+void BlockReasons::Set(const PluginLocator& locator, const BlockReason& reason)
+{
+    mTable.Set(locator, ToJson(reason));
 }
 
 BlockReason BlockReasons::Get(const PluginLocator& locator) const
 {
     const Json* const entry = mTable.Find(locator);
-    if (entry == nullptr)
-    {
-        return {};
-    }
-    return {TextIn(*entry, kReason), TextIn(*entry, kSince), StampIn(*entry),        FlagIn(*entry, kAtHand),
-            FlagIn(*entry, kKnown),  TextIn(*entry, kVisit), FlagIn(*entry, kByHand)};
+    return entry == nullptr ? BlockReason() : BlockReasonIn(*entry);
 }
 
 } // namespace zebhost

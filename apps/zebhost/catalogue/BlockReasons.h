@@ -26,6 +26,10 @@ struct BlockReason
 // The time of now, as it stands in `since`.
 std::string TimeOfNow();
 
+Json ToJson(const BlockReason& reason);
+// All that is missing stays empty.
+BlockReason BlockReasonIn(const Json& entry);
+
 // Why plug-ins are blocked, in a file of its own beside the block list. Losing it loses nothing but the reasons.
 class BlockReasons
 {

@@ -86,13 +86,27 @@ bool IsOnPermanentList(const PluginLocator& locator)
 } // namespace
 
 Catalogue::Catalogue(const SettingsFolder& folder, Console& console)
-    : mFolder(folder), mConsole(console), mReasons(folder.BlockReasons()), mStamps(folder.BinaryStamps())
+    : mFolder(folder)
+    , mConsole(console)
+    , mReasons(folder.BlockReasons())
+    , mStamps(folder.BinaryStamps())
+    , mJournal(folder.Journal())
 {
 }
 
+// The journal is read first: a scan that ends meanwhile saves its files before it removes that, and to hear of
+// something twice does no harm.
 void Catalogue::Load()
 {
+    const std::vector<std::string> lines = mJournal.Lines();
     LoadBlocks();
+    LoadFiles();
+    Replay(lines);
+    LiftFinishedBlocks();
+}
+
+void Catalogue::LoadFiles()
+{
     WithFiles(
         [this]
         {
@@ -105,7 +119,6 @@ void Catalogue::Load()
             }
             mStamps.Load();
         });
-    LiftFinishedBlocks();
 }
 
 // A scan that was killed, or met a full disk, after it had saved what it found of a plug-in, and before it took the
@@ -130,6 +143,105 @@ bool Catalogue::HasResult(const PluginLocator& locator, const BlockReason& why) 
     const std::optional<BinaryStamps::Entry> last = mStamps.Find(locator);
     return (last && !why.visit.empty() && last->visit == why.visit) ||
            (!why.wasKnown && PluginModuleInfoManager::GetInstance().FindPluginInfo(locator) != nullptr);
+}
+
+void Catalogue::Replay(const std::vector<std::string>& lines)
+{
+    PluginModuleInfoManager& infos = PluginModuleInfoManager::GetInstance();
+    for (const std::string& line : lines)
+    {
+        const std::optional<ScanFact> fact = ParseScanFact(line);
+        if (fact && !fact->found.empty())
+        {
+            infos.RemovePluginLocators({fact->plugin});
+            infos.AddConfiguration(fact->found, true);
+        }
+        if (fact)
+        {
+            Take(*fact);
+        }
+    }
+}
+
+void Catalogue::Take(const ScanFact& fact)
+{
+    BannedPluginManager& blocks = BannedPluginManager::GetInstance();
+    if (fact.block)
+    {
+        blocks.AddBannedPlugin(fact.plugin);
+        std::erase(mLifted, fact.plugin);
+        mReasons.Set(fact.plugin, *fact.block);
+        mUnsaved.blocks = true;
+    }
+    else if (blocks.IsPluginBanned(fact.plugin))
+    {
+        blocks.RemoveBannedPlugin(fact.plugin);
+        mLifted.push_back(fact.plugin);
+        mUnsaved.blocks = true;
+    }
+    if (fact.isForgotten)
+    {
+        PluginModuleInfoManager::GetInstance().RemovePluginLocators({fact.plugin});
+        mStamps.Remove(fact.plugin);
+    }
+    if (fact.result)
+    {
+        mStamps.Set(fact.plugin, *fact.result);
+    }
+    mUnsaved.stamps = mUnsaved.stamps || fact.isForgotten || fact.result;
+    mUnsaved.records = mUnsaved.records || fact.isForgotten || !fact.found.empty();
+}
+
+std::uintmax_t Catalogue::Announce(const ScanFact& fact)
+{
+    std::uintmax_t size = 0;
+    WithFiles(
+        [this, &fact, &size]
+        {
+            std::filesystem::create_directories(mFolder.Path());
+            size = mJournal.Size();
+            mJournal.Add(ToLine(fact));
+        });
+    return size;
+}
+
+void Catalogue::TakeBack(std::uintmax_t announcement)
+{
+    WithFiles([this, announcement] { mJournal.CutTo(announcement); });
+}
+
+void Catalogue::Note(const ScanFact& fact)
+{
+    WithFiles([this, &fact] { mJournal.Add(ToLine(fact)); });
+    Take(fact);
+}
+
+void Catalogue::SaveNoted()
+{
+    if (!mJournal.Exists())
+    {
+        return;
+    }
+    if (mUnsaved.records)
+    {
+        Save();
+    }
+    WithFiles(
+        [this]
+        {
+            if (mUnsaved.stamps)
+            {
+                mStamps.Save(LocatorTable::Saving::Flushed);
+            }
+            if (mUnsaved.blocks)
+            {
+                SaveBlockList();
+                mReasons.Save(LocatorTable::Saving::Flushed);
+            }
+            // Up to here it speaks for what is half saved.
+            mJournal.Remove();
+        });
+    mUnsaved = {};
 }
 
 void Catalogue::LoadBlocks()

@@ -2,13 +2,17 @@
 
 #include "catalogue/BinaryStamps.h"
 #include "catalogue/BlockReasons.h"
+#include "catalogue/ScanFact.h"
 #include "catalogue/SettingsFolder.h"
+#include "catalogue/SettingsJournal.h"
 #include "output/Console.h"
 
 #include <host/AudioFilterDescriptorManager.h>
 #include <host/PluginLocator.h>
 
+#include <cstdint>
 #include <set>
+#include <string>
 #include <vector>
 
 namespace zebhost
@@ -22,6 +26,7 @@ class Catalogue
 public:
     Catalogue(const SettingsFolder& folder, Console& console);
 
+    // With what a scan that was killed, or is at work, has found out since it last saved the files.
     void Load();
     void Save();
 
@@ -44,9 +49,28 @@ public:
     const BinaryStamps& Stamps() const { return mStamps; }
     void SaveStamps(LocatorTable::Saving saving);
 
+    // Of a scan. What it announces goes to the journal alone, and can be taken back for as long as nothing else was
+    // noted: its result then counts as well.
+    std::uintmax_t Announce(const ScanFact& fact);
+    void TakeBack(std::uintmax_t announcement);
+    // To the journal, and here too. Record and descriptors are in the library's catalogue already.
+    void Note(const ScanFact& fact);
+    // Saves what was noted in the files that it belongs to. Only for whoever has locked the settings.
+    void SaveNoted();
+
     const SettingsFolder& Folder() const { return mFolder; }
 
 private:
+    struct Unsaved
+    {
+        bool records = false;
+        bool blocks = false;
+        bool stamps = false;
+    };
+
+    void LoadFiles();
+    void Replay(const std::vector<std::string>& lines);
+    void Take(const ScanFact& fact);
     void LoadBlocks();
     void LiftFinishedBlocks();
     // Of the scan that blocked the plug-in while it was at hand.
@@ -61,6 +85,8 @@ private:
     BlockReasons mReasons;
     std::vector<zebaudiofilterhost::PluginLocator> mLifted; // whose reasons go when the list is saved without them
     BinaryStamps mStamps;
+    SettingsJournal mJournal;
+    Unsaved mUnsaved; // of what stands in the journal
     std::set<std::filesystem::path> mDamaged;
 };
 

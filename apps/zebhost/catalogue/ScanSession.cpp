@@ -3,7 +3,6 @@
 #include "catalogue/PluginFinder.h"
 #include "filter/CrashGuard.h"
 #include "scan/PluginScan.h"
-#include "scan/ScanJournal.h"
 
 namespace zebhost
 {
@@ -29,8 +28,12 @@ IScanObserver::Outcome ScanUnderGuard(const PluginLocator& locator, const ScanSe
 } // namespace
 
 ScanSession::ScanSession(Catalogue* catalogue, IScanObserver& observer, const Options& options)
-    : mCatalogue(catalogue), mObserver(observer), mOptions(options)
+    : mObserver(observer), mOptions(options)
 {
+    if (catalogue != nullptr)
+    {
+        mJournal.emplace(*catalogue);
+    }
 }
 
 void ScanSession::Run(const std::vector<PluginLocator>& locators)
@@ -38,6 +41,10 @@ void ScanSession::Run(const std::vector<PluginLocator>& locators)
     for (std::size_t index = 0; index < locators.size() && !mObserver.ShallStop(); ++index)
     {
         ScanOne(locators[index], index + 1, locators.size());
+    }
+    if (mJournal)
+    {
+        mJournal->Finish();
     }
 }
 
@@ -47,17 +54,16 @@ void ScanSession::ScanOne(const PluginLocator& locator, std::size_t current, std
     {
         mObserver.Stepping(locator, detail, current, total);
     };
-    if (mCatalogue == nullptr)
+    if (!mJournal)
     {
         constexpr const char* kAdvice = "do not use it, or keep it from being used with 'zebhost block'";
         mObserver.Finished(locator, ScanUnderGuard(locator, mOptions, kAdvice, beforeStep));
         return;
     }
-    ScanJournal journal(*mCatalogue);
-    journal.Announce(locator);
+    mJournal->Announce(locator);
     constexpr const char* kAdvice = "it is blocked now; run the scan again, which goes on with the others";
     const IScanObserver::Outcome outcome = ScanUnderGuard(locator, mOptions, kAdvice, beforeStep);
-    journal.Conclude(locator, outcome.problem);
+    mJournal->Conclude(locator, outcome.problem);
     mObserver.Finished(locator, outcome);
 }
 

@@ -2,7 +2,9 @@
 
 #include "catalogue/Catalogue.h"
 #include "catalogue/IScanObserver.h"
+#include "scan/ScanJournal.h"
 
+#include <optional>
 #include <vector>
 
 namespace zebhost
@@ -26,9 +28,9 @@ public:
 private:
     void ScanOne(const zebaudiofilterhost::PluginLocator& locator, std::size_t current, std::size_t total);
 
-    Catalogue* mCatalogue;
     IScanObserver& mObserver;
     Options mOptions;
+    std::optional<ScanJournal> mJournal;
 };
 
 } // namespace zebhost

@@ -33,6 +33,11 @@ std::filesystem::path SettingsFolder::BinaryStamps() const
     return Catalogue().replace_extension(".binaries.json");
 }
 
+std::filesystem::path SettingsFolder::Journal() const
+{
+    return Catalogue().replace_extension(".journal");
+}
+
 std::filesystem::path SettingsFolder::Blocks() const
 {
     return mPath / ToNativePath(BannedPluginManager::GetInstance().GetSettingsFileName());

@@ -18,6 +18,7 @@ public:
     const std::filesystem::path& Path() const { return mPath; }
     std::filesystem::path Catalogue() const;
     std::filesystem::path BinaryStamps() const;
+    std::filesystem::path Journal() const;
     std::filesystem::path Blocks() const;
     std::filesystem::path BlockReasons() const;
     std::filesystem::path PermanentBlocks() const;

@@ -36,19 +36,31 @@ bool Lock(int folder)
     return true;
 }
 
+int OpenFolder(const std::filesystem::path& folder)
+{
+    return open(folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
+}
+
 } // namespace
 
 SettingsLock::SettingsLock(const std::filesystem::path& folder) : mFolder(-1)
 {
     std::error_code failsAgainOnSaving;
     std::filesystem::create_directories(folder, failsAgainOnSaving);
-    mFolder = open(folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
+    mFolder = OpenFolder(folder);
     if (mFolder >= 0 && !Lock(mFolder))
     {
         close(mFolder);
         throw Failure(ExitCode::JobFailed, "another scan is at work in " + folder.string() +
                                                ": wait for its end, or name another folder with --settings");
     }
+}
+
+std::unique_ptr<SettingsLock> SettingsLock::IfFree(const std::filesystem::path& folder)
+{
+    std::unique_ptr<SettingsLock> lock(new SettingsLock(OpenFolder(folder)));
+    const bool isHeld = lock->mFolder >= 0 && flock(lock->mFolder, LOCK_EX | LOCK_NB) == 0;
+    return isHeld ? std::move(lock) : nullptr;
 }
 
 SettingsLock::~SettingsLock()

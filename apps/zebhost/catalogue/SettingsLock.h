@@ -1,6 +1,7 @@
 #pragma once
 
 #include <filesystem>
+#include <memory>
 
 namespace zebhost
 {
@@ -13,11 +14,15 @@ public:
     // Makes the folder. Throws a Failure if another program holds it for longer than a moment. On a file system
     // without locks there is none.
     explicit SettingsLock(const std::filesystem::path& folder);
+    // Neither waits nor throws; null if that cannot be had for certain.
+    static std::unique_ptr<SettingsLock> IfFree(const std::filesystem::path& folder);
     ~SettingsLock();
     SettingsLock(const SettingsLock&) = delete;
     SettingsLock& operator=(const SettingsLock&) = delete;
 
 private:
+    explicit SettingsLock(int folder) : mFolder(folder) {}
+
     int mFolder;
 };
 

@@ -2,22 +2,19 @@
 
 #include "catalogue/LoadProblem.h"
 #include "catalogue/PluginFinder.h"
+#include "catalogue/PluginKnowledge.h"
 #include "output/PrintableText.h"
 
 #include <foundation/zebcore/MainThreadLoop.h>
-#include <host/AudioFilterDescriptor.h>
-#include <host/AudioFilterDescriptorManager.h>
 #include <host/PluginModuleInfo.h>
 #include <host/PluginModuleInfoManager.h>
 #include <host/PluginModuleScanner.h>
 
 #include <exception>
-#include <vector>
 
 namespace zebhost
 {
 
-using zebaudiofilterhost::AudioFilterDescriptorManager;
 using zebaudiofilterhost::PluginLocator;
 using zebaudiofilterhost::PluginModuleInfoManager;
 using zebaudiofilterhost::PluginModuleScanner;
@@ -65,45 +62,17 @@ std::string StepGuarded(const PluginLocator& locator, bool skipCategory, const B
     }
 }
 
-// What the catalogue knows of a plug-in.
-struct Knowledge
-{
-    PluginModuleInfoManager::PluginInfoPtr record;
-    std::vector<AudioFilterDescriptorManager::DescriptorPtr> descriptors;
-
-    explicit Knowledge(const PluginLocator& locator)
-        : record(PluginModuleInfoManager::GetInstance().FindPluginInfo(locator))
-    {
-        for (const auto& descriptor : AudioFilterDescriptorManager::GetInstance().GetExternalInfos())
-        {
-            if (descriptor->GetLocator() == locator)
-            {
-                descriptors.push_back(descriptor);
-            }
-        }
-    }
-
-    void PutBack() const
-    {
-        PluginModuleInfoManager::GetInstance().AddPluginModuleInfo(record);
-        for (const auto& descriptor : descriptors)
-        {
-            AudioFilterDescriptorManager::GetInstance().AddAudioFilterDescriptor(descriptor);
-        }
-    }
-};
-
 } // namespace
 
 IScanObserver::Outcome ScanPlugin(const PluginLocator& locator, bool skipCategory, const BeforeStep& beforeStep)
 {
     PluginModuleInfoManager& infos = PluginModuleInfoManager::GetInstance();
     // A new descriptor does not displace an old one of the same ID.
-    const Knowledge before(locator);
+    const PluginKnowledge before(locator);
     infos.RemovePluginLocators({locator});
     const std::string thrown = StepGuarded(locator, skipCategory, beforeStep);
 
-    const Knowledge after(locator);
+    const PluginKnowledge after(locator);
     IScanObserver::Outcome outcome;
     outcome.loaded = after.record != nullptr;
     outcome.effects = after.descriptors.size();

@@ -1,18 +1,17 @@
 #include "scan/ScanJournal.h"
 
+#include "catalogue/PluginKnowledge.h"
 #include "cli/Failure.h"
 
-#include <host/BannedPluginManager.h>
 #include <host/PluginModuleInfoManager.h>
 
-#include <chrono>
+#include <optional>
 
 #include <unistd.h>
 
 namespace zebhost
 {
 
-using zebaudiofilterhost::BannedPluginManager;
 using zebaudiofilterhost::PluginLocator;
 using zebaudiofilterhost::PluginModuleInfoManager;
 
@@ -20,6 +19,9 @@ namespace
 {
 
 constexpr const char* kAtHand = "at hand in a scan that did not end";
+
+// What a power failure may cost, and a program that reads the files themselves may be behind.
+constexpr std::chrono::seconds kSaveEvery{2};
 
 bool IsKnown(const PluginLocator& locator)
 {
@@ -42,49 +44,52 @@ ScanJournal::ScanJournal(Catalogue& catalogue) : mCatalogue(catalogue)
 
 void ScanJournal::Announce(const PluginLocator& locator)
 {
-    mWasKnown = IsKnown(locator);
     mBinary = StampOf(locator);
-    mBlockedBefore.reset();
-    if (BannedPluginManager::GetInstance().IsPluginBanned(locator))
-    {
-        mBlockedBefore = mCatalogue.Reasons().Get(locator);
-    }
     mVisit = NewVisit();
-    try
-    {
-        mCatalogue.Block(locator, {kAtHand, TimeOfNow(), mBinary, true, mWasKnown, mVisit, false},
-                         LocatorTable::Saving::Quick);
-    }
-    catch (const Failure&)
-    {
-        // The new list may be in place, and only the folder not flushed.
-        ReleaseAfterFailure(locator);
-        throw;
-    }
+    ScanFact fact;
+    fact.plugin = locator;
+    fact.block = BlockReason{kAtHand, TimeOfNow(), mBinary, true, IsKnown(locator), mVisit, false};
+    mAnnouncement = mCatalogue.Announce(fact);
 }
 
 void ScanJournal::Conclude(const PluginLocator& locator, const std::string& problem)
 {
+    ScanFact fact;
+    fact.plugin = locator;
+    fact.result = ResultOf(locator, problem);
+    // What could not be loaded keeps the record of an earlier scan.
+    fact.found = problem.empty() ? PluginKnowledge(locator).Text() : zebcore::UTF8String();
+    Note(fact);
+}
+
+void ScanJournal::Condemn(const PluginLocator& locator, const std::string& reason)
+{
+    ScanFact fact;
+    fact.plugin = locator;
+    fact.block = BlockReason{reason, TimeOfNow(), mBinary, false, false, {}, false};
+    // What an earlier scan made of it is worth nothing any more.
+    fact.isForgotten = true;
+    Note(fact);
+}
+
+void ScanJournal::Note(const ScanFact& fact)
+{
     try
     {
-        Record(locator, problem);
+        mCatalogue.Note(fact);
     }
     catch (const Failure&)
     {
-        ReleaseAfterFailure(locator);
+        if (!fact.block)
+        {
+            ReleaseAfterFailure();
+        }
         throw;
     }
-    mCatalogue.Unblock(locator);
-}
-
-void ScanJournal::Record(const PluginLocator& locator, const std::string& problem)
-{
-    if (mWasKnown || IsKnown(locator))
+    if (std::chrono::steady_clock::now() - mLastSave > kSaveEvery)
     {
-        mCatalogue.Save();
+        Finish();
     }
-    mCatalogue.Stamps().Set(locator, ResultOf(locator, problem));
-    mCatalogue.SaveStamps(LocatorTable::Saving::Quick);
 }
 
 // A plug-in that is in the catalogue, and cannot be loaded, keeps its record and the stamp that belongs to it:
@@ -99,41 +104,27 @@ BinaryStamps::Entry ScanJournal::ResultOf(const PluginLocator& locator, const st
     return {last ? last->binary : BinaryStamp(), {}, mVisit};
 }
 
-void ScanJournal::Condemn(const PluginLocator& locator, const std::string& reason)
+void ScanJournal::Release()
 {
-    mCatalogue.Block(locator, {reason, TimeOfNow(), mBinary, false, false, {}, false});
-    // What an earlier scan made of it is worth nothing any more.
-    mCatalogue.Stamps().Remove(locator);
-    mCatalogue.SaveStamps(LocatorTable::Saving::Quick);
-    if (mWasKnown)
-    {
-        PluginModuleInfoManager::GetInstance().RemovePluginLocators({locator});
-        mCatalogue.Save();
-    }
+    mCatalogue.TakeBack(mAnnouncement);
 }
 
-void ScanJournal::Release(const PluginLocator& locator)
-{
-    if (mBlockedBefore)
-    {
-        mCatalogue.Block(locator, *mBlockedBefore);
-    }
-    else
-    {
-        mCatalogue.Unblock(locator);
-    }
-}
-
-void ScanJournal::ReleaseAfterFailure(const PluginLocator& locator)
+void ScanJournal::ReleaseAfterFailure()
 {
     try
     {
-        Release(locator);
+        Release();
     }
     catch (const Failure&)
     {
         // The first failure says why; the files that this one needs may lie on the same disk.
     }
+}
+
+void ScanJournal::Finish()
+{
+    mCatalogue.SaveNoted();
+    mLastSave = std::chrono::steady_clock::now();
 }
 
 } // namespace zebhost

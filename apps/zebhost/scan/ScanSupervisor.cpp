@@ -38,7 +38,7 @@ void ScanSupervisor::Run(const std::vector<PluginLocator>& locators)
         }
     }
     mWorker.reset();
-    mCatalogue.SaveStamps(LocatorTable::Saving::Flushed);
+    mJournal.Finish();
     if (!mUntouched.empty())
     {
         throw Failure(ExitCode::JobFailed, "the scan's worker processes ended before they turned to " +
@@ -60,11 +60,11 @@ bool ScanSupervisor::ScanOne(const PluginLocator& locator, const Progress& progr
         return true;
     case Verdict::Stopped:
         mWorker.reset();
-        mJournal.Release(locator);
+        mJournal.Release();
         return false;
     case Verdict::Untouched:
         mWorker.reset();
-        mJournal.Release(locator);
+        mJournal.Release();
         mUntouched.push_back(PathOf(locator));
         return true;
     case Verdict::Lost:
@@ -85,7 +85,7 @@ ScanSupervisor::Verdict ScanSupervisor::TryOrRelease(const PluginLocator& locato
     catch (...)
     {
         mWorker.reset();
-        mJournal.ReleaseAfterFailure(locator);
+        mJournal.ReleaseAfterFailure();
         throw;
     }
 }
@@ -208,7 +208,7 @@ void ScanSupervisor::Blame(const PluginLocator& locator, Verdict verdict)
     outcome.problem += printed.empty() ? "" : "; it printed: " + printed;
     if (outcome.end == IScanObserver::End::Interrupted)
     {
-        mJournal.Release(locator);
+        mJournal.Release();
     }
     else
     {

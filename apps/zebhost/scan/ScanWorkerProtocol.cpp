@@ -1,15 +1,12 @@
 #include "scan/ScanWorkerProtocol.h"
 
 #include "catalogue/LocatorTable.h"
-
-#include <foundation/zebcore/PropList.h>
-#include <foundation/zebcore/PropListUtils.h>
+#include "catalogue/LocatorText.h"
 
 namespace zebhost::protocol
 {
 
 using zebaudiofilterhost::PluginLocator;
-using zebcore::proplist::PropList;
 
 namespace
 {
@@ -22,7 +19,6 @@ constexpr const char* kLoaded = "loaded";
 constexpr const char* kEffects = "effects";
 constexpr const char* kProblem = "problem";
 constexpr const char* kFound = "found";
-const zebcore::UTF8String kLocator = u8"locator";
 
 IScanObserver::Outcome OutcomeIn(const Json& result)
 {
@@ -37,30 +33,15 @@ IScanObserver::Outcome OutcomeIn(const Json& result)
 
 } // namespace
 
-// A path need not be text that JSON can hold; a property list holds anything.
 std::string ScanLine(const PluginLocator& locator)
 {
-    PropList list;
-    list.SetValue(kLocator, locator.ToString());
-    zebcore::UTF8String text;
-    zebcore::proplist::utils::WritePropList(text, list);
-    return ToLine(Json{{kScan, std::string(text.begin(), text.end())}});
+    return ToLine(Json{{kScan, LocatorText(locator)}});
 }
 
 std::optional<PluginLocator> ParseScan(const std::string& line)
 {
     const Json message = Json::parse(line, nullptr, false);
-    const std::string text = message.is_object() ? TextIn(message, kScan) : std::string();
-    PropList list;
-    zebcore::UTF16String locatorText;
-    if (!zebcore::proplist::utils::ReadPropList({text.begin(), text.end()}, list) ||
-        !list.GetValue(kLocator, locatorText))
-    {
-        return std::nullopt;
-    }
-    PluginLocator locator;
-    locator.FromString(locatorText);
-    return locator;
+    return message.is_object() ? ParseLocatorText(TextIn(message, kScan)) : std::nullopt;
 }
 
 std::string ReadyLine()
