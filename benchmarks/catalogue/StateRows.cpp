@@ -1,9 +1,12 @@
-// P7: an effect's state to a preset and back, as an application keeps it in its document ("save" and "load"), and on
-// through a preset file ("save-file" and "load-file"). P8: the floating-point mode behind a block.
+// P7: an effect's state to a text in memory and back ("save" and "load"), as the peer writes and reads one; to a
+// property list and back ("save-tree" and "load-tree"), as an application keeps it in its document; through a preset
+// file
+// ("save-file" and "load-file"). P8: the floating-point mode behind a block.
 #include "audiofilter/PresetData.h"
 #include "benchmarks/catalogue/CatalogueContent.h"
 #include "benchmarks/catalogue/PeakMemory.h"
 #include "benchmarks/catalogue/StateFilter.h"
+#include "benchmarks/catalogue/plugin/StateContent.h"
 #include "foundation/zebcore/File.h"
 #include "foundation/zebcore/PropListUtils.h"
 #include "foundation/zebcore/StringConversion.h"
@@ -29,55 +32,81 @@ using benchmark::State;
 using zebcore::proplist::PropList;
 using Bytes = std::vector<unsigned char>;
 using FilterPointer = boost::intrusive_ptr<AudioFilter>;
-using Operation = void (*)(AudioFilter& filter, PropList& preset);
+
+// An effect's state outside of it: as a property list and as its text.
+struct Kept
+{
+    PropList tree;
+    UTF8String text;
+};
+
+using Operation = void (*)(AudioFilter& filter, Kept& kept);
 
 File PresetFile()
 {
     return File(zebcore::utility::UTF16FromNarrow((WorkFolder() / "preset.xml").string()));
 }
 
-void Save(AudioFilter& filter, PropList& preset)
+void SaveTree(AudioFilter& filter, Kept& kept)
 {
-    PresetData data(preset);
+    PresetData data(kept.tree);
     filter.SaveSettings(data);
 }
 
-void Load(AudioFilter& filter, PropList& preset)
+void LoadTree(AudioFilter& filter, Kept& kept)
 {
-    filter.LoadSettings(PresetData(preset));
+    filter.LoadSettings(PresetData(kept.tree));
 }
 
-void SaveToFile(AudioFilter& filter, PropList&)
+void Save(AudioFilter& filter, Kept& kept)
 {
-    PropList preset;
-    Save(filter, preset);
+    Kept fresh;
+    SaveTree(filter, fresh);
+    zebcore::proplist::utils::WritePropList(kept.text, fresh.tree);
+}
+
+void Load(AudioFilter& filter, Kept& kept)
+{
+    Kept read;
+    zebcore::proplist::utils::ReadPropList(kept.text, read.tree);
+    LoadTree(filter, read);
+}
+
+void SaveToFile(AudioFilter& filter, Kept&)
+{
+    Kept fresh;
+    SaveTree(filter, fresh);
     File file = PresetFile();
-    zebcore::proplist::utils::SavePropList(file, preset);
+    zebcore::proplist::utils::SavePropList(file, fresh.tree);
 }
 
-void LoadFromFile(AudioFilter& filter, PropList&)
+void LoadFromFile(AudioFilter& filter, Kept&)
 {
-    PropList preset;
-    zebcore::proplist::utils::LoadPropList(PresetFile().FullPath(), preset, false);
-    Load(filter, preset);
+    Kept read;
+    zebcore::proplist::utils::LoadPropList(PresetFile().FullPath(), read.tree, false);
+    LoadTree(filter, read);
 }
 
 Bytes StateOf(AudioFilter& filter)
 {
-    PropList preset;
-    Save(filter, preset);
+    Kept kept;
+    SaveTree(filter, kept);
     Bytes chunk;
-    PresetData(preset).GetChunkData(chunk);
+    PresetData(kept.tree).GetChunkData(chunk);
     return chunk;
 }
 
-// An effect with another state takes over that of `filter` through the operation; the bytes that then differ.
-double DifferingBytes(AudioFilter& filter, PropList& preset, Operation load)
+// An effect with another state takes over that of `filter`, of so many bytes, through the operation; the bytes that
+// then differ from those that the plug-in has made. They are the end of the chunk, since its controller keeps
+// nothing.
+double DifferingBytes(AudioFilter& filter, int bytes, Kept& kept, Operation load)
 {
     const FilterPointer other = MakeStateFilter(1);
-    load(*other, preset);
-    const Bytes expected = StateOf(filter);
+    load(*other, kept);
     const Bytes found = StateOf(*other);
+    Bytes expected = StateOf(filter);
+    const std::vector<char> content = effects::state::Content(static_cast<std::size_t>(bytes));
+    std::copy(content.begin(), content.end(), expected.end() - bytes);
     const std::size_t common = std::min(expected.size(), found.size());
     double differing = static_cast<double>(std::max(expected.size(), found.size()) - common);
     for (std::size_t index = 0; index < common; ++index)
@@ -90,17 +119,18 @@ void RunOurs(State& state, int bytes, Operation operation, Operation load)
     const FilterPointer filter = MakeStateFilter(bytes);
     if (StateOf(*filter).size() < static_cast<std::size_t>(bytes))
         return state.SkipWithError("the effect lost its state");
-    PropList preset;
-    Save(*filter, preset);
-    SaveToFile(*filter, preset);
+    Kept kept;
+    SaveTree(*filter, kept);
+    Save(*filter, kept);
+    SaveToFile(*filter, kept);
     {
         const PeakMemory peak;
-        operation(*filter, preset);
+        operation(*filter, kept);
         state.counters["peak"] = static_cast<double>(peak.Bytes()) / bytes;
     }
-    state.counters["differing"] = DifferingBytes(*filter, preset, load);
+    state.counters["differing"] = DifferingBytes(*filter, bytes, kept, load);
     for ([[maybe_unused]] auto round : state)
-        operation(*filter, preset);
+        operation(*filter, kept);
 }
 
 #if defined(ZEB_HAS_PEER)
@@ -180,6 +210,8 @@ void RegisterRows()
     {
         Register("P7/save", bytes, Save, Load);
         Register("P7/load", bytes, Load, Load);
+        Register("P7/save-tree", bytes, SaveTree, LoadTree);
+        Register("P7/load-tree", bytes, LoadTree, LoadTree);
         Register("P7/save-file", bytes, SaveToFile, LoadFromFile);
         Register("P7/load-file", bytes, LoadFromFile, LoadFromFile);
         RegisterPeer(bytes);

@@ -3,9 +3,12 @@
 The whole commands are timed: start, search, 20 binaries, list saved. The bundles are copies of one effect with class
 IDs of their own, which writes a line to a log whenever its binary is opened.
 """
+import json
 import os
 import pathlib
 import shutil
+import subprocess
+from xml.etree import ElementTree
 
 from driver import Runs, folder, options, timed
 
@@ -45,6 +48,14 @@ class Scans:
         times = timed(self.command(way, kind, settings), self.environment)
         return times, len(set(self.log.read_text().splitlines())) if self.log.exists() else 0
 
+    def recorded(self, way, settings):
+        """How many effects stand in the list that the scans have left."""
+        if way == 'peer':
+            return len(ElementTree.parse(settings / 'list.xml').findall('PLUGIN'))
+        run = subprocess.run([self.zebhost, '--settings', settings, 'list', '--json'], env=self.environment,
+                             capture_output=True, text=True)
+        return len(json.loads(run.stdout)['filters']) if run.returncode == 0 else 0
+
     def twice(self, way, kind):
         settings = self.work / 'settings'
         shutil.rmtree(settings, ignore_errors=True)
@@ -52,7 +63,11 @@ class Scans:
         first, opened = self.scan(way, kind, settings)
         if opened != BUNDLES:
             raise SystemExit(f'{way} opened {opened} of {BUNDLES} bundles')
-        return first, *self.scan(way, kind, settings)
+        again = self.scan(way, kind, settings)
+        recorded = self.recorded(way, settings)
+        if recorded != BUNDLES:
+            raise SystemExit(f'{way} recorded {recorded} effects in {BUNDLES} bundles')
+        return first, *again
 
 
 def main():

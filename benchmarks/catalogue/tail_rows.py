@@ -10,6 +10,7 @@ import struct
 from driver import Runs, folder, options, timed
 
 RATE, BLOCK = 48000, 512
+FRAME = 8  # two floats, in and out
 SECONDS = 120  # an echo of 10 ms that keeps half is below the smallest normal number after 1.3 of them
 
 
@@ -33,9 +34,22 @@ class Renders:
         timed([self.zebhost, '--settings', work / 'settings', 'scan', self.bundle])
 
     def render(self, name, tail):
-        return timed([self.zebhost, '--settings', self.work / 'settings', '--quiet', 'render', 'Zeb Delay',
-                      self.work / f'{name}.wav', self.work / 'out.wav', '--overwrite', '--settle', '0', '--set',
-                      'Time=10', '--set', 'Feedback=50', '--tail', str(tail), '--block', str(BLOCK)])
+        times = timed([self.zebhost, '--settings', self.work / 'settings', '--quiet', 'render', 'Zeb Delay',
+                       self.work / f'{name}.wav', self.work / 'out.wav', '--overwrite', '--settle', '0', '--set',
+                       'Time=10', '--set', 'Feedback=50', '--tail', str(tail), '--block', str(BLOCK)])
+        if name != 'short' or tail > 0:
+            check_sound(self.work / 'out.wav')
+        return times
+
+
+def check_sound(path):
+    """What is to be compared must have been rendered: the whole length, and the echo behind the first second."""
+    content = path.read_bytes()
+    data = content[content.index(b'data') + 8:]
+    if len(data) < FRAME * (SECONDS * RATE - BLOCK):
+        raise SystemExit(f'only {len(data) / FRAME / RATE:.1f} of {SECONDS} s were rendered')
+    if not any(data[FRAME * RATE * 102 // 100:FRAME * RATE * 110 // 100]):
+        raise SystemExit('there is no echo behind the first second')
 
 
 def main():

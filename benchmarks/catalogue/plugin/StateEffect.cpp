@@ -1,5 +1,6 @@
 #include "benchmarks/catalogue/plugin/StateEffect.h"
 
+#include "benchmarks/catalogue/plugin/StateContent.h"
 #include "examples/effects/support/PluginFactory.h"
 
 #include <dlfcn.h>
@@ -51,20 +52,6 @@ bool LogLoad()
 
 constexpr unsigned int kNoDenormals = 0x8040;
 constexpr int32 kReadSize = 1 << 16;
-
-// Bytes of every value, without a period that a block of any size would fit.
-std::vector<char> Content(std::size_t size)
-{
-    std::vector<char> bytes(size);
-    uint32 seed = 1;
-    std::generate(bytes.begin(), bytes.end(),
-                  [&seed]
-                  {
-                      seed = seed * 1664525U + 1013904223U;
-                      return static_cast<char>(seed >> 24U);
-                  });
-    return bytes;
-}
 
 } // namespace
 
