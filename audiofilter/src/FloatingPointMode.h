@@ -1,6 +1,10 @@
 #pragma once
 
+#include <cstdint>
+
+#if !defined(__aarch64__)
 #include <immintrin.h>
+#endif
 
 namespace zebaudiofilterhost
 {
@@ -10,20 +14,48 @@ namespace zebaudiofilterhost
 class FloatingPointMode
 {
 public:
-    FloatingPointMode() : mBefore(_mm_getcsr()) {}
+    FloatingPointMode() : mBefore(Get()) {}
     ~FloatingPointMode()
     {
-        const unsigned int now = _mm_getcsr();
+        const Word now = Get();
         if (((now ^ mBefore) & ~kStatus) != 0)
-            _mm_setcsr((mBefore & ~kStatus) | (now & kStatus));
+            Set((mBefore & ~kStatus) | (now & kStatus));
     }
     FloatingPointMode(const FloatingPointMode&) = delete;
     FloatingPointMode& operator=(const FloatingPointMode&) = delete;
 
 private:
-    static constexpr unsigned int kStatus = 0x3F; // What computations have met, which is no mode
+#if defined(__aarch64__)
+    using Word = std::uint64_t;
 
-    unsigned int mBefore;
+    static constexpr Word kStatus = 0; // Lies in a register of its own
+
+    static Word Get()
+    {
+        Word word = 0;
+        asm volatile("mrs %0, fpcr" : "=r"(word));
+        return word;
+    }
+    static void Set(Word word)
+    {
+        asm volatile("msr fpcr, %0" : : "r"(word));
+    }
+#else
+    using Word = std::uint32_t;
+
+    static constexpr Word kStatus = 0x3F; // What computations have met, which is no mode
+
+    static Word Get()
+    {
+        return _mm_getcsr();
+    }
+    static void Set(Word word)
+    {
+        _mm_setcsr(word);
+    }
+#endif
+
+    Word mBefore;
 };
 
 } // namespace zebaudiofilterhost

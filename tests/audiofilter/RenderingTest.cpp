@@ -1,12 +1,15 @@
 // Blocks through the channel maps.
 #include "foundation/zebcore/Trace.h"
+#include "tests/audiofilter/FloatingPointControl.h"
 #include "tests/audiofilter/RecordingFilter.h"
 #include "utility/ThreadUtils.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <cfenv>
 #include <limits>
+#include <stdexcept>
 #include <string>
 
 namespace zebaudiofilterhost
@@ -337,6 +340,48 @@ TEST_F(RenderingTest, QueuedParametersComeBeforeTheBlock)
     filter->FlushMessageQueue(); // Until then the message holds the filter
     EXPECT_EQ(filter->mSeen, 1U);
     EXPECT_EQ(mFlags.Value(), 0U);
+}
+
+// A filter that changes how its thread computes, divides by zero, and leaves it at that.
+struct ModeChanger : public RecordingFilter
+{
+    explicit ModeChanger(bool throws) : RecordingFilter({}, {}), mThrows(throws) {}
+    void Process(float**, float**, int, ChannelFlags, ChannelFlags&) override
+    {
+        testing::SetFloatingPointWord(testing::GetFloatingPointWord() ^ testing::kFlushAndRoundDown);
+        std::feraiseexcept(FE_DIVBYZERO);
+        if (mThrows)
+            throw std::runtime_error("process");
+    }
+
+    const bool mThrows;
+};
+
+TEST_F(RenderingTest, TheCallersFloatingPointModeOutlastsABlock)
+{
+    const testing::FloatingPointRestorer restorer;
+    for (const bool throws : {false, true})
+    {
+        boost::intrusive_ptr<ModeChanger> filter(new ModeChanger(throws));
+        filter->Resume();
+        // The second time with what the plug-in takes away, and set between two blocks.
+        for (int block = 0; block < 2; ++block)
+        {
+            const auto mode = testing::GetFloatingPointMode();
+            std::feclearexcept(FE_ALL_EXCEPT);
+            const auto process = [&]
+            {
+                filter->ProcessWithMapping(nullptr, nullptr, 0, ChannelFlags(), mFlags);
+            };
+            if (throws)
+                EXPECT_THROW(process(), std::runtime_error);
+            else
+                process();
+            EXPECT_EQ(testing::GetFloatingPointMode(), mode) << throws << block;
+            EXPECT_NE(std::fetestexcept(FE_DIVBYZERO), 0) << "what was met is no mode";
+            testing::SetFloatingPointWord(testing::GetFloatingPointWord() ^ testing::kFlushAndRoundDown);
+        }
+    }
 }
 
 } // namespace

@@ -1,6 +1,7 @@
 // What the process thread does in a VST 3 filter, and how changes are delivered while no audio runs.
 
 #include "foundation/zebcore/Trace.h"
+#include "tests/audiofilter/FloatingPointControl.h"
 #include "tests/vst3/FakePlugin.h"
 
 #include <gmock/gmock.h>
@@ -434,6 +435,32 @@ TEST_F(FilterProcessing, SuspendedFilterFlushesWithoutSamples)
     filter->FlushMessageQueue();
     EXPECT_THAT(changes, ElementsAre("7: 0=0.50;"));
     EXPECT_THAT(plugin.CallsTo("processor"), ElementsAre("processor.process 0"));
+}
+
+TEST_F(FilterProcessing, AFlushLeavesTheMainThreadItsFloatingPointMode)
+{
+    using namespace zebaudiofilterhost::testing;
+    const FloatingPointRestorer restorer;
+    const auto mode = GetFloatingPointMode();
+    plugin.parameters = {{7}};
+    Start();
+    filter->Suspend();
+    for (const bool throws : {false, true})
+    {
+        bool isCalled = false;
+        plugin.process = [&](ProcessData&)
+        {
+            isCalled = true;
+            SetFloatingPointWord(GetFloatingPointWord() ^ kFlushAndRoundDown);
+            if (throws)
+                throw 1;
+            return kResultOk;
+        };
+        filter->SetParameter(0, 0.5F);
+        filter->FlushMessageQueue();
+        EXPECT_TRUE(isCalled);
+        EXPECT_EQ(GetFloatingPointMode(), mode) << throws;
+    }
 }
 
 TEST_F(FilterProcessing, ThrowingFlushKeepsTheBusesAndForgetsTheChanges)

@@ -1,5 +1,6 @@
 // The filter's way from suspended to running and back, and what it does for the plug-in while no audio runs.
 
+#include "audiofilter/src/FloatingPointMode.h"
 #include "host/src/VST3/src/ScopeExit.h"
 #include "host/src/VST3/src/VST3AudioFilter.h"
 
@@ -197,6 +198,7 @@ void VST3AudioFilter::FlushParameterChanges()
     if (!mSuspended || !mInitialized || mFlushing.exchange(true))
         return;
     const ScopeExit done([this] { mFlushing = false; });
+    const FloatingPointMode mode; // the main thread's
     TakeOfferedQueues();
     try
     {
