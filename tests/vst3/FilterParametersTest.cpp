@@ -5,9 +5,14 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <functional>
+#include <utility>
+#include <vector>
+
 using namespace fakeplugin;
 using testing::ElementsAre;
 using zebaudiofilterhost::UTF16String;
+using zebaudiofilterhost::vst3::VST3AudioFilter;
 
 namespace
 {
@@ -59,6 +64,34 @@ TEST(FilterParameters, ApplicationSeesNeitherReadOnlyNorBypassNorPrograms)
     for (ParamID id = 9; id < 15; ++id)
         filter->performEdit(id, 0.5);
     EXPECT_THAT(FlushedIDs(plugin, *filter), ElementsAre(10U, 11U, 12U, 13U, 14U));
+}
+
+// Nobody asks which parameter is edited while nobody hears of it.
+TEST(FilterParameters, EditsReachTheProcessorUnheardAndWhoeverListensFromThenOn)
+{
+    using Slot = std::function<void(int, float)>;
+    const std::vector<std::function<void(VST3AudioFilter&, const Slot&)>> waysToListen = {
+        [](VST3AudioFilter& filter, const Slot& slot) { filter.ConnectAutomatedParameterChange(slot); },
+        [](VST3AudioFilter& filter, const Slot& slot)
+        {
+            filter.GetAutomatedParameterChangeSignal().connect(slot);
+        }};
+    for (const auto& listen : waysToListen)
+    {
+        FakePlugin plugin;
+        plugin.parameters = {{10}, {11}};
+        const auto filter = plugin.MakeFilter();
+        filter->performEdit(11, 0.25);
+        filter->SetParameterAutomated(0, 0.25F);
+        EXPECT_THAT(FlushedIDs(plugin, *filter), ElementsAre(10U, 11U));
+
+        std::vector<std::pair<int, float>> heard;
+        listen(*filter, [&](int index, float value) { heard.emplace_back(index, value); });
+        filter->performEdit(11, 0.5);
+        filter->SetParameterAutomated(0, 0.75F);
+        EXPECT_THAT(heard, ElementsAre(std::pair(1, 0.5F), std::pair(0, 0.75F)));
+        EXPECT_THAT(FlushedIDs(plugin, *filter), ElementsAre(10U, 11U));
+    }
 }
 
 TEST(FilterParameters, IndicesOutOfRangeFindNothing)
