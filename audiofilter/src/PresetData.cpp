@@ -28,22 +28,24 @@ T ValueOr(const PropList* propList, const UTF8String& key, T value)
     return value;
 }
 
-// Finds the text of the chunk where it lies: it may have megabytes.
-class ChunkText final : public zebcore::proplist::PropListVisitor
+// Decodes the chunk where its text lies: it may have megabytes.
+class ChunkDecoder final : public zebcore::proplist::PropListVisitor
 {
 public:
+    explicit ChunkDecoder(std::vector<unsigned char>& chunk) : mChunk(chunk) {}
+
     using PropListVisitor::VisitValue;
     void VisitValue(const UTF8String& key, const UTF8String& value) override
     {
         if (key == PresetData::kChunkDataKey)
-            mText = &value;
+            mIsDecoded = !value.empty() && zebcore::utility::DecodeBinaryDataFromUTF8String(value, mChunk);
     }
 
-    // Null if there is none.
-    const UTF8String* Get() const { return mText; }
+    bool IsDecoded() const { return mIsDecoded; }
 
 private:
-    const UTF8String* mText = nullptr;
+    std::vector<unsigned char>& mChunk;
+    bool mIsDecoded = false;
 };
 
 } // namespace
@@ -112,11 +114,10 @@ void PresetData::SetParamList(const std::list<float>& params)
 bool PresetData::GetChunkData(std::vector<unsigned char>& chunk) const
 {
     chunk.clear();
-    ChunkText finder;
+    ChunkDecoder decoder(chunk);
     if (mPropList != nullptr)
-        mPropList->Visit(finder);
-    const UTF8String* const text = finder.Get();
-    return text != nullptr && !text->empty() && zebcore::utility::DecodeBinaryDataFromUTF8String(*text, chunk);
+        mPropList->Visit(decoder);
+    return decoder.IsDecoded();
 }
 
 void PresetData::SetChunkData(const unsigned char* data, unsigned long size)
