@@ -421,6 +421,22 @@ protected:
     std::atomic<long> mSeen = 0;
 };
 
+TEST_F(ListenerTableTest, RowsAreVisitedInTheOrderOfRegistration)
+{
+    std::vector<std::unique_ptr<ListenerRow>> rows;
+    std::vector<const ListenerRow*> expected;
+    for (std::size_t row = 0; row < kThings; ++row)
+    {
+        rows.push_back(std::make_unique<ListenerRow>(nullptr, EventOf(row % 2), nullptr, nullptr));
+        mTable->Append(*rows.back());
+        if (row % 2 == 0)
+            expected.push_back(rows.back().get());
+    }
+    std::vector<const ListenerRow*> visited;
+    mTable->ForEach(EventOf(0), [&](const ListenerRow& row) { visited.push_back(&row); });
+    EXPECT_EQ(visited, expected);
+}
+
 TEST_F(ListenerTableTest, ReadersSeeRowsThatAreThere)
 {
     constexpr int kRounds = 4000;

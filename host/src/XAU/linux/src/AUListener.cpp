@@ -100,14 +100,21 @@ void AUListenerBase::Tell(Row& row, UInt64 hostTime, AudioUnitParameterValue val
         return;
     row.mLastLeftOut.store(number, std::memory_order_relaxed);
     row.mLeftOut.fetch_add(1, std::memory_order_relaxed);
-    mHasLeftOut.store(true, std::memory_order_release); // with the two above
+    MarkLeftOut();
 }
 
 void AUListenerBase::TellToRead(Row& row)
 {
     row.mLastLeftOut.store(mNumber.fetch_add(1, std::memory_order_relaxed), std::memory_order_relaxed);
     row.mLeftOut.fetch_add(1, std::memory_order_relaxed);
-    mHasLeftOut.store(true, std::memory_order_release); // with the two above
+    MarkLeftOut();
+}
+
+// With what the row says of it. An exchange, since a store would hide what another thread marked before: whoever
+// takes the mark off must see the rows of both.
+void AUListenerBase::MarkLeftOut()
+{
+    mHasLeftOut.exchange(true, std::memory_order_release);
 }
 
 std::vector<AUListenerBase::Heard> AUListenerBase::Collect()
@@ -128,15 +135,19 @@ std::vector<AUListenerBase::Heard> AUListenerBase::Collect()
     return batch;
 }
 
-// Something of them may wait yet.
+// Something of them may wait yet. A unit that is just going still needs its rows: they are left to the next pass, for
+// to wait here could be to wait for a reader of this very thread.
 void AUListenerBase::DropLostUnits()
 {
     std::erase_if(mRows,
                   [this](const RowPtr& row)
                   {
-                      if (row->mTable->IsClosed())
+                      const bool isEmptied = row->mTable->IsEmptied();
+                      if (isEmptied)
                           mRemoved.push_back(row);
-                      return row->mTable->IsClosed();
+                      else if (row->mTable->IsClosed())
+                          LoseUnit();
+                      return isEmptied;
                   });
 }
 

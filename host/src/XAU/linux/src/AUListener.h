@@ -62,6 +62,7 @@ private:
     static constexpr std::size_t kCapacity = 1024; // between two passes of the timer
     using Queue = boost::lockfree::queue<Told, boost::lockfree::capacity<kCapacity>>;
 
+    void MarkLeftOut();
     void Deliver();
     std::vector<Heard> Collect();
     void DropLostUnits();

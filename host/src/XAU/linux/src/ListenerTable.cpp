@@ -44,17 +44,19 @@ std::size_t ListenerTable::Cells::BucketOf(const AudioUnitEvent& event) const
 void ListenerTable::Cells::Append(ListenerRow& row)
 {
     const std::size_t index = mCount.load(std::memory_order_relaxed);
-    std::atomic<std::uint32_t>& bucket = mBuckets[BucketOf(row.mEvent)];
-    mCells[index].mNext = bucket.load(std::memory_order_relaxed);
+    const auto place = static_cast<std::uint32_t>(index + 1);
     mCells[index].mRow.store(&row, std::memory_order_release);
-    bucket.store(static_cast<std::uint32_t>(index + 1), std::memory_order_release);
+    Bucket& bucket = mBuckets[BucketOf(row.mEvent)];
+    const std::uint32_t last = std::exchange(bucket.mLast, place);
+    std::atomic<std::uint32_t>& leading = last == kNoPlace ? bucket.mFirst : mCells[last - 1].mNext;
+    leading.store(place, std::memory_order_release);
     mCount.store(index + 1, std::memory_order_release);
 }
 
 void ListenerTable::Cells::Remove(const ListenerRow& row)
 {
-    std::uint32_t place = mBuckets[BucketOf(row.mEvent)].load(std::memory_order_relaxed);
-    for (; place != kNoPlace; place = mCells[place - 1].mNext)
+    std::uint32_t place = mBuckets[BucketOf(row.mEvent)].mFirst.load(std::memory_order_relaxed);
+    for (; place != kNoPlace; place = mCells[place - 1].mNext.load(std::memory_order_relaxed))
     {
         if (mCells[place - 1].mRow.load(std::memory_order_relaxed) == &row)
             mCells[place - 1].mRow.store(nullptr, std::memory_order_seq_cst); // before the question for readers
@@ -85,14 +87,20 @@ void ListenerTable::Remove(std::span<ListenerRow* const> rows)
 void ListenerTable::Close()
 {
     const std::lock_guard lock(mChanging);
+    std::vector<AUListenerBase*> listeners;
+    listeners.reserve(GetCells().mCount.load(std::memory_order_relaxed));
     mIsClosed.store(true, std::memory_order_seq_cst);
     for (Cell& cell : GetCells().mCells)
     {
-        // Its listener is there: it takes its rows out before it goes.
         if (const ListenerRow* row = cell.mRow.exchange(nullptr, std::memory_order_seq_cst))
-            row->mListener->LoseUnit();
+            listeners.push_back(row->mListener);
     }
     mCells.AwaitReaders();
+    // They are there: as long as nothing says that the table is emptied they keep its rows, and who has rows of it
+    // waits for the lock before it goes.
+    for (AUListenerBase* listener : listeners)
+        listener->LoseUnit();
+    mIsEmptied.store(true, std::memory_order_release);
 }
 
 // By room for as many rows again as there are; cells of rows that have gone are left out.

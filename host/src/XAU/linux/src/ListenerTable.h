@@ -30,7 +30,10 @@ public:
     /// Before the unit goes: takes all rows out and lets their listeners know, which may be disposed of later.
     /// [any but process]
     void Close();
+    /// The unit goes, or has gone. [any]
     bool IsClosed() const { return mIsClosed.load(std::memory_order_seq_cst); }
+    /// Close is done with the rows, and so is everybody who found them before: they may be freed. [any]
+    bool IsEmptied() const { return mIsEmptied.load(std::memory_order_acquire); }
 
     /// Calls `call` unless the unit has gone; it does not go before the return. Must not close the table. [any]
     template <typename Call>
@@ -52,7 +55,7 @@ public:
             VisitCell(cells.mCells[index], visit);
     }
 
-    /// The same for the rows of one event, without a look at the others.
+    /// The same for the rows of one event, without a look at the others. Both visit in the order of registration.
     template <typename Visit>
     void ForEach(const AudioUnitEvent& event, const Visit& visit) const
     {
@@ -63,9 +66,9 @@ public:
             if (IsSameEvent(row.mEvent, event))
                 visit(row);
         };
-        // Each cell was written before the one that leads to it.
-        std::uint32_t place = cells.mBuckets[cells.BucketOf(event)].load(std::memory_order_acquire);
-        for (; place != kNoPlace; place = cells.mCells[place - 1].mNext)
+        // Each cell was written before the place that leads to it.
+        std::uint32_t place = cells.mBuckets[cells.BucketOf(event)].mFirst.load(std::memory_order_acquire);
+        for (; place != kNoPlace; place = cells.mCells[place - 1].mNext.load(std::memory_order_acquire))
             VisitCell(cells.mCells[place - 1], visitSame);
     }
 
@@ -75,7 +78,13 @@ private:
     struct Cell
     {
         std::atomic<ListenerRow*> mRow = nullptr;
-        std::uint32_t mNext = kNoPlace; // of the same bucket
+        std::atomic<std::uint32_t> mNext = kNoPlace; // of the same bucket
+    };
+
+    struct Bucket
+    {
+        std::atomic<std::uint32_t> mFirst = kNoPlace;
+        std::uint32_t mLast = kNoPlace; // of whoever appends
     };
 
     struct Cells
@@ -85,8 +94,8 @@ private:
         void Append(ListenerRow& row);
         void Remove(const ListenerRow& row);
 
-        std::vector<Cell> mCells;                         // of a fixed size
-        std::vector<std::atomic<std::uint32_t>> mBuckets; // places of first cells
+        std::vector<Cell> mCells; // of a fixed size
+        std::vector<Bucket> mBuckets;
         std::atomic<std::size_t> mCount = 0;
     };
 
@@ -105,6 +114,7 @@ private:
 
     Published<CellsPtr> mCells;
     std::atomic<bool> mIsClosed = false;
+    std::atomic<bool> mIsEmptied = false;
     std::mutex mChanging; // one at a time
 };
 
