@@ -42,7 +42,7 @@ public:
     void FromString(const UTF16String& text);
 
     /// Equal for equal locators. [any]
-    friend std::size_t hash_value(const PluginLocator& locator);
+    friend ZEB_EXPORT std::size_t hash_value(const PluginLocator& locator);
 
 private:
     TechnologyType mType = kTechnologyNone;

@@ -1,6 +1,7 @@
 #include "host/src/PluginModuleRecords.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace zebaudiofilterhost
 {
@@ -8,11 +9,16 @@ namespace zebaudiofilterhost
 void PluginModuleRecords::Add(const Pointer& record)
 {
     const std::size_t arrival = mNextArrival++;
-    const auto [entry, isNew] = mPlaces.try_emplace(record->GetLocator(), Place{record, arrival});
+    const PluginLocator& locator = record->GetLocator();
+    const auto [entry, isNew] = mPlaces.try_emplace(locator, Place{record, arrival});
     if (!isNew)
     {
         LeaveGap(entry->second.arrival);
-        entry->second = Place{record, arrival};
+        // Under its own locator: an equal one may be spelt in another way.
+        auto place = mPlaces.extract(entry);
+        place.key() = locator;
+        place.mapped() = Place{record, arrival};
+        mPlaces.insert(std::move(place));
     }
     mInOrder.push_back(record);
     mArrivals.push_back(arrival);
