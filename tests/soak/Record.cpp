@@ -84,6 +84,46 @@ std::vector<Check> JudgeResources(const std::vector<Sample>& samples)
             JudgeCount("threads at both ends", samples, &Resources::threads)};
 }
 
+Check JudgeSubjects(std::size_t effects)
+{
+    return {"effects beside the control", std::to_string(effects),
+            effects > 0 ? Check::Outcome::Holds : Check::Outcome::Fails};
+}
+
+Check JudgeEnd(bool interrupted)
+{
+    return {"the whole run", interrupted ? "interrupted" : "to its end",
+            interrupted ? Check::Outcome::Fails : Check::Outcome::Holds};
+}
+
+Check JudgeProbes(std::size_t compared, std::size_t different)
+{
+    Check check{"fixed probes at both ends",
+                std::to_string(compared) + " compared, " + std::to_string(different) + " different"};
+    if (compared == 0)
+    {
+        check.outcome = Check::Outcome::NotJudged;
+    }
+    else if (different > 0)
+    {
+        check.outcome = Check::Outcome::Fails;
+    }
+    return check;
+}
+
+bool AllHold(const std::vector<Check>& checks)
+{
+    const auto fails = [](const Check& check)
+    {
+        return check.outcome == Check::Outcome::Fails;
+    };
+    const auto holds = [](const Check& check)
+    {
+        return check.outcome == Check::Outcome::Holds;
+    };
+    return std::none_of(checks.begin(), checks.end(), fails) && std::any_of(checks.begin(), checks.end(), holds);
+}
+
 std::string Megabytes(double bytes)
 {
     std::array<char, 32> text{};

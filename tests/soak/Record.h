@@ -35,6 +35,18 @@ const char* NameOf(Check::Outcome outcome);
 /// Of rows of samples: memory by quarters of the time, the rest at both ends. Empty without samples.
 std::vector<Check> JudgeResources(const std::vector<Sample>& samples);
 
+/// Whether there were effects to use, the control not counted.
+Check JudgeSubjects(std::size_t effects);
+
+/// Whether the run came to its end.
+Check JudgeEnd(bool interrupted);
+
+/// Of fixed probes that could be compared, and those of them that sounded different.
+Check JudgeProbes(std::size_t compared, std::size_t different);
+
+/// A run has passed if something was judged and nothing fails.
+bool AllHold(const std::vector<Check>& checks);
+
 /// Such as "123.4 MB".
 std::string Megabytes(double bytes);
 

@@ -73,6 +73,22 @@ TEST(RecordTest, JudgesNoMemoryOfAShortRun)
                 ElementsAre(Check::Outcome::NotJudged, Check::Outcome::NotJudged, kHolds, kHolds));
 }
 
+TEST(RecordTest, DoesNotPassARunThatTestedNothing)
+{
+    EXPECT_EQ(JudgeSubjects(0).outcome, kFails);
+    EXPECT_EQ(JudgeSubjects(1).outcome, kHolds);
+    EXPECT_EQ(JudgeEnd(true).outcome, kFails);
+    EXPECT_EQ(JudgeEnd(false).outcome, kHolds);
+    EXPECT_EQ(JudgeProbes(0, 0).outcome, Check::Outcome::NotJudged);
+    EXPECT_EQ(JudgeProbes(2, 0).outcome, kHolds);
+    EXPECT_EQ(JudgeProbes(2, 1).outcome, kFails);
+
+    EXPECT_FALSE(AllHold({}));
+    EXPECT_FALSE(AllHold({JudgeProbes(0, 0)}));
+    EXPECT_TRUE(AllHold({JudgeProbes(0, 0), JudgeEnd(false)}));
+    EXPECT_FALSE(AllHold({JudgeSubjects(3), JudgeEnd(true)}));
+}
+
 TEST(LedgerTest, PutsWhatStaysDownToItsEffect)
 {
     Ledger ledger({"tight", "leaks", "leaks more", "keeps a descriptor"});

@@ -1,5 +1,6 @@
 #include "Soak.h"
 
+#include "ControlFilter.h"
 #include "Interrupt.h"
 #include "Probe.h"
 
@@ -35,8 +36,7 @@ unsigned long Sum(const Tally& tally)
 
 bool Findings::Passed() const
 {
-    return std::none_of(checks.begin(), checks.end(),
-                        [](const Check& check) { return check.outcome == Check::Outcome::Fails; });
+    return AllHold(checks);
 }
 
 Soak::Soak(const Options& options, const Console& console, const std::filesystem::path& folder)
@@ -56,11 +56,23 @@ Findings Soak::Run()
     mFindings.ledger = Ledger(NamesOf(mFindings.subjects));
     mConsole.Say("soak: seed " + std::to_string(mOptions.seed) + ", " + std::to_string(mFindings.subjects.size()) +
                  " effects, " + std::to_string(mOptions.seconds) + " s after each was used once");
-    WarmUp();
-    RunTurns();
-    CompareProbes();
+    mFindings.checks.push_back(JudgeSubjects(EffectCount()));
+    if (mFindings.Passed())
+    {
+        WarmUp();
+        RunTurns();
+        CompareProbes();
+        mFindings.checks.push_back(JudgeEnd(interrupt::IsRequested()));
+    }
     mNote.Done();
     return std::move(mFindings);
+}
+
+std::size_t Soak::EffectCount() const
+{
+    return static_cast<std::size_t>(std::count_if(mFindings.subjects.begin(), mFindings.subjects.end(),
+                                                  [](const Subject& subject)
+                                                  { return subject.id != kControlFilterID; }));
 }
 
 void Soak::WarmUp()
@@ -124,7 +136,10 @@ void Soak::RunTurns()
     Settle(kRestMs);
     TakeSample();
     mFindings.seconds = Seconds();
-    mFindings.checks = JudgeResources(mFindings.samples);
+    for (Check& check : JudgeResources(mFindings.samples))
+    {
+        mFindings.checks.push_back(std::move(check));
+    }
 }
 
 // Two turns of one effect alone, then one of all together.
@@ -165,11 +180,7 @@ void Soak::CompareProbes()
             }
         }
     }
-    const bool same = mFindings.changed.empty();
-    mFindings.checks.push_back(
-        {"fixed probes at both ends",
-         std::to_string(compared) + " compared, " + std::to_string(mFindings.changed.size()) + " different",
-         same ? Check::Outcome::Holds : Check::Outcome::Fails});
+    mFindings.checks.push_back(JudgeProbes(compared, mFindings.changed.size()));
 }
 
 void Soak::TakeSample()

@@ -41,6 +41,7 @@ public:
     Findings Run();
 
 private:
+    std::size_t EffectCount() const;
     void WarmUp();
     void WarmUp(std::size_t index);
     void UseOnce(const Subject& subject);
