@@ -22,6 +22,7 @@ constexpr const char* kCatalogue = "AudioPluginManagerSettings.xml";
 constexpr const char* kBinaries = "AudioPluginManagerSettings.binaries.json";
 constexpr const char* kBlocks = "DynamicAudioPlugInBlacklist.xml";
 constexpr const char* kReasons = "DynamicAudioPlugInBlacklist.reasons.json";
+constexpr const char* kJournal = "AudioPluginManagerSettings.journal";
 
 class ScanDiskFaultsTest : public ScanFolder
 {
@@ -106,6 +107,25 @@ TEST_F(ScanDiskFaultsTest, NoGoodPluginIsBlockedByATroubledDisk)
     }
 }
 
+// Whichever of its lines is the first that finds no room, and wherever it is cut short.
+TEST_F(ScanDiskFaultsTest, AJournalThatCannotBeWrittenEndsTheScanAndBlocksNothing)
+{
+    for (const char* fault : {"write:full:", "write:shortThenFull:"})
+    {
+        for (int lines = 0; lines < 4; ++lines)
+        {
+            const std::string full = fault + std::to_string(lines) + "+" + kJournal;
+            const RunResult result =
+                RunOnFaultyDisk(full, {"scan", "--full", Bundle("a").string(), Bundle("c").string()});
+            EXPECT_EQ(result.code, 7) << full << result.err;
+            EXPECT_THAT(result.LastLine(), HasSubstr((Settings() / kJournal).string())) << full;
+            EXPECT_EQ(Blocks().size(), 1U) << full;
+            ExpectNothingLost(full);
+            EXPECT_EQ(Records().count("c"), 0U) << full;
+        }
+    }
+}
+
 TEST_F(ScanDiskFaultsTest, WithRoomAgainTheNextScanGoesOn)
 {
     RunOnFaultyDisk(std::string("write:full:") + kCatalogue, {"scan"});
@@ -116,7 +136,7 @@ TEST_F(ScanDiskFaultsTest, WithRoomAgainTheNextScanGoesOn)
 
 TEST_F(ScanDiskFaultsTest, ShortWritesAreCarriedOn)
 {
-    for (const char* file : {kCatalogue, kBinaries, kBlocks, kReasons})
+    for (const char* file : {kCatalogue, kBinaries, kBlocks, kReasons, kJournal})
     {
         const std::string fault = std::string("write:short:") + file;
         const RunResult result = RunOnFaultyDisk(fault, {"scan", "--full"});

@@ -28,13 +28,17 @@ protected:
         }
     }
 
-    // What the files hold.
+    // What the files hold once a command has taken over what stands in the journal.
     struct Books
     {
         std::set<std::string> records;
         std::map<std::string, std::string> blocks;
     };
-    Books Read() const { return {Records(), Blocks()}; }
+    Books Read() const
+    {
+        std::map<std::string, std::string> blocks = Blocks();
+        return {Records(), std::move(blocks)};
+    }
 
     bool IsAllDone(const Books& books) const
     {

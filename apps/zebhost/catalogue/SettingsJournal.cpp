@@ -19,7 +19,7 @@ namespace
 {
 
 // Returns a system error number, 0 if all is well.
-int WriteAll(int file, std::string_view text)
+int WriteWhole(int file, std::string_view text)
 {
     while (!text.empty())
     {
@@ -64,7 +64,7 @@ void SettingsJournal::Add(const std::string& line) const
     constexpr int kPermissions = 0666;
     const std::uintmax_t before = Size();
     const int file = open(mFile.c_str(), O_WRONLY | O_APPEND | O_CREAT | O_CLOEXEC, kPermissions);
-    int error = file < 0 ? errno : WriteAll(file, line);
+    int error = file < 0 ? errno : WriteWhole(file, line);
     if (file >= 0)
     {
         // The file system may tell only now that there is no room.
