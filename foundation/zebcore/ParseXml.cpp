@@ -15,11 +15,12 @@ namespace
 {
 
 constexpr XML_Char kNameSeparator = '\n';
-// Expat copies each block that it is given. Small ones would make it read a long attribute again and again.
-constexpr std::size_t kBlockSize = std::size_t{1} << 20U;
-// Blocks that are read into Expat's own buffer. They grow while one attribute or tag takes all of them.
+// Expat copies each block that it is given, and reads an unfinished attribute or tag again with each: blocks grow
+// while one takes all of them. Those of a text that stands in memory, and those that are read into Expat's own
+// buffer:
+constexpr int kFirstBlockSize = 1 << 20;
 constexpr int kFirstReadSize = 1 << 16;
-constexpr int kLargestReadSize = 1 << 28;
+constexpr int kLargestSize = 1 << 28;
 
 std::u8string_view View(const XML_Char* text)
 {
@@ -64,13 +65,16 @@ public:
     XmlResult Parse(std::u8string_view text)
     {
         XML_Status status = XML_STATUS_OK;
+        int size = kFirstBlockSize;
         for (bool last = false; !last && status == XML_STATUS_OK;)
         {
-            const std::u8string_view block = text.substr(0, kBlockSize);
+            const std::u8string_view block = text.substr(0, static_cast<std::size_t>(size));
+            const XML_Index before = XML_GetCurrentByteIndex(mParser.get());
             text.remove_prefix(block.size());
             last = text.empty();
             status = XML_Parse(mParser.get(), reinterpret_cast<const char*>(block.data()),
                                static_cast<int>(block.size()), last ? XML_TRUE : XML_FALSE);
+            size = NextSize(size, before);
         }
         return Conclude(status);
     }
@@ -89,13 +93,18 @@ public:
                 static_cast<int>(source(static_cast<unsigned char*>(buffer), static_cast<unsigned int>(size)));
             last = read < size;
             status = XML_ParseBuffer(mParser.get(), read, last ? XML_TRUE : XML_FALSE);
-            if (XML_GetCurrentByteIndex(mParser.get()) == before)
-                size = std::min(2 * size, kLargestReadSize);
+            size = NextSize(size, before);
         }
         return Conclude(status);
     }
 
 private:
+    // `before`: where the parser stood ahead of a block of so many bytes.
+    int NextSize(int size, XML_Index before) const
+    {
+        return XML_GetCurrentByteIndex(mParser.get()) == before ? std::min(2 * size, kLargestSize) : size;
+    }
+
     XmlResult Conclude(XML_Status status) const
     {
         if (mThrown)
