@@ -5,6 +5,7 @@
 #include <utf8.h>
 
 #include <algorithm>
+#include <array>
 #include <cstdint>
 #include <optional>
 
@@ -108,11 +109,22 @@ void AppendCharacter(UTF8String& out, char32_t character)
 }
 
 // What goes into the text as it is: printable ASCII without the reserved characters and the backslash.
+constexpr std::array<bool, 128> MakePlainTable()
+{
+    std::array<bool, 128> plain{};
+    for (char32_t character = U' '; character < 0x7F; ++character)
+        plain[character] = character != U'&' && character != U'<' && character != U'>' && character != U'"' &&
+                           character != U'\'' && character != U'\\';
+    return plain;
+}
+
+constexpr std::array<bool, 128> kPlain = MakePlainTable();
+
+// A look into a table: a chunk of megabytes goes through here.
 template <typename Unit>
 constexpr bool IsPlain(Unit unit)
 {
-    return unit >= Unit{' '} && unit < Unit{0x7F} && unit != Unit{'&'} && unit != Unit{'<'} && unit != Unit{'>'} &&
-           unit != Unit{'"'} && unit != Unit{'\''} && unit != Unit{'\\'};
+    return unit < kPlain.size() && kPlain[unit];
 }
 
 // Appends the plain beginning of the text, which is nearly always all of it, and returns its length.
