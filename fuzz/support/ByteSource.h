@@ -22,7 +22,8 @@ public:
     {
         Number number{};
         const Bytes taken = TakeBytes(sizeof(number));
-        std::memcpy(&number, taken.data(), taken.size());
+        if (!taken.empty()) // What is empty may be at no address
+            std::memcpy(&number, taken.data(), taken.size());
         return number;
     }
 
@@ -40,7 +41,8 @@ public:
         using Unit = typename String::value_type;
         const Bytes taken = TakeBytes(Take<std::uint8_t>() * sizeof(Unit));
         String text(taken.size() / sizeof(Unit), Unit());
-        std::memcpy(text.data(), taken.data(), text.size() * sizeof(Unit));
+        if (!text.empty())
+            std::memcpy(text.data(), taken.data(), text.size() * sizeof(Unit));
         return text;
     }
 
