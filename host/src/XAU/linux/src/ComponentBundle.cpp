@@ -85,7 +85,7 @@ std::optional<ComponentListing> ReadListing(const CFOpaqueDictionary& entry, con
     const auto manufacturer = FindCode(entry, "manufacturer");
     const auto* name = Find<CFOpaqueString>(entry, "name", CFStringGetTypeID());
     const auto* factory = Find<CFOpaqueString>(entry, "factoryFunction", CFStringGetTypeID());
-    const bool hasFactory = factory && !factory->mText.empty();
+    const bool hasFactory = factory != nullptr && !factory->mText.empty();
     if (!type || !subType || !manufacturer || !name || !hasFactory)
     {
         TraceLeftOut(bundle, index,
