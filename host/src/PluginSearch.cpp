@@ -80,7 +80,7 @@ private:
 
 bool IsNamedAsBundle(const UTF16String& path, const PluginSearchRules& rules)
 {
-    return path.ends_with(rules.mBundleExtension) && (!rules.mIsBundle || rules.mIsBundle(path));
+    return path.ends_with(rules.mBundleExtension) && (rules.mIsBundle == nullptr || rules.mIsBundle(path));
 }
 
 std::vector<PluginLocator> SearchForPlugins(const std::vector<Dir>& places, const PluginSearchRules& rules)
