@@ -18,8 +18,8 @@ zebaudiofilterhost::PluginLocator BundleLocator(const std::filesystem::path& pat
 
 std::string PathOf(const zebaudiofilterhost::PluginLocator& locator);
 
-// For the user's eyes: the path, and for a plug-in that is no file the name by which its system knows it, or, if it does
-// not know it any more, the four characters of type, subtype and maker.
+// For the user's eyes: the path, and for a plug-in that is no file the name by which its system knows it, or, if it
+// does not know it any more, the four characters of type, subtype and maker.
 std::string PlaceOf(const zebaudiofilterhost::PluginLocator& locator);
 
 // What a command takes: the path, and for a plug-in that is no file its ID.

@@ -37,7 +37,8 @@ void Echo::TakeValues()
         SetParameter(i, values[static_cast<std::size_t>(i)]);
 }
 
-// The other way round, ahead of whatever looks at the programs: parameters may be set on the audio thread at any time.
+// The other way round, ahead of whatever looks at the programs: parameters may be set on the audio thread at any
+// time.
 void Echo::KeepValues()
 {
     EchoValues& values = mPrograms[static_cast<std::size_t>(mProgram)];

@@ -73,7 +73,7 @@ private:
     AEffect mEffect{};
     audioMasterCallback mHost;
     const Member* mMember;
-    std::vector<Values> mPrograms; // one at least
+    std::vector<Values> mPrograms;         // one at least
     std::atomic<std::size_t> mProgram = 0; // set while audio runs, as values are
     std::vector<char> mChunk;
     std::array<Arrangement, 2> mArrangements;

@@ -33,7 +33,8 @@ long long Instance::AnswerText(const Call& call) const
         return 1;
     default:
     {
-        const std::size_t index = call.opcode == effGetProgramName ? mProgram.load() : static_cast<std::size_t>(call.index);
+        const std::size_t index =
+            call.opcode == effGetProgramName ? mProgram.load() : static_cast<std::size_t>(call.index);
         if (index >= behaviour.programs.size())
             return 0;
         GiveText(call.ptr, behaviour.programs[index], kProgramRoom);

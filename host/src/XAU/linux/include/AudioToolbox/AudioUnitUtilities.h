@@ -7,9 +7,9 @@
 // allocates nor locks, and takes no longer for a unit of many parameters. Of several changes of one parameter between
 // two gestures the last is heard, and those that lie the granularity or more apart are all heard, in the order of
 // telling. When more than 1,024 of them wait, those beyond are heard once for each parameter, with the value that it
-// has then; of gestures each is heard, those beyond 1,024 by parameter. Listeners are made, changed and disposed of on
-// their loop's thread. A unit may go before them: nothing more is heard of it, and it must not be named in a call any
-// more, so that what listens to it is only disposed of.
+// has then; of gestures each is heard, those beyond 1,024 by parameter. Listeners are made, changed and disposed of
+// on their loop's thread. A unit may go before them: nothing more is heard of it, and it must not be named in a call
+// any more, so that what listens to it is only disposed of.
 //
 // This host listens to gestures and to values in the global scope. A unit that changes a value by itself notifies;
 // one that is set from outside does not: after SetParameter, a preset or class info the host tells of it, of the
