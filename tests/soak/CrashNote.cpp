@@ -30,7 +30,7 @@ void OnSignal(int signal)
 
 } // namespace
 
-CrashNote::CrashNote(int descriptor, std::uint64_t seed) : mSeed(seed)
+CrashNote::CrashNote(int descriptor, std::uint64_t randomStart) : mRandomStart(randomStart)
 {
     sDescriptor = descriptor;
     struct sigaction action
@@ -46,8 +46,8 @@ CrashNote::CrashNote(int descriptor, std::uint64_t seed) : mSeed(seed)
 
 void CrashNote::Step(const std::string& name, const char* operation, unsigned long number)
 {
-    const std::string text =
-        name + ", " + operation + ", operation " + std::to_string(number) + ", seed " + std::to_string(mSeed) + "\n";
+    const std::string text = name + ", " + operation + ", operation " + std::to_string(number) + ", random start " +
+                             std::to_string(mRandomStart) + "\n";
     sLength = std::min(text.size(), sText.size());
     std::copy_n(text.begin(), sLength, sText.begin());
     alarm(kLongestSeconds);

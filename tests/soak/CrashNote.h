@@ -11,14 +11,14 @@ class CrashNote
 {
 public:
     /// `descriptor` gets the sentence.
-    CrashNote(int descriptor, std::uint64_t seed);
+    CrashNote(int descriptor, std::uint64_t randomStart);
 
     /// To be called ahead of each step; a step that takes minutes counts as a hang.
     void Step(const std::string& name, const char* operation, unsigned long number);
     void Done();
 
 private:
-    std::uint64_t mSeed;
+    std::uint64_t mRandomStart;
 };
 
 } // namespace soak

@@ -7,11 +7,11 @@
 namespace soak
 {
 
-/// All that a run decides by chance, from one seed: the same seed gives the same run.
+/// All that a run decides by chance, from one start: the same start gives the same run.
 class Dice
 {
 public:
-    explicit Dice(std::uint64_t seed) : mEngine(seed) {}
+    explicit Dice(std::uint64_t randomStart) : mEngine(randomStart) {}
 
     std::size_t Below(std::size_t count) { return static_cast<std::size_t>(mEngine() % count); }
     int Between(int least, int most)

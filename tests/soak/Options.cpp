@@ -15,13 +15,13 @@ namespace
 [[noreturn]] void EndWithHelp()
 {
     std::cerr
-        << "usage: zeb_soak [--seconds N] [--operations N] [--seed N] [--every SECONDS] [--only TEXT]\n"
+        << "usage: zeb_soak [--seconds N] [--operations N] [--random-start N] [--every SECONDS] [--only TEXT]\n"
            "                [--without-editors] [--without-editor-of PART OF PATH]... [--json FILE] [--log FILE]\n"
            "The folders are those of VST3_PATH, VST_PATH and AUDIO_COMPONENT_PATH.\n";
     std::exit(2);
 }
 
-std::uint64_t NewSeed()
+std::uint64_t NewRandomStart()
 {
     return std::random_device()() + 1ULL;
 }
@@ -37,7 +37,7 @@ void Take(Options& options, int letter)
         options.operations = std::strtoul(optarg, nullptr, 10);
         break;
     case 's':
-        options.seed = std::strtoull(optarg, nullptr, 10);
+        options.randomStart = std::strtoull(optarg, nullptr, 10);
         break;
     case 'e':
         options.everySeconds = std::atoi(optarg);
@@ -68,7 +68,7 @@ Options ReadOptions(int argc, char** argv)
 {
     const option known[] = {{"seconds", required_argument, nullptr, 't'},
                             {"operations", required_argument, nullptr, 'n'},
-                            {"seed", required_argument, nullptr, 's'},
+                            {"random-start", required_argument, nullptr, 's'},
                             {"every", required_argument, nullptr, 'e'},
                             {"only", required_argument, nullptr, 'o'},
                             {"without-editors", no_argument, nullptr, 'w'},
@@ -85,9 +85,9 @@ Options ReadOptions(int argc, char** argv)
     {
         EndWithHelp();
     }
-    if (options.seed == 0)
+    if (options.randomStart == 0)
     {
-        options.seed = NewSeed();
+        options.randomStart = NewRandomStart();
     }
     return options;
 }

@@ -10,9 +10,9 @@ namespace soak
 struct Options
 {
     int seconds = 3600;
-    unsigned long operations = 0; // ends the run too, so that a seed can be repeated to the end; 0 for no such end
-    std::uint64_t seed = 0;       // 0 for a new one
-    int everySeconds = 60;        // between two lines
+    unsigned long operations = 0;  // ends the run too, so that a start can be repeated to the end; 0 for no such end
+    std::uint64_t randomStart = 0; // 0 for a new one
+    int everySeconds = 60;         // between two lines
     bool withEditors = true;
     std::vector<std::string> withoutEditorOf; // parts of paths
     std::string only;                         // a part of the names

@@ -9,7 +9,7 @@ namespace soak
 std::uint64_t ProbeSound(const Subject& subject, ProcessThread& thread)
 {
     constexpr std::size_t kBlocks = 48;
-    constexpr std::uint32_t kNoiseSeed = 20250101;
+    constexpr std::uint32_t kNoiseStart = 20250101;
     constexpr unsigned int kSettleMs = 10;
     const std::unique_ptr<Specimen> specimen = CreateSpecimen(subject);
     zebaudiofilterhost::AudioFilter& filter = *specimen->Filter();
@@ -23,7 +23,7 @@ std::uint64_t ProbeSound(const Subject& subject, ProcessThread& thread)
         u"Main", zebaudiofilterhost::AudioFilterBusDescription::kBusType_Main);
     specimen->Configure(setup);
     Settle(kSettleMs);
-    return specimen->Process(std::vector<int>(kBlocks, setup.blockSize), kNoiseSeed, thread);
+    return specimen->Process(std::vector<int>(kBlocks, setup.blockSize), kNoiseStart, thread);
 }
 
 } // namespace soak

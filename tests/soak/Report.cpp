@@ -109,7 +109,7 @@ void WriteJson(const Options& options, const Findings& findings)
     {
         return;
     }
-    const Json document = {{"seed", options.seed},
+    const Json document = {{"randomStart", options.randomStart},
                            {"seconds", findings.seconds},
                            {"passed", findings.Passed()},
                            {"operations", TallyJson(findings.tally)},

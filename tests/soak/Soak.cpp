@@ -42,8 +42,8 @@ bool Findings::Passed() const
 Soak::Soak(const Options& options, const Console& console, const std::filesystem::path& folder)
     : mOptions(options)
     , mConsole(console)
-    , mNote(console.Descriptor(), options.seed)
-    , mDice(options.seed)
+    , mNote(console.Descriptor(), options.randomStart)
+    , mDice(options.randomStart)
     , mOperations(mDice, mThread, folder)
     , mStart(std::chrono::steady_clock::now())
 {
@@ -54,8 +54,9 @@ Findings Soak::Run()
     mNote.Step("the plug-ins", "scan", 0);
     mFindings.subjects = FindSubjects(mOptions.only, mOptions.withoutEditorOf);
     mFindings.ledger = Ledger(NamesOf(mFindings.subjects));
-    mConsole.Say("soak: seed " + std::to_string(mOptions.seed) + ", " + std::to_string(mFindings.subjects.size()) +
-                 " effects, " + std::to_string(mOptions.seconds) + " s after each was used once");
+    mConsole.Say("soak: random start " + std::to_string(mOptions.randomStart) + ", " +
+                 std::to_string(mFindings.subjects.size()) + " effects, " + std::to_string(mOptions.seconds) +
+                 " s after each was used once");
     mFindings.checks.push_back(JudgeSubjects(EffectCount()));
     if (mFindings.Passed())
     {

@@ -131,7 +131,7 @@ void Specimen::Configure(const Setup& setup)
     mIsRunning = true;
 }
 
-std::uint64_t Specimen::Process(const std::vector<int>& sizes, std::uint32_t noiseSeed, ProcessThread& thread)
+std::uint64_t Specimen::Process(const std::vector<int>& sizes, std::uint32_t noiseStart, ProcessThread& thread)
 {
     std::uint64_t hash = 0xCBF29CE484222325;
     const int count = WidestSide(*mFilter, mSetup);
@@ -140,7 +140,7 @@ std::uint64_t Specimen::Process(const std::vector<int>& sizes, std::uint32_t noi
     thread.Run(
         [&]
         {
-            std::minstd_rand random(noiseSeed);
+            std::minstd_rand random(noiseStart);
             long long position = 0;
             for (const int frames : sizes)
             {

@@ -42,7 +42,7 @@ public:
 
     /// Sends noise through the filter, on the process thread, in blocks of these sizes. Returns a hash of all that
     /// comes out.
-    std::uint64_t Process(const std::vector<int>& sizes, std::uint32_t noiseSeed, ProcessThread& thread);
+    std::uint64_t Process(const std::vector<int>& sizes, std::uint32_t noiseStart, ProcessThread& thread);
 
     /// Both do nothing where there is nothing to do.
     void OpenEditor();

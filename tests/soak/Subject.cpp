@@ -82,7 +82,7 @@ std::vector<Subject> FindSubjects(const std::string& only, const std::vector<std
             subjects.push_back(std::move(subject));
         }
     }
-    // The order of a folder's entries must not change what a seed gives.
+    // The order of a folder's entries must not change what a random start gives.
     std::sort(subjects.begin(), subjects.end(), [](const Subject& a, const Subject& b) { return a.id < b.id; });
     return subjects;
 }

@@ -63,7 +63,8 @@ int main(int argc, char** argv)
     }
     catch (const std::exception& fault)
     {
-        console.Say(std::string("soak: FAILED: ") + fault.what() + ", seed " + std::to_string(options.seed));
+        console.Say(std::string("soak: FAILED: ") + fault.what() + ", random start " +
+                    std::to_string(options.randomStart));
     }
     zebaudiofilterhost::Terminate();
     // What plug-ins do while they are taken down says nothing more.

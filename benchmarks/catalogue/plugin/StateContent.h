@@ -12,12 +12,12 @@ namespace effects::state
 inline std::vector<char> Content(std::size_t size)
 {
     std::vector<char> bytes(size);
-    std::uint32_t seed = 1;
+    std::uint32_t state = 1;
     std::generate(bytes.begin(), bytes.end(),
-                  [&seed]
+                  [&state]
                   {
-                      seed = seed * 1664525U + 1013904223U;
-                      return static_cast<char>(seed >> 24U);
+                      state = state * 1664525U + 1013904223U;
+                      return static_cast<char>(state >> 24U);
                   });
     return bytes;
 }
