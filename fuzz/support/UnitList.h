@@ -30,4 +30,17 @@ inline Bytes BytesOf(const CFOwner& data)
     return {CFDataGetBytePtr(owned), static_cast<std::size_t>(CFDataGetLength(owned))};
 }
 
+// As XML: in binary form the same list has several texts, since an empty value that stands in it twice is written
+// once or twice as memory has it.
+inline bool AreSameLists(CFPropertyListRef one, CFPropertyListRef other)
+{
+    const auto print = [](CFPropertyListRef list)
+    {
+        return CFOwner(CFPropertyListCreateData(nullptr, list, kCFPropertyListXMLFormat_v1_0, 0, nullptr));
+    };
+    const CFOwner text = print(one);
+    const CFOwner otherText = print(other);
+    return text && otherText && CFEqual(text.get(), otherText.get()) != 0;
+}
+
 } // namespace zebfuzz
