@@ -55,7 +55,7 @@ void PluginModuleInfoManager::AddPluginModuleInfo(PluginInfoPtr info)
     {
         return;
     }
-    mRecords->Add(info);
+    mRecords->Add(std::move(info));
     mPluginInfosChangedSignal();
 }
 
@@ -97,6 +97,7 @@ bool PluginModuleInfoManager::IsPluginEnabled(const PluginLocator& locator, bool
     return info ? info->IsEnabled() : !unknownIsDisabled;
 }
 
+// NOLINTNEXTLINE(readability-make-member-function-const): changes a record of the catalogue
 void PluginModuleInfoManager::SetPluginEnabled(const PluginLocator& locator, bool enabled)
 {
     if (const PluginInfoPtr info = FindPluginInfo(locator))

@@ -6,7 +6,7 @@
 namespace zebaudiofilterhost
 {
 
-void PluginModuleRecords::Add(const Pointer& record)
+void PluginModuleRecords::Add(Pointer record)
 {
     const std::size_t arrival = mNextArrival++;
     const PluginLocator& locator = record->GetLocator();
@@ -20,7 +20,7 @@ void PluginModuleRecords::Add(const Pointer& record)
         place.mapped() = Place{record, arrival};
         mPlaces.insert(std::move(place));
     }
-    mInOrder.push_back(record);
+    mInOrder.push_back(std::move(record));
     mArrivals.push_back(arrival);
 }
 

@@ -22,7 +22,7 @@ public:
     using Vector = std::vector<Pointer>;
 
     // Takes the place of the record of the same locator, and stands last.
-    void Add(const Pointer& record);
+    void Add(Pointer record);
     // Null if there is none.
     Pointer Find(const PluginLocator& locator) const;
     // False if there is none.

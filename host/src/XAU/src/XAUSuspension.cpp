@@ -26,6 +26,7 @@ AudioBufferList& XAUAudioFilter::BufferList::Get() const
     return *reinterpret_cast<AudioBufferList*>(mMemory.get());
 }
 
+// NOLINTNEXTLINE(readability-make-member-function-const): changes the list that it owns
 void XAUAudioFilter::BufferList::Reset()
 {
     AudioBufferList& list = Get();
