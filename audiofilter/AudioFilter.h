@@ -435,6 +435,14 @@ protected:
     /// even when nobody listens, can be left out. [any]
     bool CanAutomationBeHeard() const { return mAutomationCanBeHeard.load(std::memory_order_relaxed); }
 
+    /// Fires the automated-parameter signal, if it can be heard. To ask for the signal instead would count as asking
+    /// to hear it. [any]
+    void FireAutomatedParameterChange(int index, float value)
+    {
+        if (CanAutomationBeHeard())
+            mAutomatedParameterChangeSignal(index, value);
+    }
+
     /// Rewrites the render arrays in place, so that running audio follows the maps; arrays whose size has changed
     /// wait for Resume. [main]
     void UpdateChannelMapArraysForRendering();

@@ -14,8 +14,7 @@ int AudioFilter::GetParameterCount() const
 void AudioFilter::SetParameterAutomated(int index, float value)
 {
     SetParameter(index, value);
-    if (CanAutomationBeHeard())
-        mAutomatedParameterChangeSignal(index, value);
+    FireAutomatedParameterChange(index, value);
 }
 
 void AudioFilter::SetParameter(int, float)

@@ -25,7 +25,7 @@ tresult PLUGIN_API VST3AudioFilter::performEdit(ParamID id, Steinberg::Vst::Para
 {
     const int index = CanAutomationBeHeard() ? FindParameterIndex(id) : -1;
     if (index >= 0)
-        GetAutomatedParameterChangeSignal()(index, static_cast<float>(value));
+        FireAutomatedParameterChange(index, static_cast<float>(value));
     mInputTransfer.AddChange(id, value, 0);
     return kResultOk;
 }

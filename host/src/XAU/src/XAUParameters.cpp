@@ -160,7 +160,7 @@ void XAUAudioFilter::EventListenerProc(void* /*object*/, const AudioUnitEvent* e
     {
         const auto found = mIndexByParameterID.find(event->mArgument.mParameter.mParameterID);
         if (found != mIndexByParameterID.end())
-            GetAutomatedParameterChangeSignal()(found->second, GetParameter(found->second));
+            FireAutomatedParameterChange(found->second, GetParameter(found->second));
     }
 }
 
