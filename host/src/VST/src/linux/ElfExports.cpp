@@ -225,11 +225,14 @@ bool ElfExports::FindByHash(std::string_view name)
     const std::uint64_t buckets = *mTables.mHash + sizeof(Header);
     const std::uint64_t chains = buckets + header->mBuckets * std::uint64_t{sizeof(std::uint32_t)};
     auto index = ReadWord(buckets, Hash(name) % header->mBuckets);
-    // A chain that bites its tail is left when it has become too long.
-    for (std::uint64_t steps = 0; index && *index != STN_UNDEF && steps < kMaxChainLength; ++steps)
+    // A chain that bites its tail comes past a mark that is moved at each power of two.
+    std::uint32_t mark = STN_UNDEF;
+    for (std::uint64_t steps = 1; index && *index != mark && *index != STN_UNDEF && steps <= kMaxChainLength; ++steps)
     {
         if (IsFunction(*index, name))
             return true;
+        if (std::has_single_bit(steps))
+            mark = *index;
         index = ReadWord(chains, *index);
     }
     return false;
