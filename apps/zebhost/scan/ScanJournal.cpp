@@ -38,7 +38,7 @@ std::string NewVisit()
 
 } // namespace
 
-ScanJournal::ScanJournal(Catalogue& catalogue) : mCatalogue(catalogue)
+ScanJournal::ScanJournal(Catalogue& catalogue) : mCatalogue(catalogue), mLastSave(std::chrono::steady_clock::now())
 {
 }
 

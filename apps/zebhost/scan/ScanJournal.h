@@ -37,7 +37,7 @@ private:
     BinaryStamps::Entry ResultOf(const zebaudiofilterhost::PluginLocator& locator, const std::string& problem) const;
 
     Catalogue& mCatalogue;
-    std::chrono::steady_clock::time_point mLastSave; // of the files; at first never
+    std::chrono::steady_clock::time_point mLastSave; // of the files, or the start
     // Of the plug-in at hand:
     std::uintmax_t mAnnouncement = 0;
     BinaryStamp mBinary;
