@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <exception>
+#include <forward_list>
 #include <memory>
 #include <optional>
 #include <type_traits>
@@ -25,22 +26,6 @@ constexpr int kLargestSize = 1 << 28;
 std::u8string_view View(const XML_Char* text)
 {
     return text == nullptr ? std::u8string_view() : std::u8string_view(reinterpret_cast<const char8_t*>(text));
-}
-
-// Names arrive as "local", "uri\nlocal" or "uri\nlocal\nprefix".
-XmlName SplitName(const XML_Char* expatName)
-{
-    const std::u8string_view whole = View(expatName);
-    const std::size_t first = whole.find(char8_t{kNameSeparator});
-    if (first == std::u8string_view::npos)
-        return {UTF8String(whole), {}, whole};
-    const std::u8string_view uri = whole.substr(0, first);
-    const std::u8string_view rest = whole.substr(first + 1);
-    const std::size_t second = rest.find(char8_t{kNameSeparator});
-    const std::u8string_view local = rest.substr(0, second);
-    if (second == std::u8string_view::npos)
-        return {UTF8String(local), uri, local};
-    return {UTF8String(rest.substr(second + 1)).append(u8":").append(local), uri, local};
 }
 
 // One run of Expat over a document. Expat is C: nothing may be thrown through it, so what an event throws waits here.
@@ -126,6 +111,23 @@ private:
         XML_StopParser(mParser.get(), XML_FALSE);
     }
 
+    // Names arrive as "local", "uri\nlocal" or "uri\nlocal\nprefix". Good until the next event.
+    XmlName SplitName(const XML_Char* expatName)
+    {
+        const std::u8string_view whole = View(expatName);
+        const std::size_t first = whole.find(char8_t{kNameSeparator});
+        if (first == std::u8string_view::npos)
+            return {whole, {}, whole};
+        const std::u8string_view uri = whole.substr(0, first);
+        const std::u8string_view rest = whole.substr(first + 1);
+        const std::size_t second = rest.find(char8_t{kNameSeparator});
+        const std::u8string_view local = rest.substr(0, second);
+        if (second == std::u8string_view::npos)
+            return {local, uri, local};
+        UTF8String& qualified = mQualifiedNames.emplace_front(rest.substr(second + 1));
+        return {qualified.append(u8":").append(local), uri, local};
+    }
+
     // Runs one event. Expat may still deliver one or two after it was stopped: they are dropped.
     template <typename Event>
     static void Guard(void* userData, Event event) noexcept
@@ -136,6 +138,7 @@ private:
         try
         {
             event(run);
+            run.mQualifiedNames.clear();
         }
         catch (...)
         {
@@ -153,8 +156,8 @@ private:
                       return run.Refuse("elements nested too deep");
                   run.mAttributes.clear();
                   for (const XML_Char** pair = attributes; *pair != nullptr; pair += 2)
-                      run.mAttributes.push_back({SplitName(pair[0]).mQualified, View(pair[1])});
-                  if (!run.mEvents.OnStartElement(SplitName(name), run.mAttributes))
+                      run.mAttributes.push_back({run.SplitName(pair[0]).mQualified, View(pair[1])});
+                  if (!run.mEvents.OnStartElement(run.SplitName(name), run.mAttributes))
                       run.Refuse("unexpected element");
               });
     }
@@ -165,7 +168,7 @@ private:
               [name](Run& run)
               {
                   --run.mDepth;
-                  if (!run.mEvents.OnEndElement(SplitName(name)))
+                  if (!run.mEvents.OnEndElement(run.SplitName(name)))
                       run.Refuse("unexpected content of an element");
               });
     }
@@ -231,6 +234,7 @@ private:
     XmlEvents& mEvents;
     std::unique_ptr<std::remove_pointer_t<XML_Parser>, FreeParser> mParser;
     std::vector<XmlAttribute> mAttributes;
+    std::forward_list<UTF8String> mQualifiedNames; // of the event that runs, those that had to be put together
     unsigned int mDepth = 0;
     const char* mRefusal = nullptr;
     std::exception_ptr mThrown;

@@ -11,7 +11,7 @@ namespace
 
 constexpr std::size_t kFewEntries = 16;
 constexpr std::size_t kFirstCapacity = 12; // A section of the settings file fits
-constexpr std::size_t kNone = static_cast<std::size_t>(-1);
+constexpr std::size_t kNone = utility::PositionTable::kNone;
 
 std::size_t Hash(std::u8string_view key)
 {
@@ -22,16 +22,11 @@ std::size_t Hash(std::u8string_view key)
 
 std::size_t PropList::Entries::Position(std::u8string_view key) const
 {
-    if (mIndex.empty())
-    {
-        const auto found =
-            std::find_if(mEntries.begin(), mEntries.end(), [key](const Entry& entry) { return entry.mKey == key; });
-        return found == mEntries.end() ? kNone : static_cast<std::size_t>(found - mEntries.begin());
-    }
-    const auto [begin, end] = mIndex.equal_range(Hash(key));
+    if (!mIndex.IsEmpty())
+        return mIndex.Find(Hash(key), [this, key](std::size_t position) { return mEntries[position].mKey == key; });
     const auto found =
-        std::find_if(begin, end, [this, key](const auto& indexed) { return mEntries[indexed.second].mKey == key; });
-    return found == end ? kNone : found->second;
+        std::find_if(mEntries.begin(), mEntries.end(), [key](const Entry& entry) { return entry.mKey == key; });
+    return found == mEntries.end() ? kNone : static_cast<std::size_t>(found - mEntries.begin());
 }
 
 const PropList::Entries::Value* PropList::Entries::Find(const UTF8String& key) const
@@ -65,8 +60,8 @@ void PropList::Entries::Append(const UTF8String& key, Value&& value)
     mEntries.push_back(Entry{key, std::move(value)});
     try
     {
-        if (!mIndex.empty())
-            mIndex.emplace(Hash(mEntries.back().mKey), mEntries.size() - 1);
+        if (!mIndex.IsEmpty())
+            mIndex.Insert(Hash(mEntries.back().mKey), mEntries.size() - 1);
         else if (mEntries.size() > kFewEntries)
             BuildIndex();
     }
@@ -79,10 +74,10 @@ void PropList::Entries::Append(const UTF8String& key, Value&& value)
 
 void PropList::Entries::BuildIndex()
 {
-    decltype(mIndex) index;
+    utility::PositionTable index;
     for (std::size_t position = 0; position < mEntries.size(); ++position)
-        index.emplace(Hash(mEntries[position].mKey), position);
-    mIndex.swap(index);
+        index.Insert(Hash(mEntries[position].mKey), position);
+    std::swap(mIndex, index);
 }
 
 void PropList::Entries::Remove(const UTF8String& key)
@@ -92,14 +87,14 @@ void PropList::Entries::Remove(const UTF8String& key)
         return;
     const Value doomed = std::move(mEntries[position].mValue); // The key may be part of what it names
     mEntries.erase(mEntries.begin() + static_cast<std::ptrdiff_t>(position));
-    mIndex.clear();
+    mIndex.Clear();
     if (mEntries.size() > kFewEntries)
         BuildIndex();
 }
 
 void PropList::Entries::Clear()
 {
-    mIndex.clear();
+    mIndex.Clear();
     mEntries.clear();
 }
 

@@ -100,6 +100,11 @@ bool SetFloats(PropList& list, const UTF8String& key, UTF8String& whole)
     return true;
 }
 
+bool IsBlank(char8_t unit)
+{
+    return unit == u8' ' || unit == u8'\t' || unit == u8'\r' || unit == u8'\n';
+}
+
 const xml::XmlAttribute* Find(const std::vector<xml::XmlAttribute>& attributes, std::u8string_view name)
 {
     const auto found = std::find_if(attributes.begin(), attributes.end(),
@@ -141,7 +146,7 @@ bool PropListReader::OnEndElement(const xml::XmlName& /*name*/)
 bool PropListReader::OnCharacters(std::u8string_view text)
 {
     if (mOpenValue == nullptr)
-        return text.find_first_not_of(kBlanks) == std::u8string_view::npos;
+        return std::all_of(text.begin(), text.end(), IsBlank);
     mText += text;
     return true;
 }

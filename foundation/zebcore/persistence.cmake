@@ -23,6 +23,7 @@ set(ZEB_PERSISTENCE_SOURCES
     zebcore/NativePath.cpp
     zebcore/ParseXml.cpp
     zebcore/Paths.cpp
+    zebcore/PositionTable.cpp
     zebcore/PropList.cpp
     zebcore/PropListEntries.cpp
     zebcore/PropListReader.cpp

@@ -114,13 +114,8 @@ void AudioFilterDescriptorManager::ReadExternalComponentDescriptors(const PropLi
     DescriptorIndex index = merge ? mDescriptorIndex : BuildIndex(descriptors);
     int count = 0;
     list.GetValue(kKey_NumDescriptors, count);
-    for (const std::size_t number : PresentIndices(list, kKey_Descriptor, count))
+    for (const PropList* const section : PresentSubLists(list, kKey_Descriptor, count))
     {
-        const PropList* const section = list.GetSubList(IndexedKey(kKey_Descriptor, number));
-        if (section == nullptr)
-        {
-            continue;
-        }
         const DescriptorPtr descriptor(new AudioFilterDescriptor(*section));
         if (index.emplace(descriptor->GetUniqueID(), descriptor).second)
         {

@@ -36,35 +36,54 @@ std::optional<std::size_t> ParseIndex(std::u8string_view key, std::u8string_view
     return parsed ? std::optional<std::size_t>(index) : std::nullopt;
 }
 
-class IndexCollector : public zebcore::proplist::PropListVisitor
+// The entries of a series in the order of their indices.
+class SeriesCollector : public zebcore::proplist::PropListVisitor
 {
 public:
-    IndexCollector(const UTF8String& base, std::size_t limit) : mBase(base), mLimit(limit) {}
+    struct Entry
+    {
+        std::size_t mIndex;
+        const PropList* mSubList; // null for a value
+    };
+
+    SeriesCollector(const UTF8String& base, std::size_t limit) : mBase(base), mLimit(limit) {}
 
     using PropListVisitor::VisitValue;
-    void VisitValue(const UTF8String& key, const UTF16String&) override { Collect(key); }
-    void VisitSubList(const UTF8String& key, const PropList&) override { Collect(key); }
+    void VisitValue(const UTF8String& key, const UTF16String&) override { Collect(key, nullptr); }
+    void VisitSubList(const UTF8String& key, const PropList& subList) override { Collect(key, &subList); }
 
-    std::vector<std::size_t> TakeSorted()
+    std::vector<Entry> TakeSorted()
     {
-        std::sort(mIndices.begin(), mIndices.end());
-        return std::move(mIndices);
+        std::sort(mEntries.begin(), mEntries.end(),
+                  [](const Entry& left, const Entry& right) { return left.mIndex < right.mIndex; });
+        return std::move(mEntries);
     }
 
 private:
-    void Collect(const UTF8String& key)
+    void Collect(const UTF8String& key, const PropList* subList)
     {
         const std::optional<std::size_t> index = ParseIndex(key, mBase);
         if (index && *index < mLimit)
         {
-            mIndices.push_back(*index);
+            mEntries.push_back({*index, subList});
         }
     }
 
     const UTF8String& mBase;
     std::size_t mLimit;
-    std::vector<std::size_t> mIndices;
+    std::vector<Entry> mEntries;
 };
+
+std::vector<SeriesCollector::Entry> CollectSeries(const PropList& list, const UTF8String& base, int count)
+{
+    if (count < 1)
+    {
+        return {};
+    }
+    SeriesCollector collector(base, static_cast<std::size_t>(count));
+    list.Visit(collector);
+    return collector.TakeSorted();
+}
 
 } // namespace
 
@@ -77,13 +96,25 @@ UTF8String IndexedKey(const UTF8String& base, std::size_t index)
 
 std::vector<std::size_t> PresentIndices(const PropList& list, const UTF8String& base, int count)
 {
-    if (count < 1)
+    std::vector<std::size_t> indices;
+    for (const SeriesCollector::Entry& entry : CollectSeries(list, base, count))
     {
-        return {};
+        indices.push_back(entry.mIndex);
     }
-    IndexCollector collector(base, static_cast<std::size_t>(count));
-    list.Visit(collector);
-    return collector.TakeSorted();
+    return indices;
+}
+
+std::vector<const PropList*> PresentSubLists(const PropList& list, const UTF8String& base, int count)
+{
+    std::vector<const PropList*> subLists;
+    for (const SeriesCollector::Entry& entry : CollectSeries(list, base, count))
+    {
+        if (entry.mSubList != nullptr)
+        {
+            subLists.push_back(entry.mSubList);
+        }
+    }
+    return subLists;
 }
 
 } // namespace zebaudiofilterhost

@@ -15,4 +15,7 @@ UTF8String IndexedKey(const UTF8String& base, std::size_t index);
 // by the entries that are there, whatever a damaged file gives as its count.
 std::vector<std::size_t> PresentIndices(const PropList& list, const UTF8String& base, int count);
 
+// The same for a series of sub-lists: these themselves, in the order of their indices. They belong to the list.
+std::vector<const PropList*> PresentSubLists(const PropList& list, const UTF8String& base, int count);
+
 } // namespace zebaudiofilterhost

@@ -60,12 +60,9 @@ std::vector<PluginModuleInfoManager::PluginInfoPtr> ReadRecords(const PropList& 
     int count = 0;
     list.GetValue(kKey_NumPluginInfos, count);
     std::vector<PluginModuleInfoManager::PluginInfoPtr> infos;
-    for (const std::size_t index : PresentIndices(list, kKey_PluginInfo, count))
+    for (const PropList* const section : PresentSubLists(list, kKey_PluginInfo, count))
     {
-        if (const PropList* const section = list.GetSubList(IndexedKey(kKey_PluginInfo, index)))
-        {
-            infos.emplace_back(new PluginModuleInfo(*section));
-        }
+        infos.emplace_back(new PluginModuleInfo(*section));
     }
     return infos;
 }
@@ -118,12 +115,9 @@ void PluginModuleInfoManager::ReadDirectories(const PropList& list) const
 {
     int count = 0;
     list.GetValue(kKey_NumTechInfos, count);
-    for (const std::size_t index : PresentIndices(list, kKey_TechInfo, count))
+    for (const PropList* const section : PresentSubLists(list, kKey_TechInfo, count))
     {
-        if (const PropList* const section = list.GetSubList(IndexedKey(kKey_TechInfo, index)))
-        {
-            ReadTechnologyDirectories(*section);
-        }
+        ReadTechnologyDirectories(*section);
     }
 }
 

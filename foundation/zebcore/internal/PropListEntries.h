@@ -1,12 +1,12 @@
 #pragma once
 
 #include "foundation/zebcore/PropList.h"
+#include "foundation/zebcore/internal/PositionTable.h"
 
 #include <cstddef>
 #include <list>
 #include <memory>
 #include <string_view>
-#include <unordered_map>
 #include <variant>
 #include <vector>
 
@@ -44,7 +44,7 @@ private:
     void BuildIndex();
 
     std::vector<Entry> mEntries;
-    std::unordered_multimap<std::size_t, std::size_t> mIndex; // from hash to position; empty for a short list
+    utility::PositionTable mIndex; // empty for a short list
 };
 
 } // namespace zebcore::proplist

@@ -11,14 +11,14 @@ namespace zebcore::xml
 // A name in an XML document, in UTF-8.
 struct XmlName
 {
-    UTF8String mQualified;   // as written
-    std::u8string_view mUri; // empty outside of all namespaces
+    std::u8string_view mQualified; // as written
+    std::u8string_view mUri;       // empty outside of all namespaces
     std::u8string_view mLocal;
 };
 
 struct XmlAttribute
 {
-    UTF8String mName; // as written
+    std::u8string_view mName; // as written
     std::u8string_view mValue;
 };
 
