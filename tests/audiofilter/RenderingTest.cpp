@@ -342,6 +342,56 @@ TEST_F(RenderingTest, QueuedParametersComeBeforeTheBlock)
     EXPECT_EQ(mFlags.Value(), 0U);
 }
 
+// A filter that throws at every change of its parameter 1, having changed how its thread computes.
+struct ParameterThrower : public RecordingFilter
+{
+    ParameterThrower() : RecordingFilter({}, {}) {}
+    void SetParameter(int index, float value) override
+    {
+        RecordingFilter::SetParameter(index, value);
+        if (index == 1)
+        {
+            testing::SetFloatingPointWord(testing::GetFloatingPointWord() ^ testing::kFlushAndRoundDown);
+            throw std::runtime_error("parameter");
+        }
+    }
+};
+
+// On the process thread while the filter runs, on the main thread while it does not.
+TEST_F(RenderingTest, AQueuedParameterThatThrowsComesOnceAndIsNotKept)
+{
+    const testing::FloatingPointRestorer restorer;
+    bool destroyed = false;
+    boost::intrusive_ptr<ParameterThrower> filter(new ParameterThrower);
+    filter->mDestroyed = &destroyed;
+    const auto process = [&]
+    {
+        filter->ProcessWithMapping(nullptr, nullptr, 0, ChannelFlags(), mFlags);
+    };
+    for (const bool running : {true, false})
+    {
+        filter->mParameterCalls.clear();
+        running ? filter->Resume() : filter->Suspend();
+        for (const int index : {0, 1, 2})
+            filter->PostSetParameter(index, 0.5F);
+        const auto mode = testing::GetFloatingPointMode();
+        if (running)
+            EXPECT_THROW(process(), std::runtime_error);
+        else
+            EXPECT_THROW(filter->FlushMessageQueue(), std::runtime_error);
+        EXPECT_EQ(filter->mParameterCalls.size(), 2U) << running;
+        if (running)
+        {
+            EXPECT_EQ(testing::GetFloatingPointMode(), mode);
+            process();
+        }
+        filter->FlushMessageQueue();
+        EXPECT_EQ(filter->mParameterCalls.size(), 3U) << running;
+    }
+    filter.reset();
+    EXPECT_TRUE(destroyed) << "no message holds it";
+}
+
 // A filter that changes how its thread computes, divides by zero, and leaves it at that.
 struct ModeChanger : public RecordingFilter
 {

@@ -6,6 +6,7 @@
 #include <gtest/gtest.h>
 
 #include <functional>
+#include <stdexcept>
 #include <thread>
 
 namespace zebaudiofilterhost
@@ -168,6 +169,56 @@ TEST_F(ProcessMessageHandlerTest, AStageMayPostAndFlush)
     Post(20);
     mHandler.PumpFromMainThread();
     EXPECT_EQ(WithoutDestructions().size(), 21U);
+}
+
+// Fails in one of its stages, as often as it is run.
+class ThrowingMessage : public RecordingMessage
+{
+public:
+    ThrowingMessage(MessageLog& log, int number, bool onProcessThread)
+        : RecordingMessage(log, number), mOnProcessThread(onProcessThread)
+    {
+    }
+
+    bool ExecuteOnProcessThread() override
+    {
+        RecordingMessage::ExecuteOnProcessThread();
+        if (mOnProcessThread)
+            throw std::runtime_error("process stage");
+        return false;
+    }
+
+    bool ExecuteOnMainThread() override
+    {
+        RecordingMessage::ExecuteOnMainThread();
+        throw std::runtime_error("main stage");
+    }
+
+private:
+    const bool mOnProcessThread;
+};
+
+TEST_F(ProcessMessageHandlerTest, AStageThatThrowsIsOverAndHoldsUpNobody)
+{
+    struct Case
+    {
+        bool onProcessThread;
+        MessageLog byTheThrow;
+        MessageLog inTheEnd;
+    };
+    for (const Case& each : {Case{true, {"p0", "p1"}, {"p0", "p1", "p2", "m2"}},
+                             Case{false, {"p0", "p1", "p2", "m1"}, {"p0", "p1", "p2", "m1", "m2"}}})
+    {
+        mLog.clear();
+        Post(0);
+        mHandler.Post(boost::intrusive_ptr<Message>(new ThrowingMessage(mLog, 1, each.onProcessThread)));
+        Post(2)->mRefusalsOnProcessThread = 1;
+        EXPECT_THROW(mHandler.PumpFromMainThread(), std::runtime_error);
+        EXPECT_EQ(WithoutDestructions(), each.byTheThrow);
+        mHandler.PumpFromMainThread();
+        EXPECT_EQ(WithoutDestructions(), each.inTheEnd);
+        EXPECT_EQ(mLog.size(), each.inTheEnd.size() + 3) << "all three are gone";
+    }
 }
 
 // The owner of a handler, held by a message in its own queue.

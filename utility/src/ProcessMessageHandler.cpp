@@ -91,7 +91,16 @@ void ProcessMessageHandler::RunMainStages()
         if (mMessages[i]->GetState() != Message::kState_ProcessDone)
             continue;
         const boost::intrusive_ptr<Message> message = mMessages[i];
-        const bool done = message->ExecuteOnMainThread();
+        bool done = true;
+        try
+        {
+            done = message->ExecuteOnMainThread();
+        }
+        catch (...)
+        {
+            message->SetState(Message::kState_Finished); // Else each later pump would run it again, and end there
+            throw;
+        }
         message->SetState(done ? Message::kState_Finished : Message::kState_Pending);
         if (!done)
             mFirstToLook = 0; // Not its index, which a flush in the stage may have changed
