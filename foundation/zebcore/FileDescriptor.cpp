@@ -4,6 +4,8 @@
 #include "foundation/zebcore/NativePath.h"
 #include "foundation/zebcore/internal/FileSystemCalls.h"
 
+#include <fcntl.h>
+
 #include <cerrno>
 #include <utility>
 
@@ -12,6 +14,8 @@ namespace zebcore::filesupport
 
 namespace
 {
+
+constexpr mode_t kReadableAndWritable = 0666; // less what the user masks
 
 template <typename Call>
 auto RepeatInterrupted(Call call)
@@ -34,6 +38,11 @@ FileDescriptor::FileDescriptor(const UTF16String& path, int flags, mode_t mode, 
     mDescriptor = RepeatInterrupted([&] { return FileSystem().mOpen(native.c_str(), flags, mode); });
     if (mDescriptor < 0)
         ThrowLastError();
+}
+
+FileDescriptor FileDescriptor::Create(const UTF16String& path)
+{
+    return {path, O_WRONLY | O_CREAT | O_TRUNC, kReadableAndWritable, "cannot write"};
 }
 
 FileDescriptor::~FileDescriptor()

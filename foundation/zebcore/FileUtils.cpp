@@ -3,8 +3,6 @@
 #include "foundation/zebcore/internal/FileDescriptor.h"
 #include "foundation/zebcore/internal/TextFile.h"
 
-#include <fcntl.h>
-
 namespace zebcore::utility::FileUtils
 {
 
@@ -12,13 +10,12 @@ namespace
 {
 
 constexpr std::size_t kBlockSize = std::size_t{1} << 16U;
-constexpr mode_t kReadableAndWritable = 0666; // less what the user masks
 
 } // namespace
 
 void SimpleWriteStringToFile(const UTF16String& path, const UTF8String& text)
 {
-    filesupport::FileDescriptor file(path, O_WRONLY | O_CREAT | O_TRUNC, kReadableAndWritable, "cannot write");
+    filesupport::FileDescriptor file = filesupport::FileDescriptor::Create(path);
     file.Write(text);
     file.Close();
 }

@@ -1,9 +1,9 @@
 #include "foundation/zebcore/PropListUtils.h"
 
 #include "foundation/zebcore/FileExceptions.h"
-#include "foundation/zebcore/FileUtils.h"
 #include "foundation/zebcore/SafeSave.h"
 #include "foundation/zebcore/Trace.h"
+#include "foundation/zebcore/internal/FileDescriptor.h"
 #include "foundation/zebcore/internal/ParseXml.h"
 #include "foundation/zebcore/internal/PropListCopier.h"
 #include "foundation/zebcore/internal/PropListReader.h"
@@ -56,6 +56,20 @@ void Replace(PropList& list, PropList& content)
     CopyTo(list, content);
 }
 
+// The text never stands in memory as a whole.
+void WriteFile(const UTF16String& path, const PropList& list)
+{
+    filesupport::FileDescriptor file = filesupport::FileDescriptor::Create(path);
+    const PropListWriter::Drain drain = [&file](const UTF8String& text)
+    {
+        file.Write(text);
+    };
+    UTF8String rest;
+    PropListWriter(rest, 0, &drain).WriteDocument(list);
+    file.Write(rest);
+    file.Close();
+}
+
 bool IsBelow(const UTF16String& path, const UTF16String& folder)
 {
     return path == folder || path.starts_with(folder + u'/');
@@ -85,13 +99,11 @@ bool LoadPropList(const UTF16String& path, PropList& list, bool merge)
 
 void SavePropList(filesupport::File& file, const PropList& list)
 {
-    UTF8String text;
-    WritePropList(text, list);
     MakePreferenceFolder(file);
     filesupport::SafeSave save(file);
     try
     {
-        zebcore::utility::FileUtils::SimpleWriteStringToFile(save.GetTempFile().FullPath(), text);
+        WriteFile(save.GetTempFile().FullPath(), list);
     }
     catch (const filesupport::file_exception& failure)
     {

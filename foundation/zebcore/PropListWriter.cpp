@@ -18,6 +18,7 @@ namespace
 {
 
 constexpr int kHexadecimal = 16;
+constexpr std::size_t kLongText = std::size_t{1} << 16U;
 
 // `format` is a base or nothing.
 template <typename T, typename... Format>
@@ -111,7 +112,7 @@ void PropListWriter::VisitSubList(const UTF8String& key, const PropList& subList
 {
     Open(kListElement, key);
     mOut += u8'\n';
-    PropListWriter writer(mOut, mDepth + 1);
+    PropListWriter writer(mOut, mDepth + 1, mDrain);
     subList.Visit(writer);
     Indent();
     Close(kListElement);
@@ -128,6 +129,10 @@ void PropListWriter::Open(std::u8string_view element, const UTF8String& key)
 void PropListWriter::Close(std::u8string_view element)
 {
     mOut.append(u8"</").append(element).append(u8">\n");
+    if (mDrain == nullptr || mOut.size() < kLongText)
+        return;
+    (*mDrain)(mOut);
+    mOut.clear();
 }
 
 void PropListWriter::Indent()

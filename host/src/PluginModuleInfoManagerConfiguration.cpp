@@ -5,6 +5,7 @@
 #include "foundation/zebcore/PropList.h"
 #include "foundation/zebcore/PropListUtils.h"
 #include "host/AudioFilterDescriptorManager.h"
+#include "host/src/EntryForwarder.h"
 #include "host/src/IndexedKeys.h"
 #include "host/src/PluginModuleRecords.h"
 
@@ -66,6 +67,27 @@ std::vector<PluginModuleInfoManager::PluginInfoPtr> ReadRecords(const PropList& 
     }
     return infos;
 }
+
+// The settings, made section by section while they are visited: a large catalogue never stands in memory twice.
+class SettingsView final : public PropList
+{
+public:
+    SettingsView(const PluginModuleInfoManager& manager, bool withDirectories)
+        : mManager(manager), mWithDirectories(withDirectories)
+    {
+    }
+
+    void Visit(zebcore::proplist::PropListVisitor& visitor) const override
+    {
+        EntryForwarder forwarder(visitor);
+        mManager.BuildConfigurationPropList(forwarder, mWithDirectories);
+        forwarder.Finish();
+    }
+
+private:
+    const PluginModuleInfoManager& mManager;
+    bool mWithDirectories;
+};
 
 } // namespace
 
@@ -187,11 +209,9 @@ void PluginModuleInfoManager::LoadWithoutFile()
 
 void PluginModuleInfoManager::SaveConfiguration(File& file, bool withDirectories) const
 {
-    PropList list;
-    BuildConfigurationPropList(list, withDirectories);
     try
     {
-        zebcore::proplist::utils::SavePropList(file, list);
+        zebcore::proplist::utils::SavePropList(file, SettingsView(*this, withDirectories));
     }
     catch (const zebcore::filesupport::file_delete_exception&)
     {
@@ -212,10 +232,8 @@ void PluginModuleInfoManager::BuildConfigurationPropList(PropList& list, bool wi
 
 UTF8String PluginModuleInfoManager::GetConfigurationAsXML() const
 {
-    PropList list;
-    BuildConfigurationPropList(list, true);
     UTF8String text;
-    zebcore::proplist::utils::WritePropList(text, list);
+    zebcore::proplist::utils::WritePropList(text, SettingsView(*this, true));
     return text;
 }
 

@@ -1,4 +1,5 @@
 #include "foundation/zebcore/FileExceptions.h"
+#include "foundation/zebcore/FileUtils.h"
 #include "foundation/zebcore/PropListUtils.h"
 #include "foundation/zebcore/internal/FileSystemCalls.h"
 #include "host/AudioFilterDescriptorManager.h"
@@ -183,6 +184,26 @@ TEST_F(ConfigurationTest, LayoutOfTheFile)
     mManager.BuildConfigurationPropList(withoutDirectories, false);
     EXPECT_EQ(Layout(withoutDirectories), (Strings{"version unsigned", "num_plugin_infos int", "plugin_info0 list",
                                                    "num_descriptors int", "descriptor0 list"}));
+}
+
+TEST_F(ConfigurationTest, FileAndTextHoldTheListOfTheConfiguration)
+{
+    for (const UTF16String path : {u"/a", u"/b", u"/c"})
+    {
+        mManager.AddPluginModuleInfo(MakeInfo(VST3(path)));
+        mDescriptors.AddAudioFilterDescriptor(MakeExternal(VST3(path), u"3:" + path));
+    }
+    for (const bool withDirectories : {false, true})
+    {
+        PropList list;
+        mManager.BuildConfigurationPropList(list, withDirectories);
+        UTF8String expected;
+        zebcore::proplist::utils::WritePropList(expected, list);
+        File file = FileInFolder("settings.xml");
+        mManager.SaveConfiguration(file, withDirectories);
+        EXPECT_TRUE(zebcore::utility::FileUtils::SimpleReadStringFromFile(file.FullPath()) == expected);
+        EXPECT_EQ(mManager.GetConfigurationAsXML() == expected, withDirectories);
+    }
 }
 
 TEST_F(ConfigurationTest, FileWithoutDirectoriesLeavesThem)

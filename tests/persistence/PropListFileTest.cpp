@@ -4,6 +4,7 @@
 #include "foundation/zebcore/PropListUtils.h"
 #include "foundation/zebcore/StringConversion.h"
 #include "foundation/zebcore/internal/FileSystemCalls.h"
+#include "tests/persistence/SaveFaults.h"
 
 #include <gtest/gtest.h>
 
@@ -38,6 +39,22 @@ protected:
         return value;
     }
 
+    // Written in many blocks.
+    static PropList LongList()
+    {
+        PropList list;
+        PropList* innermost = &list;
+        for (int section = 0; section < 5; ++section)
+        {
+            innermost = &innermost->GetOrCreateSubList(u8"below");
+            for (int entry = 0; entry < 1000; ++entry)
+                innermost->SetValue(utility::UTF8FromNarrow("key" + std::to_string(entry)), entry);
+        }
+        list.SetValue(u8"chunk", UTF8String(300000, u8'c'));
+        list.SetValue(u8"last", 1);
+        return list;
+    }
+
     const TempFolder mFolder;
 };
 
@@ -46,11 +63,13 @@ protected:
 TEST_F(PropListFile, FileHoldsWhatWritePropListGives)
 {
     filesupport::File file = mFolder.File("settings.xml");
-    const PropList list = OneEntry(u8"a", 1);
-    SavePropList(file, list);
-    UTF8String text;
-    WritePropList(text, list);
-    EXPECT_EQ(mFolder.Read("settings.xml"), utility::NarrowFromUTF8(text));
+    for (const PropList& list : {LongList(), PropList(), OneEntry(u8"a", 1)})
+    {
+        SavePropList(file, list);
+        UTF8String text;
+        WritePropList(text, list);
+        EXPECT_TRUE(mFolder.Read("settings.xml") == utility::NarrowFromUTF8(text));
+    }
     PropList read = OneEntry(u8"stale", 1);
     EXPECT_TRUE(LoadPropList(file.FullPath(), read, false));
     EXPECT_EQ(ValueOf(read, u8"a"), 1);
@@ -195,27 +214,25 @@ TEST_F(PropListFile, FailedSaveNamesTheFileThatTheUserKnows)
     filesupport::File file = mFolder.File("settings.xml");
     SavePropList(file, OneEntry(u8"a", 1));
     const std::string before = mFolder.Read("settings.xml");
-    const filesupport::FileSystemCalls working = filesupport::FileSystem();
-    filesupport::FileSystem().mWrite = [](int, const void*, std::size_t)
+    for (const int goodWrites : {0, 1, 3})
     {
-        errno = ENOSPC;
-        return ssize_t{-1};
-    };
-    try
-    {
-        SavePropList(file, OneEntry(u8"a", 2));
-        ADD_FAILURE() << "a full disk went unnoticed";
+        const InjectedFault fullDisk([goodWrites](filesupport::FileSystemCalls& system)
+                                     { system.mWrite = FailAfter(goodWrites, ENOSPC, system.mWrite); });
+        try
+        {
+            SavePropList(file, LongList());
+            ADD_FAILURE() << "a full disk went unnoticed";
+        }
+        catch (const filesupport::file_delete_exception&)
+        {
+            ADD_FAILURE() << "the catalogue would swallow this";
+        }
+        catch (const filesupport::file_exception& failure)
+        {
+            EXPECT_EQ(failure.Error(), ENOSPC);
+            EXPECT_TRUE(failure.Path() == file.FullPath());
+        }
+        EXPECT_EQ(mFolder.Read("settings.xml"), before);
+        EXPECT_EQ(mFolder.CountFiles(), 1U);
     }
-    catch (const filesupport::file_delete_exception&)
-    {
-        ADD_FAILURE() << "the catalogue would swallow this";
-    }
-    catch (const filesupport::file_exception& failure)
-    {
-        EXPECT_EQ(failure.Error(), ENOSPC);
-        EXPECT_TRUE(failure.Path() == file.FullPath());
-    }
-    filesupport::FileSystem() = working;
-    EXPECT_EQ(mFolder.Read("settings.xml"), before);
-    EXPECT_EQ(mFolder.CountFiles(), 1U);
 }

@@ -14,6 +14,8 @@ class FileDescriptor
 {
 public:
     FileDescriptor(const UTF16String& path, int flags, mode_t mode, std::string_view action);
+    // An empty file to write to: a new one, or an old one that is emptied.
+    static FileDescriptor Create(const UTF16String& path);
     FileDescriptor(const FileDescriptor&) = delete;
     FileDescriptor& operator=(const FileDescriptor&) = delete;
     ~FileDescriptor();

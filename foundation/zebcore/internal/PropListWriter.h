@@ -3,6 +3,7 @@
 #include "foundation/zebcore/PropListVisitor.h"
 
 #include <cstddef>
+#include <functional>
 #include <string_view>
 
 namespace zebcore::proplist
@@ -12,8 +13,14 @@ namespace zebcore::proplist
 class PropListWriter final : public PropListVisitor
 {
 public:
-    // `depth` is that of the list which is visited: 0 for the outermost one.
-    PropListWriter(UTF8String& out, std::size_t depth) : mOut(out), mDepth(depth) {}
+    // Is shown the text between two elements whenever it has grown long, and the text is emptied then.
+    using Drain = std::function<void(const UTF8String& text)>;
+
+    // `depth` is that of the list which is visited: 0 for the outermost one. Without a drain the text only grows.
+    PropListWriter(UTF8String& out, std::size_t depth, const Drain* drain = nullptr)
+        : mOut(out), mDepth(depth), mDrain(drain)
+    {
+    }
 
     void WriteDocument(const PropList& list);
 
@@ -33,6 +40,7 @@ private:
 
     UTF8String& mOut;
     std::size_t mDepth;
+    const Drain* mDrain; // may be null
 };
 
 } // namespace zebcore::proplist
