@@ -3,6 +3,8 @@
 #include <algorithm>
 #include <array>
 #include <csignal>
+#include <cstddef>
+#include <cstring>
 #include <string_view>
 
 #include <unistd.h>
@@ -20,15 +22,35 @@ std::array<char, 512> sText;
 std::size_t sLength = 0;
 int sDescriptor = -1;
 
+void Write(std::string_view text)
+{
+    [[maybe_unused]] const ssize_t written = write(sDescriptor, text.data(), text.size());
+}
+
 void OnSignal(int signal)
 {
-    const std::string_view what = signal == SIGALRM ? "soak: HANGS: " : "soak: CRASHED: ";
-    [[maybe_unused]] ssize_t written = write(sDescriptor, what.data(), what.size());
-    written = write(sDescriptor, sText.data(), sLength);
+    Write(signal == SIGALRM ? "soak: HANGS" : "soak: CRASHED (");
+    if (signal != SIGALRM)
+    {
+        Write(sigdescr_np(signal)); // a constant text, unlike strsignal's
+        Write(")");
+    }
+    Write(": ");
+    Write({sText.data(), sLength});
     _exit(1);
 }
 
 } // namespace
+
+void UseSignalStack()
+{
+    constexpr std::size_t kBytes = 0x10000;
+    thread_local std::array<std::byte, kBytes> memory;
+    stack_t stack{};
+    stack.ss_sp = memory.data();
+    stack.ss_size = memory.size();
+    sigaltstack(&stack, nullptr);
+}
 
 CrashNote::CrashNote(int descriptor, std::uint64_t randomStart) : mRandomStart(randomStart)
 {
@@ -37,11 +59,13 @@ CrashNote::CrashNote(int descriptor, std::uint64_t randomStart) : mRandomStart(r
     {
     };
     action.sa_handler = OnSignal;
+    action.sa_flags = SA_ONSTACK;
     sigfillset(&action.sa_mask);
     for (const int signal : {SIGSEGV, SIGBUS, SIGFPE, SIGILL, SIGABRT, SIGTRAP, SIGALRM})
     {
         sigaction(signal, &action, nullptr);
     }
+    UseSignalStack();
 }
 
 void CrashNote::Step(const std::string& name, const char* operation, unsigned long number)

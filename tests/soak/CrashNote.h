@@ -6,6 +6,9 @@
 namespace soak
 {
 
+/// Lets the calling thread tell of its own stack's overflow too.
+void UseSignalStack();
+
 /// Should the process crash or hang, says where the run stood. [main]
 class CrashNote
 {

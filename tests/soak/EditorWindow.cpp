@@ -1,10 +1,12 @@
 #include "EditorWindow.h"
 
+#include "Throws.h"
+
 #include <X11/Xlib.h>
 
 #include <algorithm>
 #include <cstdint>
-#include <stdexcept>
+#include <utility>
 
 namespace soak
 {
@@ -34,7 +36,7 @@ Display* OpenDisplay()
     Display* display = XOpenDisplay(nullptr);
     if (display == nullptr)
     {
-        throw std::runtime_error("there is no X display: run under xvfb-run");
+        throw Fault("there is no X display: run under xvfb-run");
     }
     return display;
 }
@@ -102,10 +104,25 @@ EditorWindow::EditorWindow(const boost::intrusive_ptr<AudioFilterEditor>& editor
 
 EditorWindow::~EditorWindow()
 {
-    zebcore::threads::RemoveTimerWatch(mTimer);
+    try
+    {
+        Close();
+    }
+    catch (...)
+    {
+    }
+    mWindow.reset(); // after the plug-in's, which is inside it
+}
+
+void EditorWindow::Close()
+{
+    if (mTimer == zebcore::threads::kNoWatch)
+    {
+        return;
+    }
+    zebcore::threads::RemoveTimerWatch(std::exchange(mTimer, zebcore::threads::kNoWatch));
     mSizeConnection.disconnect();
     mEditor->Close();
-    mWindow.reset(); // after the plug-in's, which is inside it
 }
 
 void EditorWindow::Fit()

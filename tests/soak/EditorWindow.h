@@ -14,11 +14,14 @@ namespace soak
 class EditorWindow
 {
 public:
-    /// Throws std::runtime_error if there is no display.
+    /// Throws Fault if there is no display.
     explicit EditorWindow(const boost::intrusive_ptr<zebaudiofilterhost::AudioFilterEditor>& editor);
     ~EditorWindow();
     EditorWindow(const EditorWindow&) = delete;
     EditorWindow& operator=(const EditorWindow&) = delete;
+
+    /// Takes the editor out of the window. The destructor does it too, and keeps to itself what that throws.
+    void Close();
 
 private:
     class Native;

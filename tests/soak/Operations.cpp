@@ -1,12 +1,12 @@
 #include "Operations.h"
 
+#include "MainLoop.h"
+#include "Throws.h"
 #include "audiofilter/AudioFilterPresets.h"
-#include "foundation/zebcore/MainThreadLoop.h"
 #include "foundation/zebcore/NativePath.h"
 #include "foundation/zebcore/PropListUtils.h"
 
 #include <algorithm>
-#include <stdexcept>
 
 namespace soak
 {
@@ -40,11 +40,6 @@ const char* NameOf(Operation operation)
         "create",     "destroy",    "configure", "process", "parameters",  "save state",
         "load state", "state file", "preset",    "clone",   "open editor", "close editor"};
     return kNames[static_cast<std::size_t>(operation)];
-}
-
-void Settle(unsigned int milliseconds)
-{
-    zebcore::threads::RunMainThreadUntil({}, milliseconds);
 }
 
 Operations::Operations(Dice& dice, ProcessThread& thread, std::filesystem::path folder)
@@ -122,7 +117,7 @@ void Operations::ChangeParameters(AudioFilter& filter)
         filter.GetParameterString(index);
         filter.GetParameterInfo(index);
     }
-    zebcore::threads::PumpMainThread();
+    ServeLoop();
 }
 
 void Operations::SaveState(const Specimen& specimen)
@@ -140,7 +135,7 @@ void Operations::LoadState(const Specimen& specimen)
     }
     if (!specimen.Filter()->LoadSettings(PresetData(saved->second)))
     {
-        throw std::runtime_error("refuses the state that it has saved");
+        throw Fault("refuses the state that it has saved");
     }
 }
 
@@ -156,7 +151,7 @@ void Operations::PassStateThroughFile(const Specimen& specimen)
     if (!zebcore::proplist::utils::LoadPropList(path, loaded, false) || !(PresetData(loaded) == state) ||
         !specimen.Filter()->LoadSettings(PresetData(loaded)))
     {
-        throw std::runtime_error("has another state once that has been in a file");
+        throw Fault("has another state once that has been in a file");
     }
 }
 
@@ -179,11 +174,12 @@ void Operations::Clone(const Specimen& specimen)
     const Specimen::FilterPointer clone = AudioFilter::Clone(specimen.Filter());
     if (clone == nullptr)
     {
-        throw std::runtime_error("can't be cloned");
+        throw Fault("can't be cloned");
     }
     Specimen twin(specimen.GetSubject(), clone);
     Configure(twin);
     Process(twin);
+    twin.Close();
 }
 
 } // namespace soak

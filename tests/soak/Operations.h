@@ -39,7 +39,7 @@ public:
     /// State files lie in `folder` for a moment.
     Operations(Dice& dice, ProcessThread& thread, std::filesystem::path folder);
 
-    /// All but Create and Destroy.
+    /// All but Create and Destroy. Throws Fault for what must not be, and what the effect throws.
     void Run(Operation operation, Specimen& specimen);
 
     /// Forgets the states that were saved, which would count as growth.
@@ -60,8 +60,5 @@ private:
     std::filesystem::path mFolder;
     std::map<zebaudiofilterhost::UTF16String, zebaudiofilterhost::PropList> mStates; // by filter ID
 };
-
-/// Serves the main thread's loop for so long. [main]
-void Settle(unsigned int milliseconds);
 
 } // namespace soak

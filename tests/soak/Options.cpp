@@ -14,10 +14,10 @@ namespace
 
 [[noreturn]] void EndWithHelp()
 {
-    std::cerr
-        << "usage: zeb_soak [--seconds N] [--operations N] [--random-start N] [--every SECONDS] [--only TEXT]\n"
-           "                [--without-editors] [--without-editor-of PART OF PATH]... [--json FILE] [--log FILE]\n"
-           "The folders are those of VST3_PATH, VST_PATH and AUDIO_COMPONENT_PATH.\n";
+    std::cerr << "usage: zeb_soak [--seconds N] [--operations N] [--random-start N] [--every SECONDS] [--only TEXT]\n"
+                 "                [--leave-out TEXT]... [--without-editors] [--without-editor-of PART OF PATH]... "
+                 "[--json FILE] [--log FILE]\n"
+                 "The folders are those of VST3_PATH, VST_PATH and AUDIO_COMPONENT_PATH.\n";
     std::exit(2);
 }
 
@@ -45,6 +45,9 @@ void Take(Options& options, int letter)
     case 'o':
         options.only = optarg;
         break;
+    case 'x':
+        options.leftOut.emplace_back(optarg);
+        break;
     case 'w':
         options.withEditors = false;
         break;
@@ -71,6 +74,7 @@ Options ReadOptions(int argc, char** argv)
                             {"random-start", required_argument, nullptr, 's'},
                             {"every", required_argument, nullptr, 'e'},
                             {"only", required_argument, nullptr, 'o'},
+                            {"leave-out", required_argument, nullptr, 'x'},
                             {"without-editors", no_argument, nullptr, 'w'},
                             {"without-editor-of", required_argument, nullptr, 'p'},
                             {"json", required_argument, nullptr, 'j'},

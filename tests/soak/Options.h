@@ -16,6 +16,7 @@ struct Options
     bool withEditors = true;
     std::vector<std::string> withoutEditorOf; // parts of paths
     std::string only;                         // a part of the names
+    std::vector<std::string> leftOut;         // parts of names, told with the findings
     std::string json;                         // a file; empty for none
     std::string log;                          // a file for what plug-ins print; empty for nowhere
 };

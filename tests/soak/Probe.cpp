@@ -1,6 +1,6 @@
 #include "Probe.h"
 
-#include "Operations.h"
+#include "MainLoop.h"
 #include "Turn.h"
 
 namespace soak
@@ -23,7 +23,9 @@ std::uint64_t ProbeSound(const Subject& subject, ProcessThread& thread)
         u"Main", zebaudiofilterhost::AudioFilterBusDescription::kBusType_Main);
     specimen->Configure(setup);
     Settle(kSettleMs);
-    return specimen->Process(std::vector<int>(kBlocks, setup.blockSize), kNoiseStart, thread);
+    const std::uint64_t hash = specimen->Process(std::vector<int>(kBlocks, setup.blockSize), kNoiseStart, thread);
+    specimen->Close();
+    return hash;
 }
 
 } // namespace soak

@@ -1,8 +1,10 @@
 #include "ProcessThread.h"
 
-#include "foundation/zebcore/MainThreadLoop.h"
+#include "CrashNote.h"
+#include "MainLoop.h"
 
 #include <chrono>
+#include <utility>
 
 #include <immintrin.h>
 
@@ -30,9 +32,25 @@ void ProcessThread::Run(const std::function<void()>& work)
         mWork = work;
     }
     mChanged.notify_all();
+    std::exception_ptr ofLoop;
     while (!IsDoneWithin(1))
     {
-        zebcore::threads::PumpMainThread();
+        try
+        {
+            ServeLoop();
+        }
+        catch (...) // the work still uses what lies on the caller's stack
+        {
+            ofLoop = std::current_exception();
+        }
+    }
+    if (const std::exception_ptr ofWork = std::exchange(mThrown, nullptr))
+    {
+        std::rethrow_exception(ofWork);
+    }
+    if (ofLoop)
+    {
+        std::rethrow_exception(ofLoop);
     }
 }
 
@@ -46,6 +64,7 @@ void ProcessThread::Serve()
 {
     constexpr unsigned int kFlushToZeroAndDenormalsAreZero = 0x8040;
     _mm_setcsr(_mm_getcsr() | kFlushToZeroAndDenormalsAreZero);
+    UseSignalStack();
     std::unique_lock lock(mMutex);
     for (;;)
     {
@@ -55,10 +74,23 @@ void ProcessThread::Serve()
             return;
         }
         lock.unlock();
-        mWork();
+        DoWork();
         lock.lock();
         mWork = nullptr;
         mChanged.notify_all();
+    }
+}
+
+// An effect may throw out of a block; the audio thread outlives that, as that of an application has to.
+void ProcessThread::DoWork()
+{
+    try
+    {
+        mWork();
+    }
+    catch (...)
+    {
+        mThrown = std::current_exception();
     }
 }
 

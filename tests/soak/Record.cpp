@@ -96,6 +96,13 @@ Check JudgeEnd(bool interrupted)
             interrupted ? Check::Outcome::Fails : Check::Outcome::Holds};
 }
 
+Check JudgeThrows(std::size_t own, unsigned long byOwn, unsigned long byOthers)
+{
+    return {"exceptions from the " + std::to_string(own) + " effects of this project",
+            std::to_string(byOwn) + ", from others " + std::to_string(byOthers),
+            byOwn == 0 ? Check::Outcome::Holds : Check::Outcome::Fails};
+}
+
 Check JudgeProbes(std::size_t compared, std::size_t different)
 {
     Check check{"fixed probes at both ends",

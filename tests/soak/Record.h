@@ -41,6 +41,9 @@ Check JudgeSubjects(std::size_t effects);
 /// Whether the run came to its end.
 Check JudgeEnd(bool interrupted);
 
+/// Whether any of so many effects of this project threw. Those of others may: their hosts have to live with it.
+Check JudgeThrows(std::size_t own, unsigned long byOwn, unsigned long byOthers);
+
 /// Of fixed probes that could be compared, and those of them that sounded different.
 Check JudgeProbes(std::size_t compared, std::size_t different);
 

@@ -83,6 +83,9 @@ TEST(RecordTest, DoesNotPassARunThatTestedNothing)
     EXPECT_EQ(JudgeProbes(2, 0).outcome, kHolds);
     EXPECT_EQ(JudgeProbes(2, 1).outcome, kFails);
 
+    EXPECT_EQ(JudgeThrows(3, 0, 7).outcome, kHolds);
+    EXPECT_EQ(JudgeThrows(3, 1, 0).outcome, kFails);
+
     EXPECT_FALSE(AllHold({}));
     EXPECT_FALSE(AllHold({JudgeProbes(0, 0)}));
     EXPECT_TRUE(AllHold({JudgeProbes(0, 0), JudgeEnd(false)}));

@@ -46,6 +46,12 @@ Json ToJson(const Sample& sample)
             {"threads", sample.resources.threads}};
 }
 
+Json ToJson(const Throws::Entry& entry)
+{
+    return {{"effect", entry.effect},    {"operation", entry.step},    {"type", entry.thrown.type},
+            {"what", entry.thrown.what}, {"ofThisProject", entry.own}, {"times", entry.times}};
+}
+
 Json ToJson(const Check& check)
 {
     return {{"what", check.what}, {"figures", check.figures}, {"outcome", NameOf(check.outcome)}};
@@ -72,6 +78,22 @@ Json TallyJson(const Tally& tally)
     return counts;
 }
 
+void SayWhatWasThrown(const Console& console, const std::vector<Throws::Entry>& entries)
+{
+    constexpr std::size_t kMostLines = 20;
+    for (std::size_t index = 0; index < std::min(entries.size(), kMostLines); ++index)
+    {
+        const Throws::Entry& entry = entries[index];
+        console.Say("soak: " + entry.effect + " threw " + entry.thrown.type +
+                    (entry.thrown.what.empty() ? "" : " (" + entry.thrown.what + ")") + ", " + entry.step + ", " +
+                    std::to_string(entry.times) + (entry.times == 1 ? " time" : " times"));
+    }
+    if (entries.size() > kMostLines)
+    {
+        console.Say("soak: and " + std::to_string(entries.size() - kMostLines) + " more lines like these");
+    }
+}
+
 void SayWhatStays(const Console& console, const Ledger& ledger)
 {
     for (const Ledger::Account& account : ledger.Worst(kMostNamed))
@@ -88,6 +110,11 @@ void SayWhatStays(const Console& console, const Ledger& ledger)
 void SayFindings(const Console& console, const Findings& findings)
 {
     SayWhatStays(console, findings.ledger);
+    SayWhatWasThrown(console, findings.score.throws.Entries());
+    if (!findings.leftOut.empty())
+    {
+        console.Say("soak: did not take part, as asked for: " + Joined(findings.leftOut));
+    }
     if (!findings.varying.empty())
     {
         console.Say("soak: not the same sound twice from the start, so not compared: " + Joined(findings.varying));
@@ -112,10 +139,12 @@ void WriteJson(const Options& options, const Findings& findings)
     const Json document = {{"randomStart", options.randomStart},
                            {"seconds", findings.seconds},
                            {"passed", findings.Passed()},
-                           {"operations", TallyJson(findings.tally)},
+                           {"operations", TallyJson(findings.score.tally)},
                            {"checks", ArrayOf(findings.checks)},
                            {"notDeterministic", findings.varying},
                            {"changedSound", findings.changed},
+                           {"leftOut", findings.leftOut},
+                           {"threw", ArrayOf(findings.score.throws.Entries())},
                            {"firstUse", ArrayOf(findings.firstUse.Accounts())},
                            {"leftBehind", ArrayOf(findings.ledger.Accounts())},
                            {"samples", ArrayOf(findings.samples)}};

@@ -2,13 +2,13 @@
 
 #include "ControlFilter.h"
 #include "Interrupt.h"
+#include "MainLoop.h"
 #include "Probe.h"
 
 #include <algorithm>
 #include <array>
 #include <cstdio>
 #include <numeric>
-#include <stdexcept>
 
 namespace soak
 {
@@ -52,7 +52,7 @@ Soak::Soak(const Options& options, const Console& console, const std::filesystem
 Findings Soak::Run()
 {
     mNote.Step("the plug-ins", "scan", 0);
-    mFindings.subjects = FindSubjects(mOptions.only, mOptions.withoutEditorOf);
+    mFindings.subjects = FindSubjects(mOptions, mFindings.leftOut);
     mFindings.ledger = Ledger(NamesOf(mFindings.subjects));
     mConsole.Say("soak: random start " + std::to_string(mOptions.randomStart) + ", " +
                  std::to_string(mFindings.subjects.size()) + " effects, " + std::to_string(mOptions.seconds) +
@@ -60,13 +60,28 @@ Findings Soak::Run()
     mFindings.checks.push_back(JudgeSubjects(EffectCount()));
     if (mFindings.Passed())
     {
+        RunAll();
+    }
+    mNote.Done();
+    return std::move(mFindings);
+}
+
+void Soak::RunAll()
+{
+    try
+    {
         WarmUp();
         RunTurns();
         CompareProbes();
         mFindings.checks.push_back(JudgeEnd(interrupt::IsRequested()));
     }
-    mNote.Done();
-    return std::move(mFindings);
+    catch (const Fault& fault)
+    {
+        mFindings.seconds = Seconds();
+        mFindings.checks.push_back({"the whole run", std::string("ended by ") + fault.what(), Check::Outcome::Fails});
+    }
+    const Throws& throws = mFindings.score.throws;
+    mFindings.checks.push_back(JudgeThrows(OwnCount(), throws.Count(true), throws.Count(false)));
 }
 
 std::size_t Soak::EffectCount() const
@@ -74,6 +89,12 @@ std::size_t Soak::EffectCount() const
     return static_cast<std::size_t>(std::count_if(mFindings.subjects.begin(), mFindings.subjects.end(),
                                                   [](const Subject& subject)
                                                   { return subject.id != kControlFilterID; }));
+}
+
+std::size_t Soak::OwnCount() const
+{
+    return static_cast<std::size_t>(std::count_if(mFindings.subjects.begin(), mFindings.subjects.end(),
+                                                  [](const Subject& subject) { return subject.own; }));
 }
 
 void Soak::WarmUp()
@@ -93,15 +114,29 @@ void Soak::WarmUp()
 void Soak::WarmUp(std::size_t index)
 {
     const Subject& subject = mFindings.subjects[index];
-    mNote.Step(subject.name, "first use", 0);
-    mProbes[index] = ProbeSound(subject, mThread);
-    UseOnce(subject);
-    if (ProbeSound(subject, mThread) != mProbes[index])
+    const std::uint64_t first = Probe(subject, "first probe");
+    Try(subject, "first use", [&] { UseOnce(subject); });
+    const std::uint64_t second = Probe(subject, "second probe");
+    if (first != 0 && second != 0 && first != second)
     {
         mFindings.varying.push_back(subject.name);
-        mProbes[index] = 0;
     }
-    Settle(kGoodbyeMs);
+    mProbes[index] = first == second ? first : 0;
+    Try(subject, "after the first use", [] { Settle(kGoodbyeMs); });
+}
+
+bool Soak::Try(const Subject& subject, const char* step, const std::function<void()>& work)
+{
+    mNote.Step(subject.name, step, Sum(mFindings.score.tally));
+    return mFindings.score.throws.Try(subject, step, {&subject}, work);
+}
+
+// 0 if it threw.
+std::uint64_t Soak::Probe(const Subject& subject, const char* step)
+{
+    std::uint64_t hash = 0;
+    Try(subject, step, [&] { hash = ProbeSound(subject, mThread); });
+    return hash;
 }
 
 void Soak::UseOnce(const Subject& subject)
@@ -116,6 +151,7 @@ void Soak::UseOnce(const Subject& subject)
             mOperations.Run(operation, *specimen);
         }
     }
+    specimen->Close();
     mOperations.ForgetStates();
 }
 
@@ -154,12 +190,12 @@ void Soak::RunOneTurn(unsigned long number)
     {
         std::transform(mFindings.subjects.begin(), mFindings.subjects.end(), std::back_inserter(cast),
                        [](const Subject& subject) { return &subject; });
-        Turn(cast, mDice, mOperations, mNote, mFindings.tally).Run(kStepsTogether, mOptions.withEditors);
+        Turn(cast, mDice, mOperations, mNote, mFindings.score).Run(kStepsTogether, mOptions.withEditors);
         return;
     }
     const unsigned long alone = number / kRound * (kRound - 1) + number % kRound;
     const std::size_t index = mOrder[alone % mOrder.size()];
-    Turn turn({&mFindings.subjects[index]}, mDice, mOperations, mNote, mFindings.tally);
+    Turn turn({&mFindings.subjects[index]}, mDice, mOperations, mNote, mFindings.score);
     turn.Run(kStepsAlone, mOptions.withEditors);
     mFindings.ledger.AddTurn(index, turn.Lives(), turn.Editors(), mFindings.samples.back().resources,
                              MeasureResources());
@@ -171,14 +207,15 @@ void Soak::CompareProbes()
     for (std::size_t index = 0; index < mProbes.size() && !interrupt::IsRequested(); ++index)
     {
         const Subject& subject = mFindings.subjects[index];
-        mNote.Step(subject.name, "last probe", Sum(mFindings.tally));
-        if (mProbes[index] != 0)
+        const std::uint64_t last = mProbes[index] == 0 ? 0 : Probe(subject, "last probe");
+        if (last == 0)
         {
-            ++compared;
-            if (ProbeSound(subject, mThread) != mProbes[index])
-            {
-                mFindings.changed.push_back(subject.name);
-            }
+            continue;
+        }
+        ++compared;
+        if (last != mProbes[index])
+        {
+            mFindings.changed.push_back(subject.name);
         }
     }
     mFindings.checks.push_back(JudgeProbes(compared, mFindings.changed.size()));
@@ -192,7 +229,7 @@ void Soak::TakeSample()
 bool Soak::IsOver() const
 {
     return Seconds() >= mOptions.seconds || interrupt::IsRequested() ||
-           (mOptions.operations > 0 && Sum(mFindings.tally) >= mOptions.operations);
+           (mOptions.operations > 0 && Sum(mFindings.score.tally) >= mOptions.operations);
 }
 
 double Soak::Seconds() const
@@ -215,13 +252,14 @@ void Soak::SayProgress()
     std::string line = std::string(time.data()) + "  resident " + Megabytes(static_cast<double>(now.resident)) +
                        ", in use " + Megabytes(static_cast<double>(now.inUse)) + ", descriptors " +
                        std::to_string(now.descriptors) + ", threads " + std::to_string(now.threads) + "; " +
-                       std::to_string(Sum(mFindings.tally)) + " operations:";
+                       std::to_string(Sum(mFindings.score.tally)) + " operations:";
     for (std::size_t kind = 0; kind < kOperations; ++kind)
     {
         line += std::string(kind == 0 ? " " : ", ") + NameOf(static_cast<Operation>(kind)) + " " +
-                std::to_string(mFindings.tally[kind]);
+                std::to_string(mFindings.score.tally[kind]);
     }
-    mConsole.Say(line);
+    const Throws& throws = mFindings.score.throws;
+    mConsole.Say(line + ", throws " + std::to_string(throws.Count(true) + throws.Count(false)));
 }
 
 } // namespace soak

@@ -17,7 +17,8 @@ namespace soak
 struct Findings
 {
     std::vector<Subject> subjects;
-    Tally tally{};
+    Score score;
+    std::vector<std::string> leftOut; // effects that were there and did not take part, as asked for
     double seconds = 0.0;
     std::vector<Sample> samples;
     std::vector<std::string> varying; // effects that sound different each time in one process, from the start
@@ -37,14 +38,17 @@ public:
     /// `folder` is for files that live for a moment.
     Soak(const Options& options, const Console& console, const std::filesystem::path& folder);
 
-    /// Throws std::runtime_error for what must not be.
     Findings Run();
 
 private:
     std::size_t EffectCount() const;
+    std::size_t OwnCount() const;
+    void RunAll();
     void WarmUp();
     void WarmUp(std::size_t index);
     void UseOnce(const Subject& subject);
+    bool Try(const Subject& subject, const char* step, const std::function<void()>& work);
+    std::uint64_t Probe(const Subject& subject, const char* step);
     void RunTurns();
     void RunOneTurn(unsigned long number);
     void CompareProbes();
@@ -60,7 +64,7 @@ private:
     ProcessThread mThread;
     Operations mOperations;
     Findings mFindings;
-    std::vector<std::uint64_t> mProbes; // 0 for an effect that varies
+    std::vector<std::uint64_t> mProbes; // 0 for an effect that varies, or threw
     std::vector<std::size_t> mOrder;    // of the effects' own turns
     std::chrono::steady_clock::time_point mStart;
     double mNextLine = 0.0;

@@ -103,6 +103,17 @@ Specimen::Specimen(const Subject& subject, const FilterPointer& filter) : mSubje
 
 Specimen::~Specimen()
 {
+    try
+    {
+        Close();
+    }
+    catch (...)
+    {
+    }
+}
+
+void Specimen::Close()
+{
     CloseEditor();
     Suspend();
 }
@@ -170,6 +181,10 @@ void Specimen::OpenEditor()
 
 void Specimen::CloseEditor()
 {
+    if (mEditor)
+    {
+        mEditor->Close();
+    }
     mEditor.reset();
 }
 

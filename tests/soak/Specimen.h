@@ -37,6 +37,9 @@ public:
     const FilterPointer& Filter() const { return mFilter; }
     int BlockSize() const { return mSetup.blockSize; }
 
+    /// Closes the editor and suspends. The destructor does it too, and keeps to itself what that throws.
+    void Close();
+
     /// Suspends, sets up and resumes.
     void Configure(const Setup& setup);
 

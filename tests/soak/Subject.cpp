@@ -56,6 +56,21 @@ std::string Lowered(std::string text)
     return text;
 }
 
+// By the vendor, which the example effects of all technologies tell. A unit's locator has no path.
+bool IsOwn(const AudioFilterDescriptor& descriptor)
+{
+    const UTF16String vendor = descriptor.GetVendorString();
+    return descriptor.GetUniqueID() == kControlFilterID || vendor == u"Zeb Audio" || vendor == u"Zeb";
+}
+
+// Whether one of the texts is in the name.
+bool HasText(const std::string& name, const std::vector<std::string>& texts)
+{
+    return std::any_of(texts.begin(), texts.end(),
+                       [lowered = Lowered(name)](const std::string& text)
+                       { return lowered.find(Lowered(text)) != std::string::npos; });
+}
+
 Subject ToSubject(const AudioFilterDescriptor& descriptor, const std::vector<std::string>& withoutEditor)
 {
     const UTF16String padded = descriptor.GetName();
@@ -64,20 +79,28 @@ Subject ToSubject(const AudioFilterDescriptor& descriptor, const std::vector<std
     const bool withEditor =
         std::none_of(withoutEditor.begin(), withoutEditor.end(),
                      [&path](const std::string& part) { return path.find(part) != std::string::npos; });
-    return {descriptor.GetUniqueID(), name + " (" + TechnologyName(descriptor) + ")", withEditor};
+    return {descriptor.GetUniqueID(), name + " (" + TechnologyName(descriptor) + ")", withEditor, IsOwn(descriptor)};
 }
 
 } // namespace
 
-std::vector<Subject> FindSubjects(const std::string& only, const std::vector<std::string>& withoutEditor)
+std::vector<Subject> FindSubjects(const Options& options, std::vector<std::string>& leftOutNames)
 {
     Scan();
     std::vector<Subject> subjects;
     const auto& catalogue = AudioFilterDescriptorManager::GetInstance();
     for (auto descriptor = catalogue.InfoBegin(); descriptor != catalogue.InfoEnd(); ++descriptor)
     {
-        Subject subject = ToSubject(**descriptor, withoutEditor);
-        if (subject.id == kControlFilterID || Lowered(subject.name).find(Lowered(only)) != std::string::npos)
+        Subject subject = ToSubject(**descriptor, options.withoutEditorOf);
+        if (subject.id == kControlFilterID)
+        {
+            subjects.push_back(std::move(subject));
+        }
+        else if (HasText(subject.name, options.leftOut))
+        {
+            leftOutNames.push_back(subject.name);
+        }
+        else if (HasText(subject.name, {options.only}))
         {
             subjects.push_back(std::move(subject));
         }

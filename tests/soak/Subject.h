@@ -1,5 +1,6 @@
 #pragma once
 
+#include "Options.h"
 #include "utility/CommonTypes.h"
 
 #include <string>
@@ -14,11 +15,13 @@ struct Subject
     zebaudiofilterhost::UTF16String id;
     std::string name;       // with its technology
     bool withEditor = true; // whether its editor is opened
+    bool own = false;       // an example effect of this project, or the control
 };
 
-/// Scans the folders of the environment in this process, and returns the control and all effects whose name has the
-/// text in it, in any case of its letters. Where the path of its plug-in holds one of `withoutEditor`, an effect's
-/// editor stays closed. [main]
-std::vector<Subject> FindSubjects(const std::string& only, const std::vector<std::string>& withoutEditor);
+/// Scans the folders of the environment in this process, and returns the control and all effects that take part:
+/// those with the text `only` of the options in their name, in any case of its letters, and none of `leftOut`, whose
+/// names come out apart. Where the path of its plug-in holds one of `withoutEditorOf`, an effect's editor stays
+/// closed. [main]
+std::vector<Subject> FindSubjects(const Options& options, std::vector<std::string>& leftOutNames);
 
 } // namespace soak

@@ -1,9 +1,10 @@
 #include "Turn.h"
 
+#include "MainLoop.h"
 #include "utility/EffectUtils.h"
 
+#include <algorithm>
 #include <numeric>
-#include <stdexcept>
 
 namespace soak
 {
@@ -21,13 +22,13 @@ std::unique_ptr<Specimen> CreateSpecimen(const Subject& subject)
     const Specimen::FilterPointer filter = zebaudiofilterhost::utility::CreateAudioFilter(subject.id);
     if (filter == nullptr)
     {
-        throw std::runtime_error(subject.name + " can't be made");
+        throw Fault("can't be made");
     }
     return std::make_unique<Specimen>(subject, filter);
 }
 
-Turn::Turn(std::vector<const Subject*> cast, Dice& dice, Operations& operations, CrashNote& note, Tally& tally)
-    : mCast(std::move(cast)), mDice(dice), mOperations(operations), mNote(note), mTally(tally)
+Turn::Turn(std::vector<const Subject*> cast, Dice& dice, Operations& operations, CrashNote& note, Score& score)
+    : mCast(std::move(cast)), mDice(dice), mOperations(operations), mNote(note), mScore(score)
 {
 }
 
@@ -42,7 +43,18 @@ void Turn::Run(int steps, bool withEditors)
         Destroy(mDice.Below(mSpecimens.size()));
     }
     mOperations.ForgetStates();
-    Settle(kGoodbyeMs);
+    SayGoodbye();
+}
+
+// A filter that is still posted to gets it now, and may throw at each.
+void Turn::SayGoodbye()
+{
+    constexpr int kMostTries = 100;
+    bool quiet = mUsed.empty();
+    for (int tries = 0; tries < kMostTries && !quiet; ++tries)
+    {
+        quiet = mScore.throws.Try(*mUsed.back(), "after the last filter", mUsed, [] { Settle(kGoodbyeMs); });
+    }
 }
 
 void Turn::Step(bool withEditors)
@@ -59,7 +71,7 @@ void Turn::Step(bool withEditors)
         return Create();
     }
     const std::size_t index = mDice.Below(mSpecimens.size());
-    Specimen& specimen = *mSpecimens[index];
+    const Specimen& specimen = *mSpecimens[index];
     if (mDice.OneIn(kDestroyOneIn))
     {
         return Destroy(index);
@@ -67,45 +79,56 @@ void Turn::Step(bool withEditors)
     const bool editor = mDice.OneIn(kEditorOneIn) && withEditors && specimen.GetSubject().withEditor;
     if (editor)
     {
-        return Do(specimen.HasOpenEditor() ? Operation::CloseEditor : Operation::OpenEditor, specimen);
+        const bool closes = specimen.HasOpenEditor();
+        mEditors += Do(closes ? Operation::CloseEditor : Operation::OpenEditor, index) && !closes ? 1 : 0;
+        return;
     }
-    Do(mDice.Pick(kUsual), specimen);
+    Do(mDice.Pick(kUsual), index);
 }
 
 void Turn::Create()
 {
     const Subject& subject = *mDice.Pick(mCast);
-    Begin(Operation::Create, subject);
-    mSpecimens.push_back(CreateSpecimen(subject));
+    if (std::find(mUsed.begin(), mUsed.end(), &subject) == mUsed.end())
+    {
+        mUsed.push_back(&subject);
+    }
     ++mLives;
-    Do(Operation::Configure, *mSpecimens.back());
+    if (Try(Operation::Create, subject, [&] { mSpecimens.push_back(CreateSpecimen(subject)); }))
+    {
+        Do(Operation::Configure, mSpecimens.size() - 1);
+    }
 }
 
 void Turn::Destroy(std::size_t index)
 {
-    Begin(Operation::Destroy, mSpecimens[index]->GetSubject());
+    Specimen& specimen = *mSpecimens[index];
+    Try(Operation::Destroy, specimen.GetSubject(), [&specimen] { specimen.Close(); });
+    Remove(index);
+}
+
+void Turn::Remove(std::size_t index)
+{
     mSpecimens.erase(mSpecimens.begin() + static_cast<std::ptrdiff_t>(index));
 }
 
-void Turn::Do(Operation operation, Specimen& specimen)
+bool Turn::Do(Operation operation, std::size_t index)
 {
-    Begin(operation, specimen.GetSubject());
-    try
-    {
-        mOperations.Run(operation, specimen);
-    }
-    catch (const std::exception& fault)
-    {
-        throw std::runtime_error(specimen.GetSubject().name + ", " + NameOf(operation) + ": " + fault.what());
-    }
-    mEditors += operation == Operation::OpenEditor && specimen.HasOpenEditor() ? 1 : 0;
+    Specimen& specimen = *mSpecimens[index];
     mLives += operation == Operation::Clone ? 1 : 0;
+    const bool done = Try(operation, specimen.GetSubject(), [&] { mOperations.Run(operation, specimen); });
+    if (!done)
+    {
+        Remove(index);
+    }
+    return done;
 }
 
-void Turn::Begin(Operation operation, const Subject& subject)
+bool Turn::Try(Operation operation, const Subject& subject, const std::function<void()>& work)
 {
-    ++mTally[static_cast<std::size_t>(operation)];
-    mNote.Step(subject.name, NameOf(operation), std::accumulate(mTally.begin(), mTally.end(), 0UL));
+    ++mScore.tally[static_cast<std::size_t>(operation)];
+    mNote.Step(subject.name, NameOf(operation), std::accumulate(mScore.tally.begin(), mScore.tally.end(), 0UL));
+    return mScore.throws.Try(subject, NameOf(operation), mUsed, work);
 }
 
 } // namespace soak
