@@ -12,7 +12,7 @@ namespace
 
 bool HasEditor(const AEffect* effect)
 {
-    return effect && (effect->flags & effFlagsHasEditor) != 0;
+    return effect != nullptr && (effect->flags & effFlagsHasEditor) != 0;
 }
 
 } // namespace

@@ -112,7 +112,7 @@ long long AddressOf(const void* pointer)
 
 bool IsBelievable(const VstSpeakerArrangement* arrangement)
 {
-    return arrangement && arrangement->numChannels > 0 && arrangement->numChannels <= kMaxArrangedChannels;
+    return arrangement != nullptr && arrangement->numChannels > 0 && arrangement->numChannels <= kMaxArrangedChannels;
 }
 
 // Only a plug-in with so many pins is taken to have kept more than the declared records: some keep these, and the

@@ -37,7 +37,7 @@ UTF16String ReadName(AEffect* effect, int index)
 UTF16String ReadLabel(AEffect* effect, int index)
 {
     const VSTDispatcherBase plugin(effect);
-    VstParameterProperties properties;
+    VstParameterProperties properties{};
     if (ReadProperties(plugin, index, properties))
         return UTF16FromNarrow(BoundedText(properties.label));
     return ReadText(plugin, effGetParamLabel, index);
@@ -53,7 +53,7 @@ VSTParameterInfo::VSTParameterInfo(AEffect* inAEffect, int index)
     , mIndex(index)
 {
     ZEB_CONTRACT(inAEffect);
-    VstParameterProperties properties;
+    VstParameterProperties properties{};
     if (!ReadProperties(*this, mIndex, properties))
         return;
     const std::int64_t range = std::int64_t{properties.maxInteger} - properties.minInteger;
@@ -82,7 +82,7 @@ float VSTParameterInfo::FromNormalized(float normalized) const
 
 bool VSTParameterInfo::CanRamp() const
 {
-    VstParameterProperties properties;
+    VstParameterProperties properties{};
     return ReadProperties(*this, mIndex, properties) && (properties.flags & kVstParameterCanRamp) != 0;
 }
 

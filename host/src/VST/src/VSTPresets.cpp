@@ -30,7 +30,7 @@ constexpr int kMaxPrograms = 32768;
 
 bool VSTAudioFilter::DoPresetsUseChunkData() const
 {
-    return GetEffect() && (GetEffect()->flags & effFlagsProgramChunks) != 0;
+    return GetEffect() != nullptr && (GetEffect()->flags & effFlagsProgramChunks) != 0;
 }
 
 int VSTAudioFilter::GetNumFactoryPresets() const
@@ -99,7 +99,7 @@ bool VSTAudioFilter::SaveChunkData(PresetData& preset) const
         return false;
     const unsigned char* chunk = nullptr; // the plug-in's memory
     const long long size = Dispatcher(effGetChunk, kProgramChunk, 0, &chunk, 0.0F);
-    const bool usable = chunk && size > 0 && size <= kMaxChunkSize;
+    const bool usable = chunk != nullptr && size > 0 && size <= kMaxChunkSize;
     preset.SetChunkData(chunk, usable ? static_cast<unsigned long>(size) : 0);
     preset.SetVersion(GetCurrentPresetVersion());
     preset.SetPresetType(PresetData::kPresetType_Chunk);

@@ -23,10 +23,10 @@ inline std::string_view BoundedText(std::span<const char> bytes)
 /// [any]
 inline bool EqualsText(const void* asked, std::string_view text)
 {
-    const std::string_view question(asked ? static_cast<const char*>(asked) : "");
+    const std::string_view question(asked != nullptr ? static_cast<const char*>(asked) : "");
     // Not of a locale: the first use of one in a process calls the system.
     constexpr zebcore::utility::CaseInsensitive::EqualChar<char> equal;
-    return asked && std::equal(question.begin(), question.end(), text.begin(), text.end(), equal);
+    return asked != nullptr && std::equal(question.begin(), question.end(), text.begin(), text.end(), equal);
 }
 
 } // namespace zebaudiofilterhost::vst

@@ -23,9 +23,9 @@ struct ViewGeometry
     static constexpr int kMaxHeight = 4096;
     static constexpr std::size_t kMinRows = 3;
 
-    int width;
-    int height;
-    std::size_t rows;
+    int width = 0;
+    int height = 0;
+    std::size_t rows = 0;
     std::size_t first = 0; // of the rows shown
 
     /// As large as said at most, where the rows and the bounds above let it be so.
