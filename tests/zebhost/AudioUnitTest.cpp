@@ -207,6 +207,116 @@ TEST_F(AudioUnitTest, OtherToolsReadThePreset)
     }
 }
 
+// Bundles that lie where nothing looks for them, and no catalogue.
+class AudioUnitPathTest : public ZebhostTest
+{
+protected:
+    AudioUnitPathTest()
+    {
+        SearchIn(mFolder / "none");
+        mVariables["VST_PATH"] = Path("none");
+        mVariables["AUDIO_COMPONENT_PATH"] = Path("none");
+        WriteSound(Path("in.wav"), mInput);
+        MakeBundle("One", {{"aufx", "zgai", "Zeb: Zeb Unit Gain"}});
+        MakeBundle("Two", {{"aumu", "zins", "Zeb: Instrument"},
+                           {"aufx", "zgaa", "Zeb: Wide Gain"},
+                           {"aumf", "zgab", "Zeb: Narrow Gain"}});
+    }
+
+    struct Unit
+    {
+        const char* type;
+        const char* subType;
+        const char* name;
+    };
+
+    // The gain under these names.
+    void MakeBundle(const std::string& name, const std::vector<Unit>& units) const
+    {
+        namespace fs = std::filesystem;
+        const fs::path bundle = mFolder / "else" / (name + ".component");
+        fs::create_directories(bundle.parent_path());
+        fs::copy(fs::path(ZEB_UNITS) / "ZebUnitGain.component", bundle, fs::copy_options::recursive);
+        for (const fs::directory_entry& entry : fs::directory_iterator(bundle / "Contents"))
+        {
+            if (entry.is_directory())
+            {
+                fs::rename(entry.path() / "ZebUnitGain.so", entry.path() / (name + ".so"));
+            }
+        }
+        std::string list;
+        for (const Unit& unit : units)
+        {
+            list += std::string("<dict><key>type</key><string>") + unit.type + "</string><key>subtype</key><string>" +
+                    unit.subType + "</string><key>manufacturer</key><string>zebx</string><key>name</key><string>" +
+                    unit.name + "</string><key>factoryFunction</key><string>ZebUnitGainFactory</string></dict>";
+        }
+        WriteText(bundle / "Contents/Info.plist",
+                  "<?xml version=\"1.0\"?><plist version=\"1.0\"><dict><key>AudioComponents</key><array>" + list +
+                      "</array></dict></plist>");
+    }
+
+    const std::string mOne = Path("else/One.component");
+    const std::string mTwo = Path("else/Two.component");
+    const Sound mInput = MakeNoise(2, kFrames);
+};
+
+TEST_F(AudioUnitPathTest, ABundleWithOneUnitMeansThatUnit)
+{
+    EXPECT_EQ(Succeed({"info", mOne, "--json"}).Json().at("filter").at("id"), kGainID);
+    EXPECT_THAT(Succeed({"params", mOne}).out, HasSubstr("Gain"));
+    Succeed({"render", mOne, Path("in.wav"), Path("out.wav")});
+    EXPECT_TRUE(ReadSound(Path("out.wav")).channels == mInput.channels);
+    Succeed({"preset", "save", mOne, Path("kept.xml"), "--set", "Gain=-6"});
+    Succeed({"preset", "load", mOne + "/", Path("kept.xml")});
+    EXPECT_EQ(Succeed({"list", "--names"}).out, "") << "it was looked at, and not kept";
+}
+
+TEST_F(AudioUnitPathTest, ABundleWithSeveralUnitsWantsAName)
+{
+    const RunResult several = Run({"info", mTwo});
+    EXPECT_EQ(several.code, 3);
+    EXPECT_THAT(several.err,
+                testing::AllOf(HasSubstr("Wide Gain"), HasSubstr("Narrow Gain"), Not(HasSubstr("Instrument"))));
+    EXPECT_THAT(several.LastLine(), HasSubstr(mTwo + "#NAME"));
+    EXPECT_EQ(Succeed({"info", mTwo + "#narrow", "--json"}).Json().at("filter").at("name"), "Narrow Gain");
+}
+
+TEST_F(AudioUnitPathTest, ScansAndBlocksAllUnitsOfABundle)
+{
+    EXPECT_THAT(Succeed({"scan", mTwo}).LastLine(), HasSubstr("2 plug-ins scanned, 2 effects found"));
+    EXPECT_EQ(Succeed({"list", "--names"}).out, "Narrow Gain\nWide Gain\n");
+    EXPECT_THAT(Succeed({"scan", Path("else")}).LastLine(), HasSubstr("3 plug-ins scanned, 3 effects found"));
+
+    EXPECT_EQ(Succeed({"block", mTwo, "--json"}).Json().at("plugins").size(), 2U);
+    for (const std::string command : {"info", "scan"})
+    {
+        EXPECT_EQ(Run({command, mTwo}).code, 6) << command;
+    }
+    EXPECT_EQ(Run({"block", mTwo + "#Wide Gain"}).code, 3) << "as with all bundles";
+    Succeed({"unblock", "Wide Gain"});
+    EXPECT_EQ(Succeed({"info", mTwo, "--json"}).Json().at("filter").at("name"), "Wide Gain");
+    EXPECT_THAT(Succeed({"unblock", mTwo}).err, HasSubstr("Narrow Gain is not blocked any more"));
+    EXPECT_EQ(Run({"unblock", mTwo}).code, 3);
+}
+
+TEST_F(AudioUnitPathTest, SaysWhyABundleGivesNothing)
+{
+    MakeBundle("Instrument", {{"aumu", "zins", "Zeb: Instrument"}});
+    MakeBundle("Damaged", {});
+    WriteText(Path("else/Damaged.component/Contents/Info.plist"), "bplist00");
+    for (const char* command : {"info", "scan", "block"})
+    {
+        for (const char* name : {"else/Instrument.component", "else/Damaged.component"})
+        {
+            const RunResult result = Run({command, Path(name)});
+            EXPECT_EQ(result.code, 3) << command << name;
+            EXPECT_THAT(result.LastLine(), testing::AllOf(HasSubstr(name), HasSubstr("Info.plist"))) << command;
+        }
+    }
+    EXPECT_THAT(Run({"info", Path("else/None.component")}).LastLine(), HasSubstr("there is nothing at this path"));
+}
+
 class AudioUnitEditTest : public AudioUnitTest
 {
 protected:

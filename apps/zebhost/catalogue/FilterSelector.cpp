@@ -120,6 +120,34 @@ public:
     std::string mProblem;
 };
 
+// Of a path that is named like a plug-in; the sentence goes on with what such names end in.
+std::vector<PluginLocator> NamedPlugins(const std::string& path, const std::string& elseSay)
+{
+    if (!IsBundlePath(path))
+    {
+        throw Failure(ExitCode::NotFound, path + elseSay + kPluginNameEnds);
+    }
+    std::vector<PluginLocator> plugins = PluginsAt(path);
+    if (plugins.empty())
+    {
+        throw Failure(ExitCode::NotFound, path + kHoldsNoUnit);
+    }
+    return plugins;
+}
+
+// Throws if that leaves none.
+std::vector<PluginLocator> WithoutBlocked(const Catalogue& catalogue, const std::vector<PluginLocator>& plugins)
+{
+    std::vector<PluginLocator> usable;
+    std::copy_if(plugins.begin(), plugins.end(), std::back_inserter(usable),
+                 [&catalogue](const PluginLocator& locator) { return !catalogue.IsBlocked(locator); });
+    if (usable.empty())
+    {
+        throw Failure(ExitCode::Blocked, catalogue.BlockedBecause(plugins.front()));
+    }
+    return usable;
+}
+
 } // namespace
 
 FilterSelector::FilterSelector(const Catalogue& catalogue) : mCatalogue(catalogue)
@@ -153,20 +181,14 @@ Catalogue::Descriptor FilterSelector::Select(const std::string& text) const
     return found;
 }
 
-PluginLocator FilterSelector::SelectPlugin(const std::string& text) const
+std::vector<PluginLocator> FilterSelector::SelectPlugins(const std::string& text) const
 {
     if (!LooksLikeID(text) && (IsBundlePath(text) || text.find('/') != std::string::npos))
     {
-        const PluginLocator locator = BundleLocator(text);
-        if (locator.GetTechnologyType() == zebaudiofilterhost::kTechnologyNone)
-        {
-            throw Failure(ExitCode::NotFound,
-                          text + " is not named like a plug-in: its name ends in .vst3, .vst or .so");
-        }
-        return locator;
+        return NamedPlugins(text, " is not named like a plug-in: its name ends in ");
     }
     const auto byID = AudioFilterDescriptorManager::GetInstance().GetComponentDescriptorForID(FromUTF8(text));
-    return (byID != nullptr ? byID : FindByName(text))->GetLocator();
+    return {(byID != nullptr ? byID : FindByName(text))->GetLocator()};
 }
 
 Catalogue::Descriptor FilterSelector::FindByPath(const std::string& path, const std::string& className) const
@@ -175,20 +197,16 @@ Catalogue::Descriptor FilterSelector::FindByPath(const std::string& path, const 
     {
         throw Failure(ExitCode::NotFound, path + ": there is nothing at this path; check its spelling");
     }
-    const PluginLocator locator = BundleLocator(path);
-    if (locator.GetTechnologyType() == zebaudiofilterhost::kTechnologyNone)
+    const std::vector<PluginLocator> usable =
+        WithoutBlocked(mCatalogue, NamedPlugins(path, " is no plug-in: its name has to end in "));
+    const bool areAllKnown =
+        std::none_of(usable.begin(), usable.end(),
+                     [this](const PluginLocator& locator) { return mCatalogue.EffectsOf(locator).empty(); });
+    Descriptors fitting = Fitting(EffectsOf(usable), className);
+    if (fitting.empty() || !areAllKnown)
     {
-        throw Failure(ExitCode::NotFound, path + " is no plug-in: its name has to end in .vst3, .vst or .so");
-    }
-    if (mCatalogue.IsBlocked(locator))
-    {
-        throw Failure(ExitCode::Blocked, mCatalogue.BlockedBecause(locator));
-    }
-    Descriptors fitting = Fitting(mCatalogue.EffectsOf(locator), className);
-    if (fitting.empty())
-    {
-        ScanBundle(locator);
-        fitting = Fitting(mCatalogue.EffectsOf(locator), className);
+        Scan(usable);
+        fitting = Fitting(EffectsOf(usable), className);
     }
     if (fitting.size() == 1)
     {
@@ -198,10 +216,42 @@ Catalogue::Descriptor FilterSelector::FindByPath(const std::string& path, const 
         fitting.empty() ? path + " has no effect named " + className + " (instruments are not in the catalogue)"
                         : path + " has several effects that fit";
     throw Failure(ExitCode::NotFound, what + ": give one of the above as '" + path + "#NAME'",
-                  Candidates(fitting.empty() ? mCatalogue.EffectsOf(locator) : fitting));
+                  Candidates(fitting.empty() ? EffectsOf(usable) : fitting));
 }
 
-void FilterSelector::ScanBundle(const PluginLocator& locator) const
+Descriptors FilterSelector::EffectsOf(const std::vector<PluginLocator>& locators) const
+{
+    Descriptors effects;
+    for (const PluginLocator& locator : locators)
+    {
+        const Descriptors some = mCatalogue.EffectsOf(locator);
+        effects.insert(effects.end(), some.begin(), some.end());
+    }
+    return effects;
+}
+
+// One unit of several that fails does not keep the others away.
+void FilterSelector::Scan(const std::vector<PluginLocator>& locators) const
+{
+    std::optional<Failure> first;
+    for (const PluginLocator& locator : locators)
+    {
+        try
+        {
+            ScanOne(locator);
+        }
+        catch (const Failure& failure)
+        {
+            first = first ? first : failure;
+        }
+    }
+    if (first && EffectsOf(locators).empty())
+    {
+        throw Failure(*first);
+    }
+}
+
+void FilterSelector::ScanOne(const PluginLocator& locator) const
 {
     ProblemKeeper observer;
     ScanSession(nullptr, observer, {}).Run({locator});
@@ -211,8 +261,9 @@ void FilterSelector::ScanBundle(const PluginLocator& locator) const
     }
     if (mCatalogue.EffectsOf(locator).empty())
     {
-        throw Failure(ExitCode::NotFound, PathOf(locator) + " holds no effect: instruments are not in the catalogue, "
-                                                            "and classes that do not start up are left out");
+        throw Failure(ExitCode::NotFound, PlaceOf(locator) +
+                                              " holds no effect: instruments are not in the catalogue, "
+                                              "and classes that do not start up are left out");
     }
 }
 

@@ -3,6 +3,7 @@
 #include "catalogue/Catalogue.h"
 
 #include <string>
+#include <vector>
 
 namespace zebhost
 {
@@ -19,13 +20,17 @@ public:
     // none. Blocked plug-ins are refused.
     Catalogue::Descriptor Select(const std::string& text) const;
 
-    // The plug-in that a PLUGIN operand means: a path, or a filter as above. Blocked ones are not refused.
-    zebaudiofilterhost::PluginLocator SelectPlugin(const std::string& text) const;
+    // What a PLUGIN operand means: a path, or a filter as above. Never empty, and one, but for an Audio Unit bundle
+    // with several units. Blocked ones are not refused.
+    std::vector<zebaudiofilterhost::PluginLocator> SelectPlugins(const std::string& text) const;
 
 private:
     Catalogue::Descriptor FindByPath(const std::string& path, const std::string& className) const;
     Catalogue::Descriptor FindByName(const std::string& name) const;
-    void ScanBundle(const zebaudiofilterhost::PluginLocator& locator) const;
+    std::vector<Catalogue::Descriptor>
+    EffectsOf(const std::vector<zebaudiofilterhost::PluginLocator>& locators) const;
+    void Scan(const std::vector<zebaudiofilterhost::PluginLocator>& locators) const;
+    void ScanOne(const zebaudiofilterhost::PluginLocator& locator) const;
 
     const Catalogue& mCatalogue;
 };

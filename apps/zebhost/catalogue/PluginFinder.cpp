@@ -1,5 +1,6 @@
 #include "catalogue/PluginFinder.h"
 
+#include "catalogue/UnitBundle.h"
 #include "cli/Failure.h"
 #include "output/PrintableText.h"
 
@@ -29,10 +30,11 @@ using zebcore::filesupport::ToNativePath;
 namespace
 {
 
-constexpr std::array<std::pair<const char*, TechnologyType>, 3> kExtensions = {
+constexpr std::array<std::pair<const char*, TechnologyType>, 4> kExtensions = {
     {{".vst3", zebaudiofilterhost::kTechnologyVST3},
      {".vst", zebaudiofilterhost::kTechnologyVST},
-     {".so", zebaudiofilterhost::kTechnologyVST}}};
+     {".so", zebaudiofilterhost::kTechnologyVST},
+     {".component", zebaudiofilterhost::kTechnologyAudioUnit}}};
 
 // Bundles of other standards. Their binaries may export a VST 2 entry point too.
 constexpr std::array<const char*, 2> kForeignExtensions = {".lv2", ".clap"};
@@ -109,7 +111,8 @@ void SearchFolder(const fs::path& folder, std::set<fs::path>& seen, std::vector<
     {
         if (IsBundlePath(child))
         {
-            found.push_back(BundleLocator(child));
+            const std::vector<PluginLocator> inside = PluginsAt(child);
+            found.insert(found.end(), inside.begin(), inside.end());
         }
         else
         {
@@ -120,15 +123,27 @@ void SearchFolder(const fs::path& folder, std::set<fs::path>& seen, std::vector<
 
 } // namespace
 
+const char* const kPluginNameEnds = ".vst3, .vst, .component or .so";
+const char* const kHoldsNoUnit =
+    " tells of no effect: its Contents/Info.plist lists no unit that is an effect, a mixer or a panner, or is no XML";
+
 bool IsBundlePath(const fs::path& path)
 {
     return TechnologyOf(Normal(path)) != zebaudiofilterhost::kTechnologyNone;
 }
 
-PluginLocator BundleLocator(const fs::path& path)
+std::vector<PluginLocator> PluginsAt(const fs::path& path)
 {
     const fs::path normal = Normal(path);
-    return {TechnologyOf(normal), FromNativePath(normal.string())};
+    switch (const TechnologyType type = TechnologyOf(normal))
+    {
+    case zebaudiofilterhost::kTechnologyNone:
+        return {};
+    case zebaudiofilterhost::kTechnologyAudioUnit:
+        return UnitsOf(normal);
+    default:
+        return {{type, FromNativePath(normal.string())}};
+    }
 }
 
 std::string PathOf(const PluginLocator& locator)
@@ -184,14 +199,18 @@ std::vector<PluginLocator> FindPlugins(const fs::path& path)
     }
     if (IsBundlePath(path))
     {
-        return {BundleLocator(path)};
+        std::vector<PluginLocator> plugins = PluginsAt(path);
+        if (plugins.empty())
+        {
+            throw Failure(ExitCode::NotFound, path.string() + kHoldsNoUnit);
+        }
+        return plugins;
     }
     if (!fs::is_directory(path, error))
     {
-        throw Failure(ExitCode::NotFound,
-                      path.string() +
-                          " is no plug-in: give a bundle or file whose name ends in .vst3, .vst or .so, or a "
-                          "folder that holds such");
+        throw Failure(ExitCode::NotFound, path.string() +
+                                              " is no plug-in: give a bundle or file whose name ends in " +
+                                              kPluginNameEnds + ", or a folder that holds such");
     }
     std::vector<PluginLocator> found;
     std::set<fs::path> seen;

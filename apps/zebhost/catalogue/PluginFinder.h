@@ -13,8 +13,13 @@ namespace zebhost
 // opened.
 bool IsBundlePath(const std::filesystem::path& path);
 
-// The locator of a plug-in: an absolute path without dots in it. Type 0 if IsBundlePath is false.
-zebaudiofilterhost::PluginLocator BundleLocator(const std::filesystem::path& path);
+// The locators of what is at the path: one, with an absolute path without dots in it, but for an Audio Unit bundle
+// one for each unit in it. None if IsBundlePath is false.
+std::vector<zebaudiofilterhost::PluginLocator> PluginsAt(const std::filesystem::path& path);
+
+// Ends of sentences: what such names end in, and what to say of an Audio Unit bundle in which there is none.
+extern const char* const kPluginNameEnds;
+extern const char* const kHoldsNoUnit;
 
 std::string PathOf(const zebaudiofilterhost::PluginLocator& locator);
 

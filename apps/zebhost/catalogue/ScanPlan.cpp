@@ -201,7 +201,11 @@ ScanPlan PlanPathScan(const Catalogue& catalogue, const std::vector<std::string>
     for (const std::string& path : paths)
     {
         const std::vector<PluginLocator> below = FindPlugins(path);
-        if (IsBundlePath(path) && catalogue.IsBlocked(below.front()) && planner.WhyOffered(below.front()) == nullptr)
+        const bool isRefused =
+            std::all_of(below.begin(), below.end(),
+                        [&](const PluginLocator& locator)
+                        { return catalogue.IsBlocked(locator) && planner.WhyOffered(locator) == nullptr; });
+        if (IsBundlePath(path) && isRefused)
         {
             throw Failure(ExitCode::Blocked, catalogue.BlockedBecause(below.front()));
         }

@@ -30,8 +30,9 @@ CommandSpec ScanSpec()
         "Without a PATH the standard places are searched: for VST 3 $VST3_PATH, or else ~/.vst3, "
         "/usr/local/lib/vst3 and /usr/lib/vst3; for VST 2 $VST_PATH, or else /usr/lib/vst, /usr/lib/lxvst, "
         "/usr/local/lib/vst, ~/.vst and ~/.lxvst. Plug-ins that are in the catalogue already are loaded again only "
-        "if their binary has changed, and those that have gone are dropped. A PATH is a plug-in (a .vst3 or .vst "
-        "bundle, or a .so file) or a folder to search; what is found there is always scanned anew. Plug-ins are "
+        "if their binary has changed, and those that have gone are dropped. A PATH is a plug-in (a .vst3, .vst or "
+        ".component bundle, or a .so file) or a folder to search; what is found there is always scanned anew. "
+        "Plug-ins are "
         "loaded in a process of their own, and the catalogue is saved after each. One that crashes, or does not "
         "answer in time, is blocked, and the scan goes on; it is tried again when its binary has changed. Ctrl-C "
         "ends the scan with everything saved and nothing blocked.",

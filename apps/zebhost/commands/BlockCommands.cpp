@@ -34,15 +34,32 @@ bool IsPlace(const PluginLocator& locator, const std::string& text)
            (place != PathOf(locator) && colon != std::string::npos && Trimmed(place.substr(colon + 1)) == text);
 }
 
-// A blocked plug-in may be gone from disk and catalogue, so its file name alone will do.
-PluginLocator BlockedPlugin(const CommandContext& context, const std::string& text)
+std::vector<PluginLocator> BlockedAt(const std::string& path)
 {
+    std::vector<PluginLocator> blocked;
+    for (const PluginLocator& locator : PluginsAt(path))
+    {
+        if (BannedPluginManager::GetInstance().IsPluginBanned(locator))
+        {
+            blocked.push_back(locator);
+        }
+    }
+    return blocked;
+}
+
+// A blocked plug-in may be gone from disk and catalogue, so its file name alone will do.
+std::vector<PluginLocator> BlockedPlugins(const CommandContext& context, const std::string& text)
+{
+    if (std::vector<PluginLocator> there = BlockedAt(text); !there.empty())
+    {
+        return there;
+    }
     std::vector<PluginLocator> fitting;
     for (const PluginLocator& locator : Blocked())
     {
         const std::filesystem::path path = PathOf(locator);
-        if (path == text || path.filename() == text || path.stem() == text || locator == BundleLocator(text) ||
-            SelectorOf(locator) == text || IsPlace(locator, text))
+        if (path == text || path.filename() == text || path.stem() == text || SelectorOf(locator) == text ||
+            IsPlace(locator, text))
         {
             fitting.push_back(locator);
         }
@@ -54,26 +71,35 @@ PluginLocator BlockedPlugin(const CommandContext& context, const std::string& te
     }
     if (fitting.empty())
     {
-        const PluginLocator locator = FilterSelector(context.catalogue).SelectPlugin(text);
-        if (!BannedPluginManager::GetInstance().IsPluginBanned(locator))
+        fitting = FilterSelector(context.catalogue).SelectPlugins(text);
+        if (!BannedPluginManager::GetInstance().IsPluginBanned(fitting.front()))
         {
-            throw Failure(ExitCode::NotFound, PlaceOf(locator) + " is not blocked: 'zebhost blocks' shows what is");
+            throw Failure(ExitCode::NotFound,
+                          PlaceOf(fitting.front()) + " is not blocked: 'zebhost blocks' shows what is");
         }
-        return locator;
     }
-    return fitting.front();
+    return fitting;
 }
 
-void Tell(const CommandContext& context, const PluginLocator& locator, const std::string& what)
+// The JSON names the first at its top, and all in a list.
+void Tell(const CommandContext& context, const std::vector<PluginLocator>& locators, const std::string& what)
 {
     if (context.WantsJson())
     {
         Json document = context.NewDocument();
-        document["path"] = PathOf(locator);
-        document["place"] = PlaceOf(locator);
+        document["path"] = PathOf(locators.front());
+        document["place"] = PlaceOf(locators.front());
+        document["plugins"] = Json::array();
+        for (const PluginLocator& locator : locators)
+        {
+            document["plugins"].push_back(Json{{"path", PathOf(locator)}, {"place", PlaceOf(locator)}});
+        }
         context.Print(document);
     }
-    context.console.Remark("zebhost: " + PlaceOf(locator) + what);
+    for (const PluginLocator& locator : locators)
+    {
+        context.console.Remark("zebhost: " + PlaceOf(locator) + what);
+    }
 }
 
 // So that the next scan tries it.
@@ -91,22 +117,29 @@ void ForgetProblem(Catalogue& catalogue, const PluginLocator& locator)
 
 ExitCode RunBlock(CommandContext& context)
 {
-    const PluginLocator locator = FilterSelector(context.catalogue).SelectPlugin(context.arguments.Text("PLUGIN"));
+    const std::vector<PluginLocator> locators =
+        FilterSelector(context.catalogue).SelectPlugins(context.arguments.Text("PLUGIN"));
     BlockReason why;
     why.reason = context.arguments.Text("reason", "blocked by hand");
     why.since = TimeOfNow();
     why.isByHand = true;
-    context.catalogue.Block(locator, why);
-    Tell(context, locator, " is blocked; 'zebhost unblock' lets it be used again");
+    for (const PluginLocator& locator : locators)
+    {
+        context.catalogue.Block(locator, why);
+    }
+    Tell(context, locators, " is blocked; 'zebhost unblock' lets it be used again");
     return ExitCode::Done;
 }
 
 ExitCode RunUnblock(CommandContext& context)
 {
-    const PluginLocator locator = BlockedPlugin(context, context.arguments.Text("PLUGIN"));
-    context.catalogue.Unblock(locator);
-    ForgetProblem(context.catalogue, locator);
-    Tell(context, locator, " is not blocked any more; the next 'zebhost scan' tries it");
+    const std::vector<PluginLocator> locators = BlockedPlugins(context, context.arguments.Text("PLUGIN"));
+    for (const PluginLocator& locator : locators)
+    {
+        context.catalogue.Unblock(locator);
+        ForgetProblem(context.catalogue, locator);
+    }
+    Tell(context, locators, " is not blocked any more; the next 'zebhost scan' tries it");
     return ExitCode::Done;
 }
 

@@ -7,6 +7,7 @@
 #include "output/TextTable.h"
 
 #include <algorithm>
+#include <set>
 
 namespace zebhost
 {
@@ -106,11 +107,17 @@ bool ScanReport::ShallStop() const
 
 std::optional<Failure> ScanReport::FailureOf(const std::vector<std::string>& paths) const
 {
-    const auto isNamed = [&paths](const Result& result)
+    std::set<std::string> named;
+    for (const std::string& path : paths)
     {
-        return std::any_of(paths.begin(), paths.end(),
-                           [&result](const std::string& path)
-                           { return IsBundlePath(path) && PathOf(BundleLocator(path)) == result.path; });
+        for (const PluginLocator& locator : PluginsAt(path))
+        {
+            named.insert(PathOf(locator));
+        }
+    }
+    const auto isNamed = [&named](const Result& result)
+    {
+        return named.count(result.path) != 0;
     };
     const auto found =
         std::find_if(mResults.begin(), mResults.end(),

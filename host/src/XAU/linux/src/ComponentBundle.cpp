@@ -142,6 +142,8 @@ std::vector<ComponentListing> ReadComponentBundle(const UTF16String& path)
 std::vector<UTF16String> FindComponentBundles()
 {
     std::vector<UTF16String> bundles;
+    for (const Dir& bundle : GetSearchPath("AUDIO_COMPONENT_BUNDLES", {}))
+        bundles.push_back(bundle.FullPath());
     std::set<UTF16String> walked;
     const auto folders =
         GetSearchPath("AUDIO_COMPONENT_PATH", {"~/.components", "/usr/local/lib/components", "/usr/lib/components"});

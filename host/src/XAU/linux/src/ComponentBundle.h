@@ -24,7 +24,8 @@ struct ComponentListing
 /// loaded. [main]
 std::vector<ComponentListing> ReadComponentBundle(const UTF16String& path);
 
-/// Paths of the bundles in the folders of components and below them, in a fixed order. [main]
+/// Paths of the bundles that $AUDIO_COMPONENT_BUNDLES lists, then of those in the folders of components and below
+/// them, in a fixed order. [main]
 std::vector<UTF16String> FindComponentBundles();
 
 } // namespace zebaudiofilterhost::xau
