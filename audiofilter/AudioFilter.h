@@ -105,10 +105,17 @@ public:
     /// size. A set bit of inFlags says that the input holds silence: its buffer is not given to the plug-in, but with
     /// mapping it must still be there and be zero, since what passes by is read. A set bit of outFlags says that
     /// the output may be taken as silent without reading it; the plug-in's own bits come in its channel order. The
-    /// input and the output of a channel may be one buffer; no others may overlap.
-    /// [process]
+    /// input and the output of a channel may be one buffer, and channels that pass by may exchange theirs; no others
+    /// may overlap. [process]
     virtual void ProcessWithMapping(float** in, float** out, int frames, ChannelFlags inFlags,
                                     ChannelFlags& outFlags);
+
+    /// Sizes the render arrays, the scratch buffers and the delay line. Resume calls it. [main, suspended]
+    void BuildChannelMaps();
+
+    /// Rewrites the render arrays in place, so that running audio follows the maps; arrays whose size has changed
+    /// wait for Resume. Whatever edits a map calls it. [main]
+    void UpdateChannelMapArraysForRendering();
 
     /// Whether the filter works on a whole selection at once; false here. [main]
     virtual bool IsOfflineProcess() const;
@@ -428,9 +435,6 @@ public:
     boost::signals2::connection ConnectSuspendedStateChanged(const SuspendedStateChangedSignal::slot_type& slot);
 
 protected:
-    /// Sizes the render arrays, the scratch buffers and the delay line. Resume calls it. [main, suspended]
-    void BuildChannelMaps();
-
     /// False as long as nobody has asked for the automated-parameter signal: then firing it, which locks and counts
     /// even when nobody listens, can be left out. [any]
     bool CanAutomationBeHeard() const { return mAutomationCanBeHeard.load(std::memory_order_relaxed); }
@@ -442,10 +446,6 @@ protected:
         if (CanAutomationBeHeard())
             mAutomatedParameterChangeSignal(index, value);
     }
-
-    /// Rewrites the render arrays in place, so that running audio follows the maps; arrays whose size has changed
-    /// wait for Resume. [main]
-    void UpdateChannelMapArraysForRendering();
 
 private:
     friend class AudioFilterProxy; // Takes over the sample rate and block size of the filter that it stands in for
@@ -471,6 +471,7 @@ private:
     void MarkSilentChannels(ChannelFlags& flags);
     void PassChannels(float** in, float** out, int frames, ChannelFlags& flags);
     void PassAtOnce(float** in, float** out, unsigned int frames, ChannelFlags& flags);
+    bool PassesCrossed(float** in, float** out);
     void PassDelayed(float** in, float** out, unsigned int frames, ChannelFlags& flags);
 
     // The order is that of destruction, backwards: the connection to the tick goes before the signals above it. No

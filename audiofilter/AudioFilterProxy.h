@@ -4,6 +4,8 @@
 #include "audiofilter/AudioFilter.h"
 #include "audiofilter/GenericParameterInfo.h"
 
+#include <atomic>
+#include <deque>
 #include <memory>
 #include <vector>
 
@@ -30,7 +32,7 @@ public:
     int GetParameterCount() const override;
 
     /// Stores the value, so that GetParameter gives it; not part of the settings. An index out of range only counts
-    /// as a change. [main]
+    /// as a change. [main when suspended, process while it runs]
     void SetParameter(int index, float value) override;
     float GetParameter(int index) const override;
     boost::intrusive_ptr<AudioFilterParameterInfo> GetParameterInfo(int index) const override;
@@ -58,7 +60,7 @@ private:
     std::unique_ptr<PropList> mZombieList;
     PresetData mZombiePreset;
     std::vector<boost::intrusive_ptr<GenericParameterInfo>> mParameterInfos;
-    std::vector<float> mParameterValues;
+    std::deque<std::atomic<float>> mParameterValues; // of which none moves
     bool mUsesChunkData;
 };
 

@@ -4,6 +4,7 @@
 #include "foundation/zebcore/Export.h"
 #include "foundation/zebcore/RefCountedObject.h"
 
+#include <cstdint>
 #include <memory>
 
 namespace zebaudiofilterhost
@@ -44,21 +45,22 @@ public:
     /// size. Does not allocate. [process]
     void WriteData(float** channelData, unsigned int frames);
 
-    /// One pointer a channel to `frames` delayed samples, for the block just written. Null on an invalid line, or
-    /// with more frames than the buffer size. Valid until the next operation. Does not allocate. [process]
+    /// One pointer a channel to `frames` delayed samples, for the block just written. Null on an invalid line, or if
+    /// so many frames reach back beyond what the line keeps. Valid until the next operation. Does not allocate.
+    /// [process]
     float** GetDelayedOutput(unsigned int frames);
 
     /// Copies one channel's delayed samples for the block just written, without the detour over the room past the
-    /// ring's end. False, with nothing written, on an invalid line, without such a channel, or with more frames than
-    /// the buffer size. Does not allocate. [process]
+    /// ring's end. False, with nothing written, on an invalid line, without such a channel, or if so many frames
+    /// reach back beyond what the line keeps. Does not allocate. [process]
     bool CopyDelayedOutput(unsigned int channel, unsigned int frames, float* target) const;
 
 private:
     /// Where a block of so many frames, the last that was written, lies in the ring.
     struct Place
     {
-        int start;
-        int past; // Frames that lie at the ring's start and belong behind its end; may be negative
+        std::int64_t start;
+        std::int64_t past; // Frames that lie at the ring's start and belong behind its end; may be negative
     };
     Place FindDelayed(unsigned int frames) const;
 

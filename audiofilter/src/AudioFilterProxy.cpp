@@ -65,14 +65,16 @@ void AudioFilterProxy::SetParameter(int index, float value)
 {
     if (IsParameter(index))
     {
-        mParameterValues[static_cast<std::size_t>(index)] = value;
+        mParameterValues[static_cast<std::size_t>(index)].store(value, std::memory_order_relaxed);
     }
     AudioFilter::SetParameter(index, value);
 }
 
 float AudioFilterProxy::GetParameter(int index) const
 {
-    return IsParameter(index) ? mParameterValues[static_cast<std::size_t>(index)] : 0.0F;
+    if (!IsParameter(index))
+        return 0.0F;
+    return mParameterValues[static_cast<std::size_t>(index)].load(std::memory_order_relaxed);
 }
 
 boost::intrusive_ptr<AudioFilterParameterInfo> AudioFilterProxy::GetParameterInfo(int index) const
@@ -139,7 +141,7 @@ bool AudioFilterProxy::IsParameter(int index) const
 void AudioFilterProxy::AppendParameter(float value, AudioFilterParameterInfoUnit unit, bool canBeAutomated)
 {
     const int index = static_cast<int>(mParameterValues.size());
-    mParameterValues.push_back(value);
+    mParameterValues.emplace_back(value);
     mParameterInfos.push_back(new GenericParameterInfo(UTF16String(), UTF16String(), unit, index, 0.0F, 1.0F,
                                                        canBeAutomated, false, kFirstCount, kSecondCount));
 }

@@ -107,10 +107,30 @@ void AudioFilter::PassChannels(float** in, float** out, int frames, ChannelFlags
     if (mDelayedChannels.empty() || !mDelayLine)
         return;
     const auto count = static_cast<unsigned int>(frames);
-    if (mDelaying)
+    if (mDelaying || PassesCrossed(in, out))
         PassDelayed(in, out, count, flags);
     else
         PassAtOnce(in, out, count, flags);
+}
+
+// Whether the output of one channel is the input of a later one, which has to be taken in before.
+bool AudioFilter::PassesCrossed(float** in, float** out)
+{
+    for (std::size_t i = 0; i < mDelayedChannels.size(); ++i)
+    {
+        const int channel = Load(mDelayedChannels[i]);
+        if (channel < 0)
+            return false;
+        if (in[channel] == out[channel])
+            continue;
+        for (std::size_t later = i + 1; later < mDelayedChannels.size(); ++later)
+        {
+            const int other = Load(mDelayedChannels[later]);
+            if (other >= 0 && in[other] == out[channel])
+                return true;
+        }
+    }
+    return false;
 }
 
 // Without latency the line would give back what was just written: nothing of it is ever needed again.

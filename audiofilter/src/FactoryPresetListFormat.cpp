@@ -97,7 +97,9 @@ void FormatFactoryPresetList(const boost::intrusive_ptr<PresetList>& list)
     for (const Row& row : rows)
         WriteRow(text, row, reference, &row == &rows.front());
     text << "};\n";
-    zebcore::debug::DebugTrace(reinterpret_cast<const unsigned char*>(text.str().c_str()));
+    UTF8String whole = text.str();
+    std::erase(whole, u8'\0'); // A name may have one, which would end the print-out
+    zebcore::debug::DebugTrace(reinterpret_cast<const unsigned char*>(whole.c_str()));
 }
 
 } // namespace zebaudiofilterhost

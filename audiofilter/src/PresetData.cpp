@@ -4,6 +4,7 @@
 #include "foundation/zebcore/PropListUtils.h"
 #include "foundation/zebcore/PropListVisitor.h"
 
+#include <typeinfo>
 #include <utility>
 
 namespace zebaudiofilterhost
@@ -115,8 +116,12 @@ bool PresetData::GetChunkData(std::vector<unsigned char>& chunk) const
 {
     chunk.clear();
     ChunkDecoder decoder(chunk);
-    if (mPropList != nullptr)
+    if (mPropList == nullptr)
+        return false;
+    if (typeid(*mPropList) == typeid(PropList))
         mPropList->Visit(decoder);
+    else if (UTF8String text; mPropList->GetValue(kChunkDataKey, text)) // A list may get its values from elsewhere
+        decoder.VisitValue(kChunkDataKey, text);
     return decoder.IsDecoded();
 }
 

@@ -5,13 +5,13 @@
 namespace zebcore::utility
 {
 
-/// Set of flags over an unsigned integer. Default empty.
+/// Set of flags over an unsigned integer, which converts to the set of its bits. Default empty.
 template <std::unsigned_integral T>
 class Flags
 {
 public:
     constexpr Flags() = default;
-    constexpr explicit Flags(T value) : mValue(value) {}
+    constexpr Flags(T value) : mValue(value) {} // NOLINT(google-explicit-constructor)
 
     constexpr T Value() const { return mValue; }
     /// True when any flag of the mask is set.

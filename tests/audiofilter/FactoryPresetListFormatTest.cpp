@@ -58,6 +58,13 @@ TEST_F(FactoryPresetListFormat, PrintsATableWithPlaceholdersForWhatDiffers)
                      "};\n");
 }
 
+TEST_F(FactoryPresetListFormat, AZeroInANameEndsNothing)
+{
+    Add(UTF16String(u"A\0", 2), 1.0F, PresetData::kPresetType_Params, {0.5F});
+    FormatFactoryPresetList(mPresets);
+    EXPECT_TRUE(mText.ends_with("\t  { \"A\", {   0.50000000f}}\n};\n")) << mText;
+}
+
 TEST_F(FactoryPresetListFormat, PrintsNothingWithoutAPresetOfParameters)
 {
     FormatFactoryPresetList(boost::intrusive_ptr<PresetList>());

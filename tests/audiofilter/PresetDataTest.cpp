@@ -5,6 +5,7 @@
 
 #include <functional>
 #include <limits>
+#include <map>
 
 namespace zebaudiofilterhost
 {
@@ -95,6 +96,45 @@ TEST(PresetData, StoresUnderItsKeys)
     EXPECT_TRUE(list.GetValue(u8"Type", type) && type == 2);
     EXPECT_TRUE(list.GetValue(u8"FactoryPreset", name) && name == u"Hall");
     EXPECT_TRUE(list.GetValue(u8"FactoryIndex", index) && index == 7);
+}
+
+// Keeps nothing itself, and what it is given in another form.
+class MaskedList final : public PropList
+{
+public:
+    using PropList::GetValue;
+    using PropList::SetValue;
+
+    void SetValue(const UTF8String& key, const UTF8String& value) override { mTexts[key] = Masked(value); }
+    bool GetValue(const UTF8String& key, UTF8String& value) const override
+    {
+        const auto found = mTexts.find(key);
+        if (found != mTexts.end())
+            value = Masked(found->second);
+        return found != mTexts.end();
+    }
+
+private:
+    static UTF8String Masked(UTF8String text)
+    {
+        for (char8_t& unit : text)
+            unit = static_cast<char8_t>(unit ^ 1U);
+        return text;
+    }
+
+    std::map<UTF8String, UTF8String> mTexts;
+};
+
+TEST(PresetData, ChunksGoThroughTheAccessorsOfAListOfAnotherKind)
+{
+    MaskedList list;
+    PresetData preset(list);
+    const std::vector<unsigned char> bytes{1, 2, 3, 250};
+    std::vector<unsigned char> read;
+    EXPECT_FALSE(preset.GetChunkData(read));
+    preset.SetChunkData(bytes.data(), bytes.size());
+    EXPECT_TRUE(preset.GetChunkData(read));
+    EXPECT_EQ(read, bytes);
 }
 
 TEST(PresetData, ChunksComeBackAndEmptyOnesCountAsMissing)

@@ -45,9 +45,6 @@ public:
     void RequestIOConfiguration(const std::vector<ChannelLayout>& inputs,
                                 const std::vector<ChannelLayout>& outputs) override;
 
-    using AudioFilter::BuildChannelMaps;
-    using AudioFilter::UpdateChannelMapArraysForRendering;
-
     std::vector<ProcessCall> mProcessCalls;
     std::vector<ParameterCall> mParameterCalls;
     ChannelFlags mOutFlagsToReport;

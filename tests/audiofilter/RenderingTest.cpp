@@ -7,6 +7,8 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <algorithm>
+#include <array>
 #include <cfenv>
 #include <limits>
 #include <stdexcept>
@@ -186,6 +188,25 @@ TEST_F(RenderingTest, PassingChannelsAreDelayedByTheLatency)
                 ASSERT_EQ(mOut.Channel(2)[i], std::max(expected, 0.0F)) << "latency " << latency;
             }
         }
+    }
+}
+
+TEST_F(RenderingTest, PassingChannelsMayExchangeTheirBuffers)
+{
+    for (const int latency : {0, 1})
+    {
+        Start({1}, {1}, 4, {{3, 0}}, {{3, 0}}, latency);
+        for (int channel = 0; channel < 3; ++channel)
+            std::fill_n(mIn.Channel(channel), kFrames, static_cast<float>(channel + 1));
+        float** const in = mIn.Pointers();
+        std::array<float*, kChannels> out{};
+        std::copy_n(mOut.Pointers(), kChannels, out.begin());
+        std::copy_n(in, 3, out.begin());
+        std::rotate(out.begin(), out.begin() + 1, out.begin() + 3);
+        mFilter->ProcessWithMapping(in, out.data(), kFrames, ChannelFlags(), mFlags);
+        EXPECT_EQ(out[0][kFrames - 1], 1.0F) << latency;
+        EXPECT_EQ(out[1][kFrames - 1], 2.0F) << latency;
+        EXPECT_EQ(out[2][kFrames - 1], 3.0F) << latency;
     }
 }
 

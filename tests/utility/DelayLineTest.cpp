@@ -92,7 +92,30 @@ TEST(DelayLine, BlockAboveTheBufferSizeChangesNothing)
     Source source;
     line->WriteData(source.Next(5), 5);
     EXPECT_EQ(line->GetDelayedOutput(4)[0][3], 4.0F);
-    EXPECT_EQ(line->GetDelayedOutput(5), nullptr);
+}
+
+TEST(DelayLine, ABlockAboveTheBufferSizeIsReadForAsFarAsTheLineReaches)
+{
+    const auto line = LineWithSamples(10);
+    Source source;
+    for (const unsigned int frames : {4U, 4U, 2U})
+        line->WriteData(source.Next(frames), frames);
+    // At the ring's end: 14 frames, of which 10 wait.
+    std::array<float, 15> copied{};
+    for (unsigned int frames = 5; frames <= 14; ++frames)
+    {
+        float** const out = line->GetDelayedOutput(frames);
+        ASSERT_NE(out, nullptr) << frames;
+        ASSERT_TRUE(line->CopyDelayedOutput(1, frames, copied.data())) << frames;
+        EXPECT_EQ(out[0][frames - 1], 4.0F) << frames;
+        for (unsigned int i = 0; i < frames; ++i)
+            EXPECT_EQ(copied[i], out[1][i]) << frames;
+    }
+    for (const unsigned int frames : {19U, 0x7fffffffU, 0xffffffffU})
+    {
+        EXPECT_EQ(line->GetDelayedOutput(frames), nullptr) << frames;
+        EXPECT_FALSE(line->CopyDelayedOutput(1, frames, copied.data())) << frames;
+    }
 }
 
 TEST(DelayLine, SameBufferSizeKeepsTheContentAndAnyDelayEmptiesIt)

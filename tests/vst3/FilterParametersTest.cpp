@@ -133,12 +133,12 @@ TEST(FilterParameters, CountsThatLieAreNotBelieved)
     EXPECT_EQ(plugin.MakeFilter()->GetParameterCount(), 2);
     plugin.parameterCount = -7;
     EXPECT_EQ(plugin.MakeFilter()->GetParameterCount(), 0);
-    // A few that can't be read stay, as parameters without a name.
-    plugin.parameterCount = 4;
+    // Those that can't be read stay, as parameters without a name.
+    plugin.parameterCount = 5000;
     const auto filter = plugin.MakeFilter();
-    ASSERT_EQ(filter->GetParameterCount(), 4);
-    EXPECT_TRUE(filter->GetParameterInfo(3)->GetName().empty());
-    EXPECT_FALSE(filter->GetParameterInfo(3)->IsExposed());
+    ASSERT_EQ(filter->GetParameterCount(), 5000);
+    EXPECT_TRUE(filter->GetParameterInfo(4999)->GetName().empty());
+    EXPECT_FALSE(filter->GetParameterInfo(4999)->IsExposed());
 }
 
 TEST(FilterParameters, EditsReachTheApplication)
@@ -280,6 +280,9 @@ TEST(FilterPresets, CountIsTheRootUnitsAndNamesAreTheFirstLists)
     const auto filter = plugin.MakeFilter();
     EXPECT_EQ(filter->GetNumFactoryPresets(), 5);
     EXPECT_TRUE(filter->GetFactoryPresetName(1) == u"First 1");
+    plugin.programLists.front().count = 7; // More than the root unit's
+    EXPECT_TRUE(filter->GetFactoryPresetName(6) == u"First 6");
+    plugin.programLists.front().count = 2;
     EXPECT_TRUE(filter->GetFactoryPresetName(2).empty());
     EXPECT_TRUE(filter->GetFactoryPresetName(-1).empty());
     EXPECT_TRUE(filter->GetFactoryPresetName(5).empty());

@@ -97,19 +97,31 @@ TEST_F(FilterState, EmptyComponentStateIsLoadedAndEmptyControllerStateIsNot)
     EXPECT_THAT(plugin.Calls(), ElementsAre("component.setState ", "controller.setComponentState "));
 }
 
-TEST_F(FilterState, ChunksThatLieChangeNothing)
+TEST_F(FilterState, OfAChunkThatLiesTheStatesThatAreThereComeBack)
 {
     const auto filter = plugin.MakeFilter();
-    plugin.ClearCalls();
     const std::uint64_t huge = ~std::uint64_t(0);
-    for (const Chunk& chunk :
-         {MakeChunk(10, 0, "0123"), MakeChunk(huge, 0, "0123"), MakeChunk(0x100000004, 0, "0123"),
-          MakeChunk(2, 3, "0123"), MakeChunk(4, huge, "0123"), MakeChunk(huge, 5, "0123"), Chunk(15, 0), Chunk(1, 7)})
+    const std::vector<std::string> none;
+    const auto both = [](const std::string& state)
     {
+        return std::vector{"component.setState " + state, "controller.setComponentState " + state};
+    };
+    for (const auto& [chunk, calls] : std::initializer_list<std::pair<Chunk, std::vector<std::string>>>{
+             {MakeChunk(10, 0, "0123"), none},
+             {MakeChunk(10, 5, "0123"), none},
+             {MakeChunk(huge, 0, "0123"), none},
+             {Chunk(1, 7), none},
+             {MakeChunk(2, 3, "0123"), both("01")},
+             {MakeChunk(4, huge, "0123"), both("0123")},
+             {MakeChunk(0x100000004, 0, "0123"), both("0123")},
+             {Chunk(15, 0), both("")},
+             {MakeChunk(0x80000000, 4, "0123"), {"controller.setState 0123"}}})
+    {
+        plugin.ClearCalls();
         preset.SetChunkData(chunk.data(), chunk.size());
-        EXPECT_TRUE(filter->LoadChunkData(preset)) << chunk.size();
+        EXPECT_TRUE(filter->LoadChunkData(preset));
+        EXPECT_EQ(plugin.Calls(), calls) << chunk.size();
     }
-    EXPECT_TRUE(plugin.Calls().empty());
 }
 
 TEST_F(FilterState, PresetWithoutChunkIsRefused)

@@ -94,8 +94,8 @@ TEST(VST3ClassList, SurvivesCountsThatLie)
     EXPECT_EQ(ListAudioClasses(fewBehindAGap).size(), 2U);
     EXPECT_LT(fewBehindAGap.GetCalls(), 10000);
     FakeFactory endless(kHuge, [](int32) { return "Audio Module Class"; });
-    EXPECT_LT(ListAudioClasses(endless).size(), 20000U);
-    EXPECT_LT(endless.GetCalls(), 20000);
+    EXPECT_LT(ListAudioClasses(endless).size(), 40000U);
+    EXPECT_LT(endless.GetCalls(), 40000);
 }
 
 } // namespace

@@ -50,18 +50,20 @@ void DelayLine::AppendWrapped(float** channelData, unsigned int frames)
 
 DelayLine::Place DelayLine::FindDelayed(unsigned int frames) const
 {
-    const int ringLength = static_cast<int>(mRingLength);
-    const int tail = static_cast<int>(mWritePosition) - static_cast<int>(mDelay);
-    const int wrap = tail - static_cast<int>(frames) < 0 ? ringLength : 0;
-    return {tail - static_cast<int>(frames) + wrap, tail + wrap - ringLength};
+    const std::int64_t ringLength = mRingLength;
+    const std::int64_t tail = std::int64_t{mWritePosition} - mDelay;
+    const std::int64_t wrap = tail - frames < 0 ? ringLength : 0;
+    return {tail - frames + wrap, tail + wrap - ringLength};
 }
 
 float** DelayLine::GetDelayedOutput(unsigned int frames)
 {
-    if (!mValid || frames > mBufferSize) // A larger block would begin in front of the ring
+    if (!mValid)
+        return nullptr;
+    const Place place = FindDelayed(frames);
+    if (place.start < 0) // More frames than a block has may begin in front of the ring
         return nullptr;
 
-    const Place place = FindDelayed(frames);
     for (unsigned int channel = 0; channel < mChannels; ++channel)
     {
         float* samples = mChannelPointers[channel];
@@ -74,10 +76,12 @@ float** DelayLine::GetDelayedOutput(unsigned int frames)
 
 bool DelayLine::CopyDelayedOutput(unsigned int channel, unsigned int frames, float* target) const
 {
-    if (!mValid || frames > mBufferSize || channel >= mChannels)
+    if (!mValid || channel >= mChannels)
         return false;
     const Place place = FindDelayed(frames);
-    const auto past = static_cast<unsigned int>(std::max(place.past, 0));
+    if (place.start < 0)
+        return false;
+    const auto past = static_cast<unsigned int>(std::max<std::int64_t>(place.past, 0));
     const unsigned int head = frames - past;
     Copy(head, mChannelPointers[channel] + place.start, target);
     if (past > 0)

@@ -50,6 +50,7 @@ void ProcessMessageHandler::Post(boost::intrusive_ptr<Message> message)
 
 void ProcessMessageHandler::PumpFromMainThread()
 {
+    mFirstToLook = 0; // Whoever holds a message may have made it pending again
     TransferMessagesToQueue();
     if (!mProcessing.load(std::memory_order_relaxed))
         PumpFromProcessThread();

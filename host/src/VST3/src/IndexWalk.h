@@ -14,7 +14,7 @@ enum class IndexWalk
 /// No list of a plug-in is longer; what lies beyond is not seen, since some plug-ins answer for any index.
 inline constexpr int kMaxListLength = 32768;
 /// So many indices in a row without anything show that the list has ended, whatever its count says.
-inline constexpr int kMaxMissingInARow = 256;
+inline constexpr int kMaxMissingInARow = 1024;
 
 /// Visits the indices of a list from 0 while they are below `count()`, asked anew each time. Plug-ins lie about their
 /// counts: the walk ends where the list does, too. Returns how many indices belong to the list.

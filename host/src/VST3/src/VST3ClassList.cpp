@@ -1,9 +1,9 @@
 #include "host/src/VST3/src/VST3ClassList.h"
 
 #include "foundation/zebcore/Trace.h"
+#include "host/src/VST3/src/IndexWalk.h"
 #include "host/src/VST3/src/VST3FilterID.h"
 
-#include <algorithm>
 #include <pluginterfaces/vst/ivstaudioprocessor.h>
 
 #include <cstring>
@@ -17,29 +17,21 @@ using Steinberg::PClassInfo;
 namespace
 {
 
-// Counts of plug-ins lie. A shell of thousands of classes is real; this many, or such a row of classes that the
-// factory cannot describe, is not.
-constexpr int32 kMaxClasses = 16384;
-constexpr int32 kMaxFailuresInARow = 1024;
-
 // Calls `visit` with each class that the factory can describe, until it returns true; returns whether it did.
 template <class Visit>
 bool VisitClasses(Steinberg::IPluginFactory& factory, int32 count, const Visit& visit)
 {
-    int32 failures = 0;
-    for (int32 index = 0; index < std::min(count, kMaxClasses) && failures < kMaxFailuresInARow; ++index)
-    {
-        PClassInfo info = {};
-        if (factory.getClassInfo(index, &info) != Steinberg::kResultOk)
-        {
-            ++failures;
-            continue;
-        }
-        failures = 0;
-        if (visit(info))
-            return true;
-    }
-    return false;
+    bool wanted = false;
+    WalkList([count] { return count; },
+             [&](int index)
+             {
+                 PClassInfo info = {};
+                 if (factory.getClassInfo(index, &info) != Steinberg::kResultOk)
+                     return IndexWalk::kMissing;
+                 wanted = visit(info);
+                 return wanted ? IndexWalk::kStop : IndexWalk::kFound;
+             });
+    return wanted;
 }
 
 bool IsAudioClass(const PClassInfo& info)

@@ -67,10 +67,10 @@ int VST3AudioFilter::GetNumFactoryPresets() const
     return mNumPrograms;
 }
 
-// Names come from the first list, which need not be the root unit's that was counted.
+// Names come from the first list, which need not be the root unit's that was counted: it may have more of them.
 UTF16String VST3AudioFilter::GetFactoryPresetName(int index) const
 {
-    if (!mUnitInfo || index < 0 || index >= mNumPrograms)
+    if (!mUnitInfo || index < 0)
         return {};
     Steinberg::Vst::ProgramListInfo info = {};
     if (mUnitInfo->getProgramListInfo(0, info) != kResultOk)

@@ -35,22 +35,23 @@ struct ListedParameter
     }
 };
 
-// A parameter that the controller fails to describe counts as one with the ID 0 and without flags.
+// A parameter that the controller fails to describe counts as one with the ID 0 and without flags. A count beyond all
+// bounds is a lie: the list then ends with the last parameter that is described.
 std::vector<ListedParameter> ListParameters(Steinberg::Vst::IEditController& controller, int count)
 {
     std::vector<ListedParameter> parameters;
-    const int length = WalkList([count] { return count; },
-                                [&](int index)
-                                {
-                                    ParameterInfo info = {};
-                                    const Steinberg::tresult result = controller.getParameterInfo(index, info);
-                                    parameters.push_back({info.id, info.flags, info.unitId});
-                                    // Some describe the parameter and report a failure all the same.
-                                    const bool told =
-                                        result == Steinberg::kResultOk || info.id != 0 || info.title[0] != 0;
-                                    return told ? IndexWalk::kFound : IndexWalk::kMissing;
-                                });
-    parameters.resize(static_cast<std::size_t>(length));
+    std::size_t described = 0;
+    for (int index = 0; index < std::min(count, kMaxListLength); ++index)
+    {
+        ParameterInfo info = {};
+        const Steinberg::tresult result = controller.getParameterInfo(index, info);
+        parameters.push_back({info.id, info.flags, info.unitId});
+        // Some describe the parameter and report a failure all the same.
+        if (result == Steinberg::kResultOk || info.id != 0 || info.title[0] != 0)
+            described = parameters.size();
+    }
+    if (count > kMaxListLength)
+        parameters.resize(described);
     return parameters;
 }
 

@@ -4,7 +4,9 @@
 #include "host/src/VST3/src/VST3AudioFilter.h"
 #include "host/src/VST3/src/VST3MemoryStream.h"
 
+#include <algorithm>
 #include <cstdint>
+#include <optional>
 #include <span>
 
 namespace zebaudiofilterhost::vst3
@@ -28,12 +30,35 @@ void AppendSize(std::vector<unsigned char>& chunk, std::uint64_t size)
         chunk.push_back(static_cast<unsigned char>(size >> (8 * index)));
 }
 
-std::uint64_t ReadSize(Bytes bytes)
+// Takes so many bytes off the front of `rest`, or what there is.
+Bytes Take(Bytes& rest, std::size_t count)
+{
+    const Bytes taken = rest.first(std::min(count, rest.size()));
+    rest = rest.subspan(taken.size());
+    return taken;
+}
+
+// What is missing of it counts as 0.
+std::uint64_t TakeSize(Bytes& rest)
 {
     std::uint64_t size = 0;
-    for (std::size_t index = 0; index < kSizeLength; ++index)
-        size |= static_cast<std::uint64_t>(bytes[index]) << (8 * index);
+    int shift = 0;
+    for (const unsigned char byte : Take(rest, kSizeLength))
+    {
+        size |= static_cast<std::uint64_t>(byte) << shift;
+        shift += 8;
+    }
     return size;
+}
+
+// A state of this size; none if it is not there as a whole. Streams count in 32 bits, and so does this.
+std::optional<Bytes> TakeState(Bytes& rest, std::uint64_t size)
+{
+    const auto count = static_cast<std::uint32_t>(size);
+    if (count > static_cast<std::uint32_t>(VST3MemoryStream::kMaxSize))
+        return std::nullopt;
+    const Bytes state = Take(rest, count);
+    return state.size() == count ? std::optional(state) : std::nullopt;
 }
 
 void AppendStream(std::vector<unsigned char>& chunk, const VST3MemoryStream& stream)
@@ -42,35 +67,10 @@ void AppendStream(std::vector<unsigned char>& chunk, const VST3MemoryStream& str
         chunk.insert(chunk.end(), stream.GetData(), stream.GetData() + stream.GetSize());
 }
 
-struct StateChunk
+void ShowBytes(VST3MemoryStream& stream, Bytes bytes)
 {
-    Bytes component;
-    Bytes controller;
-};
-
-// False for a chunk that is shorter than it says.
-bool ParseChunk(Bytes chunk, StateChunk& state)
-{
-    if (chunk.size() < kHeaderLength)
-        return false;
-    const std::uint64_t componentSize = ReadSize(chunk);
-    const std::uint64_t controllerSize = ReadSize(chunk.subspan(kSizeLength));
-    const Bytes content = chunk.subspan(kHeaderLength);
-    if (componentSize > content.size() || controllerSize > content.size() - componentSize)
-        return false;
-    state.component = content.first(componentSize);
-    state.controller = content.subspan(componentSize, controllerSize);
-    return true;
-}
-
-// False for more than a stream takes.
-bool ShowBytes(VST3MemoryStream& stream, Bytes bytes)
-{
-    if (bytes.size() > static_cast<std::size_t>(VST3MemoryStream::kMaxSize))
-        return false;
     // NOLINTNEXTLINE(cppcoreguidelines-pro-type-reinterpret-cast): bytes, under the stream's name for them
     stream.Borrow({reinterpret_cast<const char*>(bytes.data()), bytes.size()});
-    return true;
 }
 
 // Empty if neither has a state. The streams go before the chunk is put into text: states may have megabytes.
@@ -114,24 +114,32 @@ bool VST3AudioFilter::SaveChunkData(PresetData& presetData) const
 }
 
 // Component state, the controller's copy of it, controller state: plug-ins rely on this order. What they answer is
-// not looked at, and a chunk whose sizes do not fit it is passed over as a whole.
+// not looked at. Of a chunk that was cut short, the states that are whole come back.
 bool VST3AudioFilter::LoadChunkData(const PresetData& presetData)
 {
     std::vector<unsigned char> chunk;
     if (!mComponent || !presetData.GetChunkData(chunk))
         return false;
-    StateChunk state;
-    VST3MemoryStream component;
-    if (!ParseChunk(chunk, state) || !ShowBytes(component, state.component))
-        return true;
-    mComponent->setState(&component);
-    component.seek(0, IBStream::kIBSeekSet, nullptr);
-    if (!mController)
-        return true;
-    mController->setComponentState(&component);
-    VST3MemoryStream controller;
-    if (!state.controller.empty() && ShowBytes(controller, state.controller))
-        mController->setState(&controller);
+    Bytes rest = chunk;
+    const std::uint64_t componentSize = TakeSize(rest);
+    const std::uint64_t controllerSize = TakeSize(rest);
+    const std::optional<Bytes> componentState = TakeState(rest, componentSize);
+    if (componentState)
+    {
+        VST3MemoryStream stream;
+        ShowBytes(stream, *componentState);
+        mComponent->setState(&stream);
+        stream.seek(0, IBStream::kIBSeekSet, nullptr);
+        if (mController)
+            mController->setComponentState(&stream);
+    }
+    const std::optional<Bytes> controllerState = TakeState(rest, controllerSize);
+    if (mController && controllerSize != 0 && controllerState)
+    {
+        VST3MemoryStream stream;
+        ShowBytes(stream, *controllerState);
+        mController->setState(&stream);
+    }
     return true;
 }
 
