@@ -56,11 +56,17 @@ std::string Lowered(std::string text)
     return text;
 }
 
+// Plug-ins' texts come with zero units behind them.
+std::string Unpadded(const UTF16String& text)
+{
+    return zebcore::utility::NarrowFromUTF16(text.substr(0, text.find(u'\0')));
+}
+
 // By the vendor, which the example effects of all technologies tell. A unit's locator has no path.
 bool IsOwn(const AudioFilterDescriptor& descriptor)
 {
-    const UTF16String vendor = descriptor.GetVendorString();
-    return descriptor.GetUniqueID() == kControlFilterID || vendor == u"Zeb Audio" || vendor == u"Zeb";
+    const std::string vendor = Unpadded(descriptor.GetVendorString());
+    return descriptor.GetUniqueID() == kControlFilterID || vendor == "Zeb Audio" || vendor == "Zeb";
 }
 
 // Whether one of the texts is in the name.
@@ -73,8 +79,7 @@ bool HasText(const std::string& name, const std::vector<std::string>& texts)
 
 Subject ToSubject(const AudioFilterDescriptor& descriptor, const std::vector<std::string>& withoutEditor)
 {
-    const UTF16String padded = descriptor.GetName();
-    const std::string name = zebcore::utility::NarrowFromUTF16(padded.substr(0, padded.find(u'\0')));
+    const std::string name = Unpadded(descriptor.GetName());
     const std::string path = zebcore::filesupport::ToNativePath(descriptor.GetLocator().GetPath());
     const bool withEditor =
         std::none_of(withoutEditor.begin(), withoutEditor.end(),
