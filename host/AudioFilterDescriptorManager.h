@@ -8,11 +8,14 @@
 #include <boost/smart_ptr/intrusive_ptr.hpp>
 
 #include <map>
-#include <unordered_map>
+#include <memory>
 #include <vector>
 
 namespace zebaudiofilterhost
 {
+
+template <typename Value>
+class TextTable;
 
 /// The list of all filters that the application can offer, whether or not their plug-ins are loaded. IDs compare as
 /// plain code units. All operations: [main]
@@ -59,15 +62,13 @@ public:
     DescriptorMap BuildComponentDescriptorMap(const DescriptorVector& descriptors) const;
 
 private:
-    using DescriptorIndex = std::unordered_map<UTF16String, DescriptorPtr>;
-
-    static DescriptorIndex BuildIndex(const DescriptorVector& descriptors);
+    using DescriptorIndex = TextTable<DescriptorPtr>; // by ID
 
     AudioFilterDescriptorManager();
     ~AudioFilterDescriptorManager();
 
     DescriptorVector mDescriptors;
-    DescriptorIndex mDescriptorIndex;
+    std::unique_ptr<DescriptorIndex> mDescriptorIndex; // never null
     std::map<UTF16String, UTF16String> mLegacyToCurrentID;
 };
 

@@ -9,6 +9,8 @@
 namespace zebaudiofilterhost
 {
 
+class PluginModuleRecords;
+
 /// Where one plug-in binary lives: which technology, which path. A value; settings files hold it as text. All
 /// operations: [any]
 class ZEB_EXPORT PluginLocator
@@ -45,6 +47,8 @@ public:
     friend ZEB_EXPORT std::size_t hash_value(const PluginLocator& locator);
 
 private:
+    friend class PluginModuleRecords; // compares the path where it lies, for a copy costs more than the look-up
+
     TechnologyType mType = kTechnologyNone;
     UTF16String mPath;
 };

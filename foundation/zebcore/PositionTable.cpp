@@ -46,11 +46,6 @@ void PositionTable::Remove(std::size_t hash, std::size_t position)
     --mUsed;
 }
 
-void PositionTable::Replace(std::size_t hash, std::size_t position, std::size_t newPosition)
-{
-    mSlots[SlotOf(hash, position)].mPosition = Narrow(newPosition);
-}
-
 void PositionTable::Clear()
 {
     mSlots.clear();

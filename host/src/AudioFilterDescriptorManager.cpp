@@ -2,8 +2,10 @@
 
 #include "foundation/zebcore/PropList.h"
 #include "host/src/IndexedKeys.h"
+#include "host/src/TextTable.h"
 
 #include <algorithm>
+#include <functional>
 #include <iterator>
 #include <set>
 #include <utility>
@@ -17,6 +19,46 @@ namespace
 const UTF8String kKey_NumDescriptors = u8"num_descriptors";
 const UTF8String kKey_Descriptor = u8"descriptor";
 
+using DescriptorPtr = AudioFilterDescriptorManager::DescriptorPtr;
+
+std::size_t Hash(const UTF16String& id)
+{
+    return std::hash<UTF16String>()(id);
+}
+
+std::size_t Find(const TextTable<DescriptorPtr>& index, const UTF16String& id)
+{
+    return index.Find(Hash(id),
+                      [&id](std::u16string_view known, const DescriptorPtr& descriptor)
+                      {
+                          PrefetchCounted(descriptor.get());
+                          return std::ranges::equal(known, id); // == compares unit by unit
+                      });
+}
+
+// Of two descriptors with one ID the first stays.
+bool Enter(TextTable<DescriptorPtr>& index, const DescriptorPtr& descriptor)
+{
+    const UTF16String& id = descriptor->GetUniqueID();
+    const bool isNew = Find(index, id) == TextTable<DescriptorPtr>::kNone;
+    if (isNew)
+    {
+        index.Add(Hash(id), id, descriptor);
+    }
+    return isNew;
+}
+
+std::unique_ptr<TextTable<DescriptorPtr>>
+BuildIndex(const AudioFilterDescriptorManager::DescriptorVector& descriptors)
+{
+    auto index = std::make_unique<TextTable<DescriptorPtr>>();
+    for (const DescriptorPtr& descriptor : descriptors)
+    {
+        Enter(*index, descriptor);
+    }
+    return index;
+}
+
 } // namespace
 
 AudioFilterDescriptorManager& AudioFilterDescriptorManager::GetInstance()
@@ -25,7 +67,9 @@ AudioFilterDescriptorManager& AudioFilterDescriptorManager::GetInstance()
     return sInstance;
 }
 
-AudioFilterDescriptorManager::AudioFilterDescriptorManager() = default;
+AudioFilterDescriptorManager::AudioFilterDescriptorManager() : mDescriptorIndex(std::make_unique<DescriptorIndex>())
+{
+}
 
 AudioFilterDescriptorManager::~AudioFilterDescriptorManager() = default;
 
@@ -35,27 +79,25 @@ void AudioFilterDescriptorManager::AddAudioFilterDescriptor(DescriptorPtr descri
     {
         return;
     }
-    // Every ID of the vector is in the map, so the search is saved for a new ID: adding takes constant time.
-    const auto known = mDescriptorIndex.find(descriptor->GetUniqueID());
-    if (known != mDescriptorIndex.end())
+    // Every ID of the vector is in the index, so the search is saved for a new ID: adding takes constant time.
+    if (!Enter(*mDescriptorIndex, descriptor))
     {
         const auto found = std::find(mDescriptors.begin(), mDescriptors.end(), descriptor);
         if (found != mDescriptors.end())
         {
             mDescriptors.erase(found);
-            mDescriptorIndex.erase(known);
+            mDescriptorIndex->ValueAt(Find(*mDescriptorIndex, descriptor->GetUniqueID())) = descriptor;
         }
     }
-    mDescriptors.push_back(descriptor);
-    mDescriptorIndex.emplace(descriptor->GetUniqueID(), std::move(descriptor));
+    mDescriptors.push_back(std::move(descriptor));
 }
 
 AudioFilterDescriptorManager::DescriptorPtr
 AudioFilterDescriptorManager::GetComponentDescriptorForID(const UTF16String& id) const
 {
     const auto legacy = mLegacyToCurrentID.find(id);
-    const auto found = mDescriptorIndex.find(legacy == mLegacyToCurrentID.end() ? id : legacy->second);
-    return found == mDescriptorIndex.end() ? DescriptorPtr() : found->second;
+    const std::size_t found = Find(*mDescriptorIndex, legacy == mLegacyToCurrentID.end() ? id : legacy->second);
+    return found == DescriptorIndex::kNone ? DescriptorPtr() : mDescriptorIndex->ValueAt(found);
 }
 
 void AudioFilterDescriptorManager::AddLegacyToCurrentIDMapping(const UTF16String& legacy, const UTF16String& current)
@@ -111,13 +153,13 @@ void AudioFilterDescriptorManager::ClearInfosForLocators(const std::vector<Plugi
 void AudioFilterDescriptorManager::ReadExternalComponentDescriptors(const PropList& list, bool merge)
 {
     DescriptorVector descriptors = merge ? mDescriptors : GetInternalInfos();
-    DescriptorIndex index = merge ? mDescriptorIndex : BuildIndex(descriptors);
+    auto index = merge ? std::make_unique<DescriptorIndex>(*mDescriptorIndex) : BuildIndex(descriptors);
     int count = 0;
     list.GetValue(kKey_NumDescriptors, count);
     for (const PropList* const section : PresentSubLists(list, kKey_Descriptor, count))
     {
         const DescriptorPtr descriptor(new AudioFilterDescriptor(*section));
-        if (index.emplace(descriptor->GetUniqueID(), descriptor).second)
+        if (Enter(*index, descriptor))
         {
             descriptors.push_back(descriptor);
         }
@@ -134,17 +176,6 @@ void AudioFilterDescriptorManager::WriteExternalComponentDescriptors(PropList& l
     {
         infos[index]->Write(list.GetOrCreateSubList(IndexedKey(kKey_Descriptor, index)));
     }
-}
-
-AudioFilterDescriptorManager::DescriptorIndex
-AudioFilterDescriptorManager::BuildIndex(const DescriptorVector& descriptors)
-{
-    DescriptorIndex index;
-    for (const DescriptorPtr& descriptor : descriptors)
-    {
-        index.emplace(descriptor->GetUniqueID(), descriptor);
-    }
-    return index;
 }
 
 AudioFilterDescriptorManager::DescriptorMap

@@ -1,24 +1,50 @@
 #include "host/src/PluginModuleRecords.h"
 
+#include "foundation/zebcore/CompareFileNames.h"
+
 #include <algorithm>
 #include <utility>
 
 namespace zebaudiofilterhost
 {
 
+namespace
+{
+
+bool IsSame(std::u16string_view left, std::u16string_view right)
+{
+    return std::ranges::equal(left, right); // == compares unit by unit
+}
+
+} // namespace
+
+bool PluginModuleRecords::IsOf::operator()(std::u16string_view path, const Place& place) const
+{
+    PrefetchCounted(place.record.get());
+    if (place.type != mLocator.mType)
+    {
+        return false;
+    }
+    return IsSame(path, mLocator.mPath) ||
+           zebcore::filesupport::CompareFileNames(UTF16String(path), mLocator.mPath) == 0;
+}
+
 void PluginModuleRecords::Add(Pointer record)
 {
     const std::size_t arrival = mNextArrival++;
     const PluginLocator& locator = record->GetLocator();
-    const auto [entry, isNew] = mPlaces.try_emplace(locator, Place{record, arrival});
-    if (!isNew)
+    const std::size_t hash = hash_value(locator);
+    const Place place{record, arrival, locator.mType};
+    const std::size_t known = mPlaces.Find(hash, IsOf(locator));
+    if (known != Places::kNone && IsSame(mPlaces.TextAt(known), locator.mPath))
     {
-        LeaveGap(entry->second.arrival);
-        // Under its own locator: an equal one may be spelt in another way.
-        auto place = mPlaces.extract(entry);
-        place.key() = locator;
-        place.mapped() = Place{record, arrival};
-        mPlaces.insert(std::move(place));
+        LeaveGap(mPlaces.ValueAt(known).arrival);
+        mPlaces.ValueAt(known) = place;
+    }
+    else
+    {
+        Remove(locator); // It may be there, spelt in another way
+        mPlaces.Add(hash, locator.mPath, place);
     }
     mInOrder.push_back(std::move(record));
     mArrivals.push_back(arrival);
@@ -26,19 +52,19 @@ void PluginModuleRecords::Add(Pointer record)
 
 PluginModuleRecords::Pointer PluginModuleRecords::Find(const PluginLocator& locator) const
 {
-    const auto found = mPlaces.find(locator);
-    return found == mPlaces.end() ? Pointer() : found->second.record;
+    const std::size_t found = mPlaces.Find(hash_value(locator), IsOf(locator));
+    return found == Places::kNone ? Pointer() : mPlaces.ValueAt(found).record;
 }
 
 bool PluginModuleRecords::Remove(const PluginLocator& locator)
 {
-    const auto found = mPlaces.find(locator);
-    if (found == mPlaces.end())
+    const std::size_t found = mPlaces.Find(hash_value(locator), IsOf(locator));
+    if (found == Places::kNone)
     {
         return false;
     }
-    LeaveGap(found->second.arrival);
-    mPlaces.erase(found);
+    LeaveGap(mPlaces.ValueAt(found).arrival);
+    mPlaces.Remove(found);
     return true;
 }
 
@@ -56,11 +82,9 @@ const PluginModuleRecords::Vector& PluginModuleRecords::InOrder() const
 std::vector<PluginLocator> PluginModuleRecords::Locators() const
 {
     std::vector<PluginLocator> locators;
-    locators.reserve(mPlaces.size());
-    for (const auto& [locator, place] : mPlaces)
-    {
-        locators.push_back(locator);
-    }
+    locators.reserve(mPlaces.Size());
+    mPlaces.ForEach([&locators](std::u16string_view path, const Place& place)
+                    { locators.emplace_back(place.type, UTF16String(path)); });
     std::sort(locators.begin(), locators.end());
     return locators;
 }
@@ -70,7 +94,7 @@ void PluginModuleRecords::LeaveGap(std::size_t arrival)
     const auto place = std::lower_bound(mArrivals.begin(), mArrivals.end(), arrival);
     mInOrder[static_cast<std::size_t>(place - mArrivals.begin())] = nullptr;
     ++mGaps;
-    if (mGaps > mPlaces.size()) // Nobody looks, and the gaps must not pile up
+    if (mGaps > mPlaces.Size()) // Nobody looks, and the gaps must not pile up
     {
         CloseGaps();
     }

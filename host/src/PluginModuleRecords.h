@@ -2,12 +2,12 @@
 
 #include "host/PluginLocator.h"
 #include "host/PluginModuleInfo.h"
+#include "host/src/TextTable.h"
 
-#include <boost/container_hash/hash.hpp>
 #include <boost/smart_ptr/intrusive_ptr.hpp>
 
 #include <cstddef>
-#include <unordered_map>
+#include <string_view>
 #include <vector>
 
 namespace zebaudiofilterhost
@@ -38,13 +38,27 @@ private:
     struct Place
     {
         Pointer record;
-        std::size_t arrival;
+        std::size_t arrival = 0;
+        TechnologyType type = kTechnologyNone;
+    };
+
+    using Places = TextTable<Place>;
+
+    // Whether an entry of mPlaces is that of a locator.
+    class IsOf
+    {
+    public:
+        explicit IsOf(const PluginLocator& locator) : mLocator(locator) {}
+        bool operator()(std::u16string_view path, const Place& place) const;
+
+    private:
+        const PluginLocator& mLocator;
     };
 
     void LeaveGap(std::size_t arrival);
     void CloseGaps() const;
 
-    std::unordered_map<PluginLocator, Place, boost::hash<PluginLocator>> mPlaces;
+    Places mPlaces; // by path
     // A record that goes leaves a null pointer, and all gaps are closed at once when somebody wants to see the order.
     mutable Vector mInOrder;
     mutable std::vector<std::size_t> mArrivals; // of mInOrder's records, ascending

@@ -33,9 +33,6 @@ public:
     // The position must have been inserted under the hash.
     void Remove(std::size_t hash, std::size_t position);
 
-    // A position that was inserted under the hash becomes another one. Throws like Insert.
-    void Replace(std::size_t hash, std::size_t position, std::size_t newPosition);
-
     void Clear();
 
     bool IsEmpty() const { return mUsed == 0; }
