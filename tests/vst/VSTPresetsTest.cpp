@@ -231,6 +231,26 @@ TEST_F(Presets, ChunksThatAreNoneAreEmpty)
     EXPECT_EQ(fake.Count("effSetChunk"), 0U);
 }
 
+TEST_F(Presets, ASizeWithoutMemoryLeavesThePresetsChunk)
+{
+    Make({"A"}, kChunks);
+    const Bytes before = {9, 8};
+    for (const long long size : {1LL, 100LL, -7LL, LLONG_MAX})
+    {
+        fake.Return(effGetChunk, size);
+        PresetData preset(propList);
+        preset.SetChunkData(before.data(), before.size());
+        int changes = 0;
+        preset.GetPresetChangedSignal().connect([&changes](const PresetData&) { ++changes; });
+        EXPECT_TRUE(filter->SaveChunkData(preset)) << size;
+        EXPECT_EQ(changes, 2) << "of the version and the type, for " << size;
+        EXPECT_EQ(preset.GetPresetType(), PresetData::kPresetType_Chunk);
+        Bytes chunk;
+        EXPECT_TRUE(preset.GetChunkData(chunk)) << size;
+        EXPECT_EQ(chunk, before) << size;
+    }
+}
+
 TEST_F(Presets, WithoutChunksParametersAreSaved)
 {
     fake.effect.numParams = 2;

@@ -99,8 +99,9 @@ bool VSTAudioFilter::SaveChunkData(PresetData& preset) const
         return false;
     const unsigned char* chunk = nullptr; // the plug-in's memory
     const long long size = Dispatcher(effGetChunk, kProgramChunk, 0, &chunk, 0.0F);
-    const bool usable = chunk != nullptr && size > 0 && size <= kMaxChunkSize;
-    preset.SetChunkData(chunk, usable ? static_cast<unsigned long>(size) : 0);
+    const bool isLie = chunk != nullptr && (size < 0 || size > kMaxChunkSize);
+    // Bytes that are said to be there without memory are no chunk: the preset keeps the one that it has.
+    preset.SetChunkData(chunk, isLie ? 0 : static_cast<unsigned long>(size));
     preset.SetVersion(GetCurrentPresetVersion());
     preset.SetPresetType(PresetData::kPresetType_Chunk);
     return true;
