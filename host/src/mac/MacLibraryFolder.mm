@@ -4,8 +4,17 @@
 
 #import <Foundation/Foundation.h>
 
+#include <array>
+
 namespace zebaudiofilterhost
 {
+
+namespace
+{
+
+constexpr std::size_t kPathRoom = 4096; // bytes, with the terminating zero
+
+} // namespace
 
 Dir GetMacLibraryFolder(bool user)
 {
@@ -16,9 +25,10 @@ Dir GetMacLibraryFolder(bool user)
                                                    appropriateForURL:nil
                                                               create:NO
                                                                error:nil];
-        if (url == nil)
+        std::array<char, kPathRoom> path = {};
+        if (![url getFileSystemRepresentation:path.data() maxLength:path.size()]) // NO of no URL, too
             return Dir();
-        return Dir(zebcore::filesupport::FromNativePath([[url path] fileSystemRepresentation]));
+        return Dir(zebcore::filesupport::FromNativePath(path.data()));
     }
 }
 
