@@ -1,10 +1,10 @@
-#include "tests/xau/support/CFTestObjects.h"
 #include "tests/xau/support/FakeUnit.h"
 #include "tests/xau/support/TestClock.h"
 
 #include <gmock/gmock.h>
 
 #include <limits>
+#include <thread>
 
 namespace zebaudiofilterhost::xau
 {
@@ -19,11 +19,6 @@ protected:
     TestClock mClock;
     FakeUnit mUnit;
 };
-
-CFOwner MakePresets()
-{
-    return CFOwner(CFArrayCreate(nullptr, nullptr, 0, nullptr));
-}
 
 TEST_F(XAUAudioFilterTest, IsMadeOfItsIDWithAndWithoutPrefix)
 {
@@ -40,30 +35,6 @@ TEST_F(XAUAudioFilterTest, IsMadeOfItsIDWithAndWithoutPrefix)
     EXPECT_FALSE(XAUAudioFilter::Create(u"4:1 2 3"));
     mUnit.mGivesInstance = false;
     EXPECT_FALSE(XAUAudioFilter::Create(u"4:" + mUnit.GetID()));
-}
-
-// Wherever a unit throws: there is no filter, and the instance is disposed of.
-TEST_F(XAUAudioFilterTest, AUnitThatThrowsWhileItIsMadeGivesNone)
-{
-    const auto presets = MakePresets();
-    mUnit.Answer(Global(kAudioUnitProperty_FactoryPresets), presets.get());
-    for (const char* call : {"create", "open", "set property", "initialize"})
-    {
-        CFRetain(presets.get()); // for the filter
-        mUnit.mCalls.clear();
-        mUnit.mThrowsIn = {call};
-        EXPECT_FALSE(mUnit.MakeFilter()) << call;
-        const bool isOpened = std::string(call) != "create" && std::string(call) != "open";
-        EXPECT_EQ(mUnit.CountCalls("close"), isOpened ? 1U : 0U) << call;
-        EXPECT_EQ(CFGetRetainCount(presets.get()), isOpened ? 1 : 2) << call;
-        if (!isOpened)
-            CFRelease(presets.get());
-    }
-    mUnit.Forget(Global(kAudioUnitProperty_FactoryPresets));
-    mUnit.mThrowsIn.clear();
-    ASSERT_TRUE(mUnit.MakeFilter());
-    mUnit.mThrowsIn = {"uninitialize", "close"};
-    mUnit.MakeFilter().reset();
 }
 
 // Rates before sizes before initialisation; what needs it is done while the unit is not initialised.
@@ -160,6 +131,18 @@ TEST_F(XAUAudioFilterTest, ManyElementsAreALie)
     filter->BuildIOConfiguration();
     EXPECT_EQ(filter->GetInputBuses().size(), 1U);
     EXPECT_EQ(filter->GetElementCount(kAudioUnitScope_Note), 0U);
+}
+
+// Its events come on that thread; it may be freed on any other.
+TEST_F(XAUAudioFilterTest, OutlivesTheThreadThatMadeIt)
+{
+    mUnit.SetParameters({5}, 0.0F, 10.0F);
+    boost::intrusive_ptr<XAUAudioFilter> filter;
+    std::thread([&] { filter = mUnit.MakeFilter(); }).join();
+    ASSERT_TRUE(filter);
+    filter->SetParameter(0, 0.5F); // the listener is told, and nobody passes it on
+    filter.reset();
+    EXPECT_EQ(mUnit.CountCalls("close"), 1U);
 }
 
 class XAUListeningTest : public XAUAudioFilterTest

@@ -132,6 +132,22 @@ TEST_F(XAUScanTest, RecordsWhatUnitsAreAndSkipsThoseThatGiveNone)
         EXPECT_TRUE(AudioFilterFactory::GetInstance().CreateAudioFilter(id));
 }
 
+TEST_F(XAUScanTest, GoesOnToTheNextUnitWhereverOneThrows)
+{
+    for (const char* call : {"create", "open", "get property info", "get property", "set property", "initialize",
+                             "uninitialize", "close"})
+    {
+        FakeUnit thrower;
+        thrower.mThrowsIn = {call};
+        const FakeUnit next;
+        const boost::intrusive_ptr<PluginScanContext> context = CreateScanContext({});
+        context->SetPluginLocators({LocatorOf(thrower), LocatorOf(next)}, false);
+        EXPECT_TRUE(context->Continue()) << call;
+        EXPECT_FALSE(context->Continue()) << call;
+        EXPECT_TRUE(PluginModuleInfoManager::GetInstance().FindPluginInfo(LocatorOf(next))) << call;
+    }
+}
+
 TEST_F(XAUScanTest, DescribesTheChannelsThatAUnitTakes)
 {
     struct Case

@@ -76,6 +76,7 @@ struct FakeUnit::Calls
                                     AudioUnitElement element, UInt32* size, Boolean* isWritable)
     {
         const FakeUnit& unit = Of(self);
+        unit.ThrowIfWanted("get property info");
         const auto found = unit.mProperties.find({property, scope, element});
         if (found == unit.mProperties.end())
             return kAudioUnitErr_InvalidProperty;
@@ -88,6 +89,7 @@ struct FakeUnit::Calls
                                 AudioUnitElement element, void* data, UInt32* size)
     {
         const FakeUnit& unit = Of(self);
+        unit.ThrowIfWanted("get property");
         const auto found = unit.mProperties.find({property, scope, element});
         if (found == unit.mProperties.end())
             return kAudioUnitErr_InvalidProperty;
@@ -131,6 +133,7 @@ struct FakeUnit::Calls
     static OSStatus Reset(void* self, AudioUnitScope scope, AudioUnitElement element)
     {
         Of(self).mCalls.push_back("reset " + std::to_string(scope) + " " + std::to_string(element));
+        Of(self).ThrowIfWanted("reset");
         return noErr;
     }
     static OSStatus Render(void* self, AudioUnitRenderActionFlags* /*flags*/, const AudioTimeStamp* time,

@@ -1,5 +1,7 @@
 #include "host/src/XAU/src/XAUView.h"
 
+#include "host/src/XAU/src/CallGuarded.h"
+
 #import <AppKit/AppKit.h>
 #import <AudioUnit/AUCocoaUIView.h>
 #import <CoreAudioKit/CoreAudioKit.h>
@@ -36,15 +38,16 @@ NSView* MakeCocoaView(AudioUnit unit)
 {
     UInt32 size = 0;
     Boolean isWritable = 0;
-    if (AudioUnitGetPropertyInfo(unit, kAudioUnitProperty_CocoaUI, kAudioUnitScope_Global, 0, &size, &isWritable) !=
-            noErr ||
+    if (CallGuarded<AudioUnitGetPropertyInfo>(unit, kAudioUnitProperty_CocoaUI, kAudioUnitScope_Global, 0, &size,
+                                              &isWritable) != noErr ||
         size < sizeof(AudioUnitCocoaViewInfo))
         return nil;
     auto* info = static_cast<AudioUnitCocoaViewInfo*>(std::malloc(size));
     if (!info)
         return nil;
     NSView* view = nil;
-    if (AudioUnitGetProperty(unit, kAudioUnitProperty_CocoaUI, kAudioUnitScope_Global, 0, info, &size) == noErr &&
+    if (CallGuarded<AudioUnitGetProperty>(unit, kAudioUnitProperty_CocoaUI, kAudioUnitScope_Global, 0, info, &size) ==
+            noErr &&
         size >= sizeof(AudioUnitCocoaViewInfo))
     {
         NSURL* location = (NSURL*)info->mCocoaAUViewBundleLocation;

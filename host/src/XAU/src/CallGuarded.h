@@ -5,18 +5,28 @@
 namespace zebaudiofilterhost::xau
 {
 
-/// Calls a unit. What it throws counts as an error code, and goes no further. [any]
-template <typename Call>
-OSStatus CallGuarded(const Call& call)
+template <auto Function>
+struct GuardedFunction;
+
+template <typename... Arguments, OSStatus (*Function)(Arguments...)>
+struct GuardedFunction<Function>
 {
-    try
+    OSStatus operator()(Arguments... arguments) const noexcept
     {
-        return call();
+        try
+        {
+            return Function(arguments...);
+        }
+        catch (...)
+        {
+            return kAudioUnitErr_CannotDoInCurrentContext;
+        }
     }
-    catch (...)
-    {
-        return kAudioUnitErr_CannotDoInCurrentContext;
-    }
-}
+};
+
+/// A published function that calls a unit, with that function's arguments. What the unit throws counts as an error
+/// code, and goes no further. Filters and views call their unit by this alone. [any]
+template <auto Function>
+inline constexpr GuardedFunction<Function> CallGuarded = {};
 
 } // namespace zebaudiofilterhost::xau

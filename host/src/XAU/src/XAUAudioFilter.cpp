@@ -44,13 +44,13 @@ boost::intrusive_ptr<XAUAudioFilter> XAUAudioFilter::Create(const UTF16String& f
     const UTF16String prefixedID = lacksPrefix ? u"4:" + filterID : filterID;
     auto* const component = FindComponentForDescription(DecodeComponentID(prefixedID));
     AudioUnit instance = nullptr;
-    if (!component || AudioComponentInstanceNew(component, &instance) != noErr || !instance)
+    if (!component || CallGuarded<AudioComponentInstanceNew>(component, &instance) != noErr || !instance)
         return {};
     try
     {
         return new XAUAudioFilter(prefixedID, component, instance);
     }
-    catch (...) // of the unit's, which is disposed of already
+    catch (...) // for instance no memory for what the unit lists; it is disposed of already
     {
         return {};
     }
@@ -86,8 +86,8 @@ void XAUAudioFilter::SetUp()
     SetDisplayName(name);
     ZEB_TRACE("XAUAudioFilter", "XAUAudioFilter(), vendor: " << vendor << ", effect: " << name);
     UInt32 size = sizeof(CFArrayRef);
-    if (AudioUnitGetProperty(mInstance, kAudioUnitProperty_FactoryPresets, kAudioUnitScope_Global, 0,
-                             &mFactoryPresets, &size) != noErr)
+    if (CallGuarded<AudioUnitGetProperty>(mInstance, kAudioUnitProperty_FactoryPresets, kAudioUnitScope_Global, 0,
+                                          &mFactoryPresets, &size) != noErr)
         mFactoryPresets = nullptr;
     BuildParameterInfos();
     SetHostCallbacks();
@@ -102,11 +102,11 @@ void XAUAudioFilter::TakeDown() noexcept
     if (mListener)
         AUListenerDispose(mListener);
     if (mAUInitialized)
-        CallGuarded([this] { return AudioUnitUninitialize(mInstance); });
+        CallGuarded<AudioUnitUninitialize>(mInstance);
     if (mFactoryPresets)
         CFRelease(mFactoryPresets);
     // The infos ask the unit until the last moment; nobody may have kept one.
-    CallGuarded([this] { return AudioComponentInstanceDispose(mInstance); });
+    CallGuarded<AudioComponentInstanceDispose>(mInstance);
 }
 
 void XAUAudioFilter::SetHostCallbacks()
@@ -116,8 +116,8 @@ void XAUAudioFilter::SetHostCallbacks()
     callbacks.beatAndTempoProc = GetBeatAndTempo;
     callbacks.musicalTimeLocationProc = GetMusicalTimeLocation;
     callbacks.transportStateProc = GetTransportState;
-    DumpResultIfFailed(AudioUnitSetProperty(mInstance, kAudioUnitProperty_HostCallbacks, kAudioUnitScope_Global, 0,
-                                            &callbacks, sizeof(callbacks)),
+    DumpResultIfFailed(CallGuarded<AudioUnitSetProperty>(mInstance, kAudioUnitProperty_HostCallbacks,
+                                                         kAudioUnitScope_Global, 0, &callbacks, sizeof(callbacks)),
                        "kAudioUnitProperty_HostCallbacks");
 }
 
@@ -125,7 +125,7 @@ void XAUAudioFilter::InitializeAU()
 {
     if (mAUInitialized)
         return;
-    const OSStatus result = AudioUnitInitialize(mInstance);
+    const OSStatus result = CallGuarded<AudioUnitInitialize>(mInstance);
     DumpResultIfFailed(result, "AudioUnitInitialize");
     mAUInitialized = result == noErr;
 }
@@ -134,7 +134,7 @@ void XAUAudioFilter::UninitializeAU()
 {
     if (!mAUInitialized)
         return;
-    AudioUnitUninitialize(mInstance);
+    CallGuarded<AudioUnitUninitialize>(mInstance);
     mAUInitialized = false;
 }
 
@@ -147,8 +147,8 @@ int XAUAudioFilter::GetInitialDelay() const
 {
     Float64 seconds = 0.0;
     UInt32 size = sizeof(seconds);
-    const OSStatus result =
-        AudioUnitGetProperty(mInstance, kAudioUnitProperty_Latency, kAudioUnitScope_Global, 0, &seconds, &size);
+    const OSStatus result = CallGuarded<AudioUnitGetProperty>(mInstance, kAudioUnitProperty_Latency,
+                                                              kAudioUnitScope_Global, 0, &seconds, &size);
     DumpResultIfFailed(result, "kAudioUnitProperty_Latency");
     const double samples = seconds * static_cast<double>(mSampleRate);
     const bool isUsable = result == noErr && std::abs(samples) <= std::numeric_limits<int>::max();

@@ -1,5 +1,7 @@
 #include "host/src/XAU/src/XAUAudioFilterEditor.h"
 
+#include "host/src/XAU/src/CallGuarded.h"
+
 namespace zebaudiofilterhost::xau
 {
 
@@ -12,8 +14,8 @@ int CountViewClasses(AudioUnit unit)
     constexpr UInt32 kReference = 8; // bytes
     UInt32 size = 0;
     Boolean isWritable = 0;
-    const OSStatus result =
-        AudioUnitGetPropertyInfo(unit, kAudioUnitProperty_CocoaUI, kAudioUnitScope_Global, 0, &size, &isWritable);
+    const OSStatus result = CallGuarded<AudioUnitGetPropertyInfo>(unit, kAudioUnitProperty_CocoaUI,
+                                                                  kAudioUnitScope_Global, 0, &size, &isWritable);
     return result == noErr && size >= kReference ? static_cast<int>((size - kReference) / kReference) : 0;
 }
 

@@ -2,6 +2,7 @@
 
 #include "foundation/zebcore/Trace.h"
 #include "host/src/XAU/src/CFOwner.h"
+#include "host/src/XAU/src/CallGuarded.h"
 #include "host/src/XAU/src/XAUAudioFilter.h"
 #include "host/src/XAU/src/XAUChannelCounts.h"
 #include "host/src/XAU/src/XAUChannelLayouts.h"
@@ -75,7 +76,8 @@ UInt32 XAUAudioFilter::GetElementCount(AudioUnitScope scope) const
 {
     UInt32 count = 0;
     UInt32 size = sizeof(count);
-    const OSStatus result = AudioUnitGetProperty(mInstance, kAudioUnitProperty_ElementCount, scope, 0, &count, &size);
+    const OSStatus result =
+        CallGuarded<AudioUnitGetProperty>(mInstance, kAudioUnitProperty_ElementCount, scope, 0, &count, &size);
     DumpResultIfFailed(result, "GetElementCount()");
     return result == noErr ? std::min(count, kMaxElements) : 0;
 }
@@ -84,7 +86,8 @@ OSStatus XAUAudioFilter::GetStreamFormat(AudioUnitScope scope, AudioUnitElement 
                                          AudioStreamBasicDescription& format) const
 {
     UInt32 size = sizeof(format);
-    return AudioUnitGetProperty(mInstance, kAudioUnitProperty_StreamFormat, scope, element, &format, &size);
+    return CallGuarded<AudioUnitGetProperty>(mInstance, kAudioUnitProperty_StreamFormat, scope, element, &format,
+                                             &size);
 }
 
 OSStatus XAUAudioFilter::SetStreamFormat(AudioUnitScope scope, AudioUnitElement element,
@@ -92,8 +95,8 @@ OSStatus XAUAudioFilter::SetStreamFormat(AudioUnitScope scope, AudioUnitElement 
 {
     const bool wasInitialized = mAUInitialized;
     UninitializeAU();
-    const OSStatus result =
-        AudioUnitSetProperty(mInstance, kAudioUnitProperty_StreamFormat, scope, element, &format, sizeof(format));
+    const OSStatus result = CallGuarded<AudioUnitSetProperty>(mInstance, kAudioUnitProperty_StreamFormat, scope,
+                                                              element, &format, sizeof(format));
     DumpResultIfFailed(result, "XAUAudioFilter::SetStreamFormat(),  AudioUnitSetProperty() / "
                                "kAudioUnitProperty_StreamFormat");
     if (wasInitialized)
@@ -106,13 +109,14 @@ bool XAUAudioFilter::ReadSupportedChannels(std::vector<AUChannelInfo>& supported
 {
     constexpr AudioUnitPropertyID kProperty = kAudioUnitProperty_SupportedNumChannels;
     UInt32 size = 0;
-    if (AudioUnitGetProperty(mInstance, kProperty, kAudioUnitScope_Global, 0, nullptr, &size) != noErr)
+    if (CallGuarded<AudioUnitGetProperty>(mInstance, kProperty, kAudioUnitScope_Global, 0, nullptr, &size) != noErr)
         return false;
     const std::size_t count = std::min<std::size_t>(size / sizeof(AUChannelInfo), kMaxChannelInfos);
     const auto announced = static_cast<UInt32>(count * sizeof(AUChannelInfo));
     supported.resize(std::max(count, kMinRoom / sizeof(AUChannelInfo)));
     size = announced;
-    if (AudioUnitGetProperty(mInstance, kProperty, kAudioUnitScope_Global, 0, supported.data(), &size) != noErr)
+    if (CallGuarded<AudioUnitGetProperty>(mInstance, kProperty, kAudioUnitScope_Global, 0, supported.data(), &size) !=
+        noErr)
         return false;
     supported.resize(std::min(size, announced) / sizeof(AUChannelInfo));
     return true;
@@ -145,8 +149,8 @@ void XAUAudioFilter::RequestIOConfiguration(const std::vector<ChannelLayout>& in
 OSStatus XAUAudioFilter::RequestChannels(AudioUnitScope scope, UInt32 channels, std::size_t requested)
 {
     const AudioStreamBasicDescription format = MakeFormat(mSampleRate, channels);
-    const OSStatus result =
-        AudioUnitSetProperty(mInstance, kAudioUnitProperty_StreamFormat, scope, 0, &format, sizeof(format));
+    const OSStatus result = CallGuarded<AudioUnitSetProperty>(mInstance, kAudioUnitProperty_StreamFormat, scope, 0,
+                                                              &format, sizeof(format));
     if (result != noErr)
     {
         const bool isInput = scope == kAudioUnitScope_Input;
@@ -194,8 +198,8 @@ UTF16String XAUAudioFilter::ReadElementName(AudioUnitElement element) const
 {
     CFStringRef name = nullptr;
     UInt32 size = sizeof(CFTypeRef);
-    const OSStatus result =
-        AudioUnitGetProperty(mInstance, kAudioUnitProperty_ElementName, kAudioUnitScope_Input, element, &name, &size);
+    const OSStatus result = CallGuarded<AudioUnitGetProperty>(mInstance, kAudioUnitProperty_ElementName,
+                                                              kAudioUnitScope_Input, element, &name, &size);
     if (result != noErr || !name)
         return {};
     const CFOwner owner(name);
@@ -217,14 +221,14 @@ bool XAUAudioFilter::ReadChannelLayout(AudioUnitScope scope, AudioUnitElement el
     constexpr AudioUnitPropertyID kProperty = kAudioUnitProperty_AudioChannelLayout;
     UInt32 size = 0;
     Boolean isWritable = 0;
-    if (AudioUnitGetPropertyInfo(mInstance, kProperty, scope, element, &size, &isWritable) != noErr)
+    if (CallGuarded<AudioUnitGetPropertyInfo>(mInstance, kProperty, scope, element, &size, &isWritable) != noErr)
     {
         ZEB_TRACE("XAUAudioFilter", "kAudioUnitProperty_AudioChannelLayout unsupported");
         return false;
     }
     std::vector<std::byte> bytes(std::max<std::size_t>(std::min(size, kMaxLayoutSize), kMinRoom));
     size = std::min(size, kMaxLayoutSize);
-    if (AudioUnitGetProperty(mInstance, kProperty, scope, element, bytes.data(), &size) != noErr ||
+    if (CallGuarded<AudioUnitGetProperty>(mInstance, kProperty, scope, element, bytes.data(), &size) != noErr ||
         size < kLayoutHeader)
         return false;
     bytes.resize(std::min<std::size_t>(size, bytes.size()));
@@ -267,8 +271,9 @@ void XAUAudioFilter::UpdateRenderCallbacks()
         AURenderCallbackStruct callback = {};
         if (element == 0 || hasSideChain)
             callback = {StaticRenderCallback, this};
-        DumpResultIfFailed(AudioUnitSetProperty(mInstance, kAudioUnitProperty_SetRenderCallback,
-                                                kAudioUnitScope_Input, element, &callback, sizeof(callback)),
+        DumpResultIfFailed(CallGuarded<AudioUnitSetProperty>(mInstance, kAudioUnitProperty_SetRenderCallback,
+                                                             kAudioUnitScope_Input, element, &callback,
+                                                             sizeof(callback)),
                            "kAudioUnitProperty_SetRenderCallback");
     }
 }

@@ -66,11 +66,8 @@ int CountSteps(float minimum, float maximum)
 ParameterRecord::ParameterRecord(AudioUnit instance, AudioUnitScope scope, AudioUnitParameterID id)
 {
     UInt32 size = sizeof(mInfo);
-    mIsKnown =
-        CallGuarded(
-            [&] {
-                return AudioUnitGetProperty(instance, kAudioUnitProperty_ParameterInfo, scope, id, &mInfo, &size);
-            }) == noErr;
+    mIsKnown = CallGuarded<AudioUnitGetProperty>(instance, kAudioUnitProperty_ParameterInfo, scope, id, &mInfo,
+                                                 &size) == noErr;
     const bool releases = mIsKnown && (mInfo.flags & kAudioUnitParameterFlag_CFNameRelease) != 0;
     mName.reset(releases && HasName() ? mInfo.cfNameString : nullptr);
     mUnitName.reset(releases && HasUnitName() ? mInfo.unitName : nullptr);
@@ -147,8 +144,8 @@ UTF16String XAUParameterInfo::GetParameterString(float normalized) const
     text.inParamID = mParameterID;
     text.inValue = &value;
     UInt32 size = sizeof(text);
-    const OSStatus result =
-        AudioUnitGetProperty(mInstance, kAudioUnitProperty_ParameterStringFromValue, mScope, 0, &text, &size);
+    const OSStatus result = CallGuarded<AudioUnitGetProperty>(mInstance, kAudioUnitProperty_ParameterStringFromValue,
+                                                              mScope, 0, &text, &size);
     if (result == noErr)
         return MACtoZEB(text.outString);
     zebcore::utility::oUTF16StringStream stream;

@@ -47,7 +47,8 @@ std::vector<AudioUnitParameterID> XAUAudioFilter::ReadParameterList(AudioUnitSco
                                                                     std::vector<AudioUnitParameterID>& room) const
 {
     UInt32 size = 0;
-    OSStatus result = AudioUnitGetProperty(mInstance, kAudioUnitProperty_ParameterList, scope, 0, nullptr, &size);
+    OSStatus result =
+        CallGuarded<AudioUnitGetProperty>(mInstance, kAudioUnitProperty_ParameterList, scope, 0, nullptr, &size);
     DumpResultIfFailed(result, "XAUAudioFilter::BuildParameterInfos(), AudioUnitGetProperty() 1");
     if (result != noErr)
         return {};
@@ -55,8 +56,8 @@ std::vector<AudioUnitParameterID> XAUAudioFilter::ReadParameterList(AudioUnitSco
     const auto announced = static_cast<UInt32>(count * sizeof(AudioUnitParameterID));
     room.assign(std::max(count, room.size()), 0);
     size = announced;
-    result = AudioUnitGetProperty(mInstance, kAudioUnitProperty_ParameterList, kAudioUnitScope_Global, 0, room.data(),
-                                  &size);
+    result = CallGuarded<AudioUnitGetProperty>(mInstance, kAudioUnitProperty_ParameterList, kAudioUnitScope_Global, 0,
+                                               room.data(), &size);
     DumpResultIfFailed(result, "XAUAudioFilter::BuildParameterInfos(), AudioUnitGetProperty() 2");
     const std::size_t read = result == noErr ? std::min(size, announced) / sizeof(AudioUnitParameterID) : 0;
     return {room.begin(), room.begin() + static_cast<std::ptrdiff_t>(read)};
@@ -76,7 +77,7 @@ XAUParameterInfo* XAUAudioFilter::FindParameter(int index) const
 void XAUAudioFilter::NotifyListeners(AudioUnitParameterID parameter, AudioUnitScope scope) const
 {
     const AudioUnitParameter changed = {mInstance, parameter, scope, 0};
-    const OSStatus result = CallGuarded([&] { return AUParameterListenerNotify(nullptr, nullptr, &changed); });
+    const OSStatus result = CallGuarded<AUParameterListenerNotify>(nullptr, nullptr, &changed);
     DumpRealtimeResultIfFailed(result, "AUParameterListenerNotify()");
 }
 
@@ -84,12 +85,8 @@ void XAUAudioFilter::SetParameter(int index, float value)
 {
     if (const XAUParameterInfo* info = FindParameter(index))
     {
-        const OSStatus result = CallGuarded(
-            [&]
-            {
-                return AudioUnitSetParameter(mInstance, info->GetParameterID(), info->GetScope(), 0,
-                                             info->FromNormalized(value), 0);
-            });
+        const OSStatus result = CallGuarded<AudioUnitSetParameter>(
+            mInstance, info->GetParameterID(), info->GetScope(), 0, info->FromNormalized(value), 0);
         DumpRealtimeResultIfFailed(result, "AudioUnitSetParameter()");
         NotifyListeners(info->GetParameterID(), info->GetScope()); // an open view follows
     }
@@ -102,8 +99,8 @@ float XAUAudioFilter::GetParameter(int index) const
     if (!info)
         return 0.0F;
     AudioUnitParameterValue value = 0.0F;
-    const OSStatus result = CallGuarded(
-        [&] { return AudioUnitGetParameter(mInstance, info->GetParameterID(), info->GetScope(), 0, &value); });
+    const OSStatus result =
+        CallGuarded<AudioUnitGetParameter>(mInstance, info->GetParameterID(), info->GetScope(), 0, &value);
     DumpResultIfFailed(result, "AudioUnitGetParameter()");
     return info->ToNormalized(value);
 }

@@ -2,6 +2,7 @@
 
 #include "foundation/zebcore/Trace.h"
 #include "host/src/XAU/src/CFOwner.h"
+#include "host/src/XAU/src/CallGuarded.h"
 #include "host/src/XAU/src/XAUAudioFilter.h"
 
 namespace zebaudiofilterhost::xau
@@ -68,8 +69,8 @@ void XAUAudioFilter::SetFactoryPreset(int index)
     const AUPreset* preset = GetFactoryPreset(index);
     if (!preset)
         return;
-    const OSStatus result = AudioUnitSetProperty(mInstance, kAudioUnitProperty_PresentPreset, kAudioUnitScope_Global,
-                                                 0, preset, sizeof(*preset));
+    const OSStatus result = CallGuarded<AudioUnitSetProperty>(mInstance, kAudioUnitProperty_PresentPreset,
+                                                              kAudioUnitScope_Global, 0, preset, sizeof(*preset));
     DumpResultIfFailed(result, "AudioUnitSetProperty(kAudioUnitProperty_PresentPreset)");
     if (result == noErr)
         NotifyListeners(kAUParameterListener_AnyParameter, kAudioUnitScope_Global);
@@ -81,8 +82,8 @@ bool XAUAudioFilter::SaveChunkData(PresetData& preset) const
 {
     CFPropertyListRef classInfo = nullptr;
     UInt32 size = sizeof(classInfo);
-    const OSStatus result =
-        AudioUnitGetProperty(mInstance, kAudioUnitProperty_ClassInfo, kAudioUnitScope_Global, 0, &classInfo, &size);
+    const OSStatus result = CallGuarded<AudioUnitGetProperty>(mInstance, kAudioUnitProperty_ClassInfo,
+                                                              kAudioUnitScope_Global, 0, &classInfo, &size);
     DumpResultIfFailed(result, "AudioUnitGetProperty(kAudioUnitProperty_ClassInfo)");
     if (result != noErr)
         return false;
@@ -104,8 +105,8 @@ bool XAUAudioFilter::LoadChunkData(const PresetData& preset)
     if (!list)
         return false;
     CFPropertyListRef const classInfo = list.get();
-    const OSStatus result = AudioUnitSetProperty(mInstance, kAudioUnitProperty_ClassInfo, kAudioUnitScope_Global, 0,
-                                                 &classInfo, sizeof(classInfo));
+    const OSStatus result = CallGuarded<AudioUnitSetProperty>(
+        mInstance, kAudioUnitProperty_ClassInfo, kAudioUnitScope_Global, 0, &classInfo, sizeof(classInfo));
     DumpResultIfFailed(result, "AudioUnitSetProperty(kAudioUnitProperty_ClassInfo)");
     if (result == noErr)
         NotifyListeners(kAUParameterListener_AnyParameter, kAudioUnitScope_Global);

@@ -56,11 +56,8 @@ void XAUAudioFilter::RenderChunk(float** in, float** out, int offset, int frames
     mCurrentInputs = mInputPointers.data();
     mCurrentFrames = frames;
     AudioUnitRenderActionFlags flags = 0;
-    const OSStatus result = CallGuarded(
-        [&] {
-            return AudioUnitRender(mInstance, &flags, &mRenderTime, 0, static_cast<UInt32>(frames),
-                                   &mOutputBuffers->Get());
-        });
+    const OSStatus result = CallGuarded<AudioUnitRender>(mInstance, &flags, &mRenderTime, 0,
+                                                         static_cast<UInt32>(frames), &mOutputBuffers->Get());
     if (result == noErr)
         CopyOutputs(out, offset, frames);
     else

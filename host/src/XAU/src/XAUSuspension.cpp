@@ -1,5 +1,6 @@
 // What changes between two runs of the filter: sizes, rates, buffers.
 
+#include "host/src/XAU/src/CallGuarded.h"
 #include "host/src/XAU/src/XAUAudioFilter.h"
 
 #include <algorithm>
@@ -70,8 +71,8 @@ void XAUAudioFilter::SetBlockSize(int blockSize)
     const bool wasInitialized = mAUInitialized;
     UninitializeAU();
     const auto frames = static_cast<UInt32>(std::clamp(blockSize, 0, kMaxChunk));
-    DumpResultIfFailed(AudioUnitSetProperty(mInstance, kAudioUnitProperty_MaximumFramesPerSlice,
-                                            kAudioUnitScope_Global, 0, &frames, sizeof(frames)),
+    DumpResultIfFailed(CallGuarded<AudioUnitSetProperty>(mInstance, kAudioUnitProperty_MaximumFramesPerSlice,
+                                                         kAudioUnitScope_Global, 0, &frames, sizeof(frames)),
                        "AudioUnitSetProperty(kAudioUnitProperty_MaximumFramesPerSlice)");
     if (wasInitialized)
         InitializeAU();
@@ -94,7 +95,7 @@ void XAUAudioFilter::Resume()
     mRenderTime.mSampleTime = 0.0;
     const UInt32 count = GetElementCount(kAudioUnitScope_Input);
     for (AudioUnitElement element = 0; element < count; ++element)
-        AudioUnitReset(mInstance, kAudioUnitScope_Global, element);
+        CallGuarded<AudioUnitReset>(mInstance, kAudioUnitScope_Global, element);
 }
 
 // The unit stays initialised: GetTransportState tells it that nothing plays.

@@ -14,6 +14,12 @@ namespace
 
 constexpr std::chrono::milliseconds kShortestInterval(1);
 
+RunLoopPtr Retain(CFRunLoopRef loop)
+{
+    CFRetain(loop);
+    return RunLoopPtr(loop);
+}
+
 // 0 if the unit does not tell, or has gone.
 AudioUnitParameterValue ReadValue(const ListenerRow& row)
 {
@@ -40,7 +46,7 @@ AUListenerBase::AUListenerBase(AUEventListenerProc proc, void* userData, CFRunLo
                                Seconds granularity)
     : mProc(proc)
     , mUserData(userData)
-    , mLoop(loop)
+    , mLoop(Retain(loop))
     , mGranularity(std::chrono::duration_cast<std::chrono::nanoseconds>(granularity))
     , mTimer(
           loop->AddTimer(std::max(kShortestInterval, std::chrono::duration_cast<std::chrono::milliseconds>(interval)),

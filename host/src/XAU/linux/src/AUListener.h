@@ -72,7 +72,7 @@ private:
 
     AUEventListenerProc mProc;
     void* mUserData;
-    CFRunLoopRef mLoop;
+    RunLoopPtr mLoop; // its thread may have ended
     std::chrono::nanoseconds mGranularity;
     CFOpaqueRunLoop::TimerID mTimer;
 

@@ -13,7 +13,7 @@ using namespace zebaudiofilterhost::xau;
 
 const CFStringRef kCFRunLoopDefaultMode = CFSTR("kCFRunLoopDefaultMode");
 
-CFOpaqueRunLoop::CFOpaqueRunLoop(bool isMain) : Object(cf::TypeID::RunLoop, Life::Process), mIsMain(isMain)
+CFOpaqueRunLoop::CFOpaqueRunLoop(bool isMain) : Object(cf::TypeID::RunLoop), mIsMain(isMain)
 {
 }
 
@@ -81,11 +81,11 @@ SInt32 CFOpaqueRunLoop::Run(Clock::duration time, bool returnAfterSourceHandled)
 
 CFRunLoopRef CFRunLoopGetCurrent()
 {
-    static CFOpaqueRunLoop sMain(true);
+    static const RunLoopPtr sMain(new CFOpaqueRunLoop(true));
     if (CurrentThreadIDIsMainThreadID())
-        return &sMain;
-    thread_local CFOpaqueRunLoop sOwn(false);
-    return &sOwn;
+        return sMain.get();
+    thread_local const RunLoopPtr sOwn(new CFOpaqueRunLoop(false));
+    return sOwn.get();
 }
 
 SInt32 CFRunLoopRunInMode(CFStringRef /*mode*/, CFTimeInterval seconds, Boolean returnAfterSourceHandled)

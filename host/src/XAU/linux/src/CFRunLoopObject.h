@@ -8,10 +8,11 @@
 #include <condition_variable>
 #include <functional>
 #include <map>
+#include <memory>
 #include <mutex>
 
 /// Timers of one thread. The main thread's are watches of the main-thread loop; another thread's wait for
-/// CFRunLoopRunInMode.
+/// CFRunLoopRunInMode. Its thread keeps it, and so does each listener, which may go after the thread has ended.
 struct CFOpaqueRunLoop final : zebaudiofilterhost::xau::cf::Object
 {
     using TimerID = unsigned long long;
@@ -43,3 +44,6 @@ private:
     std::map<TimerID, Timer> mTimers;
     TimerID mLastTimer = 0;
 };
+
+/// A reference of its own to a loop.
+using RunLoopPtr = std::unique_ptr<CFOpaqueRunLoop, zebaudiofilterhost::xau::cf::ReleaseObject>;

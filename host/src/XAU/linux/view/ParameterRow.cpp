@@ -101,10 +101,8 @@ void ParameterRow::ReadSteps()
         return;
     CFArrayRef names = nullptr;
     UInt32 size = sizeof(CFTypeRef);
-    const OSStatus result = CallGuarded(
-        [&] {
-            return AudioUnitGetProperty(mUnit, kAudioUnitProperty_ParameterValueStrings, mScope, mID, &names, &size);
-        });
+    const OSStatus result = CallGuarded<AudioUnitGetProperty>(mUnit, kAudioUnitProperty_ParameterValueStrings, mScope,
+                                                              mID, &names, &size);
     const bool hasNames = result == noErr && names != nullptr;
     const CFOwner owner(hasNames ? names : nullptr);
     for (std::size_t step = 0; step < static_cast<std::size_t>(steps); ++step)
@@ -125,11 +123,8 @@ std::string ParameterRow::ReadText(AudioUnitParameterValue value) const
     request.inParamID = mID;
     request.inValue = &value;
     UInt32 size = sizeof(request);
-    const OSStatus result = CallGuarded(
-        [&] {
-            return AudioUnitGetProperty(mUnit, kAudioUnitProperty_ParameterStringFromValue, mScope, 0, &request,
-                                        &size);
-        });
+    const OSStatus result = CallGuarded<AudioUnitGetProperty>(mUnit, kAudioUnitProperty_ParameterStringFromValue,
+                                                              mScope, 0, &request, &size);
     if (result == noErr)
         return ToShownText(MACtoZEB(request.outString)); // not released, as everywhere: units differ in whose it is
     return MakeText(static_cast<double>(value));
@@ -151,7 +146,7 @@ std::string ParameterRow::MakeText(double value) const
 bool ParameterRow::Refresh()
 {
     AudioUnitParameterValue value = 0.0F;
-    if (CallGuarded([&] { return AudioUnitGetParameter(mUnit, mID, mScope, 0, &value); }) != noErr)
+    if (CallGuarded<AudioUnitGetParameter>(mUnit, mID, mScope, 0, &value) != noErr)
         return false;
     const double range = mMaximum > mMinimum ? mMaximum - mMinimum : 1.0;
     const double position = std::clamp((static_cast<double>(value) - mMinimum) / range, 0.0, 1.0);
@@ -173,8 +168,7 @@ std::size_t ParameterRow::GetStep() const
 void ParameterRow::SetValue(double value)
 {
     const AudioUnitParameter parameter = GetParameter();
-    CallGuarded(
-        [&] { return AUParameterSet(nullptr, nullptr, &parameter, static_cast<AudioUnitParameterValue>(value), 0); });
+    CallGuarded<AUParameterSet>(nullptr, nullptr, &parameter, static_cast<AudioUnitParameterValue>(value), 0);
     Refresh();
 }
 
@@ -201,11 +195,8 @@ std::vector<AudioUnitParameterID> ReadParameterIDs(AudioUnit unit)
 {
     const auto read = [unit](void* data, UInt32& size)
     {
-        return CallGuarded(
-            [&] {
-                return AudioUnitGetProperty(unit, kAudioUnitProperty_ParameterList, kAudioUnitScope_Global, 0, data,
-                                            &size);
-            });
+        return CallGuarded<AudioUnitGetProperty>(unit, kAudioUnitProperty_ParameterList, kAudioUnitScope_Global, 0,
+                                                 data, &size);
     };
     UInt32 size = 0;
     if (read(nullptr, size) != noErr)

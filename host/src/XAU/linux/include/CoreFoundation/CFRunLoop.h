@@ -15,7 +15,7 @@ enum CFRunLoopRunResult : SInt32
 
 CF_EXPORT const CFStringRef kCFRunLoopDefaultMode;
 
-/// Lives as long as its thread.
+/// Lives as long as its thread, and as whoever retains it.
 CF_EXPORT CFRunLoopRef CFRunLoopGetCurrent();
 /// Runs what is due on the calling thread, and waits for more until the time is over. There is one mode.
 CF_EXPORT SInt32 CFRunLoopRunInMode(CFStringRef mode, CFTimeInterval seconds, Boolean returnAfterSourceHandled);
