@@ -62,8 +62,9 @@ public:
     /// Does nothing without a record. No signal.
     void SetPluginEnabled(const PluginLocator& locator, bool enabled);
 
-    /// Work on the containers given, which hold the same records. Of two sections with one locator the later wins.
-    /// With `merge` false both are emptied first.
+    /// Work on the containers given, which hold no null pointers. A record that the map has, by its locator, is
+    /// replaced, and the first one of that locator leaves the vector. So of two sections with one locator the later
+    /// wins. With `merge` false both containers are emptied first.
     void ReadPluginInfos(const PropList& list, PluginInfoMap& infos, PluginInfoVector& order, bool merge) const;
     void WritePluginInfos(PropList& list) const;
     /// A technology without a section keeps its directories.

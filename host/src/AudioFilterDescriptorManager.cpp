@@ -79,17 +79,19 @@ void AudioFilterDescriptorManager::AddAudioFilterDescriptor(DescriptorPtr descri
     {
         return;
     }
-    // Every ID of the vector is in the index, so the search is saved for a new ID: adding takes constant time.
-    if (!Enter(*mDescriptorIndex, descriptor))
+    // By pointer: the descriptor may have been read anew since it was added, and have another ID.
+    const auto known = std::find(mDescriptors.begin(), mDescriptors.end(), descriptor);
+    if (known != mDescriptors.end())
     {
-        const auto found = std::find(mDescriptors.begin(), mDescriptors.end(), descriptor);
-        if (found != mDescriptors.end())
+        mDescriptors.erase(known);
+        const std::size_t entry = Find(*mDescriptorIndex, descriptor->GetUniqueID());
+        if (entry != DescriptorIndex::kNone)
         {
-            mDescriptors.erase(found);
-            mDescriptorIndex->ValueAt(Find(*mDescriptorIndex, descriptor->GetUniqueID())) = descriptor;
+            mDescriptorIndex->Remove(entry);
         }
     }
-    mDescriptors.push_back(std::move(descriptor));
+    mDescriptors.push_back(descriptor);
+    Enter(*mDescriptorIndex, descriptor);
 }
 
 AudioFilterDescriptorManager::DescriptorPtr

@@ -86,8 +86,15 @@ std::vector<PluginLocator> PluginModuleInfoManager::GetPluginLocators() const
 
 std::vector<PluginLocator> PluginModuleInfoManager::GetEnabledPlugins() const
 {
-    std::vector<PluginLocator> locators = mRecords->Locators();
-    std::erase_if(locators, [this](const PluginLocator& locator) { return !mRecords->Find(locator)->IsEnabled(); });
+    std::vector<PluginLocator> locators;
+    for (const PluginInfoPtr& info : mRecords->InOrder())
+    {
+        if (info->IsEnabled())
+        {
+            locators.push_back(info->GetLocator());
+        }
+    }
+    std::sort(locators.begin(), locators.end());
     return locators;
 }
 

@@ -9,7 +9,9 @@
 #include "host/src/IndexedKeys.h"
 #include "host/src/PluginModuleRecords.h"
 
-#include <set>
+#include <cstddef>
+#include <map>
+#include <queue>
 
 namespace zebaudiofilterhost
 {
@@ -99,20 +101,26 @@ void PluginModuleInfoManager::ReadPluginInfos(const PropList& list, PluginInfoMa
         infos.clear();
         order.clear();
     }
-    // Replaced records leave the vector in one pass at the end: a list full of known plug-ins stays linear.
-    std::set<PluginInfoPtr> replaced;
+    // For each record that is replaced the first of its locator leaves the vector, all of them in one pass at the
+    // end: a list full of known plug-ins costs no more than a new one.
+    std::map<PluginLocator, std::queue<std::size_t>> places;
+    for (std::size_t place = 0; place < order.size(); ++place)
+    {
+        places[order[place]->GetLocator()].push(place);
+    }
     for (const PluginInfoPtr& info : ReadRecords(list))
     {
-        const auto known = infos.find(info->GetLocator());
-        if (known != infos.end())
+        std::queue<std::size_t>& same = places[info->GetLocator()];
+        if (infos.erase(info->GetLocator()) > 0 && !same.empty())
         {
-            replaced.insert(known->second);
-            infos.erase(known);
+            order[same.front()] = nullptr;
+            same.pop();
         }
         infos.emplace(info->GetLocator(), info);
+        same.push(order.size());
         order.push_back(info);
     }
-    std::erase_if(order, [&replaced](const PluginInfoPtr& info) { return replaced.contains(info); });
+    std::erase(order, PluginInfoPtr());
 }
 
 void PluginModuleInfoManager::EnterRecords(const PropList& list)

@@ -41,6 +41,19 @@ TEST_F(AudioFilterDescriptorManagerTest, SameObjectMovesToTheEnd)
     EXPECT_EQ(mManager.GetComponentDescriptorForID(u"3:a"), a);
 }
 
+TEST_F(AudioFilterDescriptorManagerTest, SameObjectStandsOnceAlsoUnderAnotherID)
+{
+    const DescriptorPtr descriptor = MakeExternal(VST3(u"/a"), u"3:a");
+    mManager.AddAudioFilterDescriptor(descriptor);
+    PropList section;
+    descriptor->Write(section);
+    section.SetValue(u8"id", u"3:b");
+    descriptor->Read(section);
+    mManager.AddAudioFilterDescriptor(descriptor);
+    EXPECT_EQ(CatalogueIDs(), (Strings{"3:b"}));
+    EXPECT_EQ(mManager.GetComponentDescriptorForID(u"3:b"), descriptor);
+}
+
 TEST_F(AudioFilterDescriptorManagerTest, FirstObjectOfAnIDAnswersUntilItsMapEntryGoes)
 {
     const DescriptorPtr first = MakeExternal(VST3(u"/a"), u"3:x");

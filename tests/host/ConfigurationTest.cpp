@@ -295,6 +295,12 @@ TEST_F(ConfigurationTest, LaterSectionOfALocatorWins)
     EXPECT_EQ(order[1], infos[VST3(u"/a")]);
     mManager.ReadPluginInfos(PropList(), infos, order, true);
     EXPECT_EQ(order.size(), 2u);
+    // The containers may differ: what the map has replaces the first of its locator in the vector, whichever that is.
+    const InfoPtr other = MakeInfo(VST3(u"/a"));
+    order = {other, order[1]};
+    mManager.ReadPluginInfos(list, infos, order, true);
+    EXPECT_EQ(std::count(order.begin(), order.end(), other), 0);
+    EXPECT_EQ(order.back(), infos[VST3(u"/a")]);
     mManager.ReadPluginInfos(PropList(), infos, order, false);
     EXPECT_TRUE(infos.empty() && order.empty());
 }

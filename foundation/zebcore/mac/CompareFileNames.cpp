@@ -36,15 +36,21 @@ bool IsVolumeCaseSensitive(std::string path)
     }
 }
 
+enum class Case
+{
+    kOfVolume,
+    kFolded
+};
+
 // Equal for all names of one file. Ordering by it is strict whatever mixture of volumes the paths are on.
-UTF16String Key(const UTF16String& path)
+UTF16String Key(const UTF16String& path, Case letters)
 {
     const std::unique_ptr<std::remove_pointer_t<CFMutableStringRef>, ReleaseReference> text(
         CFStringCreateMutable(kCFAllocatorDefault, 0));
     CFStringAppendCharacters(text.get(), reinterpret_cast<const UniChar*>(path.data()),
                              static_cast<CFIndex>(path.size()));
     CFStringNormalize(text.get(), kCFStringNormalizationFormD);
-    if (!IsVolumeCaseSensitive(ToNativePath(path)))
+    if (letters == Case::kFolded || !IsVolumeCaseSensitive(ToNativePath(path)))
         CFStringFold(text.get(), kCFCompareCaseInsensitive, nullptr);
     UTF16String key(static_cast<std::size_t>(CFStringGetLength(text.get())), u'\0');
     CFStringGetCharacters(text.get(), CFRangeMake(0, CFStringGetLength(text.get())),
@@ -56,12 +62,13 @@ UTF16String Key(const UTF16String& path)
 
 int CompareFileNames(const UTF16String& a, const UTF16String& b)
 {
-    return a == b ? 0 : Key(a).compare(Key(b));
+    return a == b ? 0 : Key(a, Case::kOfVolume).compare(Key(b, Case::kOfVolume));
 }
 
+// Without asking the volume: a hash is kept, and the volume may be mounted or gone when it is next asked for.
 std::size_t HashFileName(const UTF16String& path)
 {
-    return std::hash<UTF16String>()(Key(path));
+    return std::hash<UTF16String>()(Key(path, Case::kFolded));
 }
 
 } // namespace zebcore::filesupport
