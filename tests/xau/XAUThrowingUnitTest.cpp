@@ -140,14 +140,38 @@ TEST_F(XAUThrowingUnitTest, WhatCannotBeReadIsNotThere)
     EXPECT_TRUE(mFilter->GetInputBuses().empty());
 }
 
-TEST_F(XAUThrowingUnitTest, BusesThatAreReadInPartHaveTheRest)
+TEST_F(XAUThrowingUnitTest, WhatCanBeReadOfBusesAndParametersIsThere)
 {
-    mUnit.Answer({kAudioUnitProperty_AudioChannelLayout, kAudioUnitScope_Input, 0},
-                 ::AudioChannelLayout{kAudioChannelLayoutTag_Mono, 0, 0, {}});
-    mUnit.mThrowsIn = {"get property info"};
-    ASSERT_NO_FATAL_FAILURE(Make());
-    ASSERT_EQ(mFilter->GetInputBuses().size(), 1U);
-    EXPECT_EQ(mFilter->GetNumberOfInputChannels(), 2) << "by the stream format";
+    constexpr auto kInput = kAudioUnitScope_Input;
+    const CFOwner name(MakeString("Mine"));
+    mUnit.Answer({kAudioUnitProperty_ElementName, kInput, 0}, name.get());
+    mUnit.Answer({kAudioUnitProperty_AudioChannelLayout, kInput, 0},
+                 ::AudioChannelLayout{kAudioChannelLayoutTag_MPEG_5_1_A, 0, 0, {}});
+    mUnit.AnswerList(Global(kAudioUnitProperty_SupportedNumChannels), std::vector<AUChannelInfo>{{1, 1}});
+    struct Case
+    {
+        AudioUnitPropertyID property;
+        const char16_t* name;
+        int channels;
+        float parameter; // its value at twice the range
+    };
+    for (const Case& expected : {Case{kAudioUnitProperty_ElementName, u"Input", 6, 20.0F},
+                                 Case{kAudioUnitProperty_AudioChannelLayout, u"Mine", 1, 20.0F},
+                                 Case{kAudioUnitProperty_SupportedNumChannels, u"Mine", 6, 20.0F},
+                                 Case{kAudioUnitProperty_ParameterInfo, u"Mine", 6, 2.0F}})
+    {
+        if (expected.property != kAudioUnitProperty_ElementName)
+            CFRetain(name.get()); // for the filter, which reads it
+        mUnit.mThrowsOf = {expected.property};
+        ASSERT_NO_FATAL_FAILURE(Make()) << expected.property;
+        mUnit.mThrowsOf.clear();
+        ASSERT_EQ(mFilter->GetInputBuses().size(), 1U);
+        EXPECT_EQ(mFilter->GetInputBuses().front().GetName(), expected.name) << expected.property;
+        EXPECT_EQ(mFilter->GetNumberOfInputChannels(), expected.channels) << expected.property;
+        ASSERT_TRUE(mFilter->GetParameterInfo(0));
+        EXPECT_EQ(mFilter->GetParameterInfo(0)->FromNormalized(2.0F), expected.parameter) << expected.property;
+    }
+    EXPECT_EQ(CFGetRetainCount(name.get()), 1);
 }
 
 TEST_F(XAUThrowingUnitTest, PresetsAreNeitherSavedNorLoaded)

@@ -90,6 +90,8 @@ struct FakeUnit::Calls
     {
         const FakeUnit& unit = Of(self);
         unit.ThrowIfWanted("get property");
+        if (unit.mThrowsOf.count(property) != 0)
+            throw std::runtime_error("get property");
         const auto found = unit.mProperties.find({property, scope, element});
         if (found == unit.mProperties.end())
             return kAudioUnitErr_InvalidProperty;

@@ -83,8 +83,9 @@ public:
     std::vector<AudioTimeStamp> mTimes; // of the renders
     OSStatus mOpenResult = noErr;
     OSStatus mInitializeResult = noErr;
-    std::set<std::string> mThrowsIn;    // calls: "create", "open", "close", "initialize", "get property" and so on
-    bool mIgnoresAnnouncedSize = false; // writes all that it has, whatever room it was given
+    std::set<std::string> mThrowsIn; // calls: "create", "open", "close", "initialize", "get property" and so on
+    std::set<AudioUnitPropertyID> mThrowsOf; // where it is asked for one of these
+    bool mIgnoresAnnouncedSize = false;      // writes all that it has, whatever room it was given
     bool mGivesInstance = true;
 
 private:
