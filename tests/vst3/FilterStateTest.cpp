@@ -115,6 +115,7 @@ TEST_F(FilterState, OfAChunkThatLiesTheStatesThatAreThereComeBack)
              {MakeChunk(4, huge, "0123"), both("0123")},
              {MakeChunk(0x100000004, 0, "0123"), both("0123")},
              {Chunk(15, 0), both("")},
+             {MakeChunk(0x7fffffff, 4, "0123"), none},
              {MakeChunk(0x80000000, 4, "0123"), {"controller.setState 0123"}}})
     {
         plugin.ClearCalls();

@@ -54,11 +54,12 @@ std::uint64_t TakeSize(Bytes& rest)
 // A state of this size; none if it is not there as a whole. Streams count in 32 bits, and so does this.
 std::optional<Bytes> TakeState(Bytes& rest, std::uint64_t size)
 {
-    const auto count = static_cast<std::uint32_t>(size);
-    if (count > static_cast<std::uint32_t>(VST3MemoryStream::kMaxSize))
+    const auto count = static_cast<std::int32_t>(static_cast<std::uint32_t>(size));
+    if (count < 0)
         return std::nullopt;
-    const Bytes state = Take(rest, count);
-    return state.size() == count ? std::optional(state) : std::nullopt;
+    const Bytes state = Take(rest, static_cast<std::size_t>(count));
+    const bool isWhole = state.size() == static_cast<std::size_t>(count) && count <= VST3MemoryStream::kMaxSize;
+    return isWhole ? std::optional(state) : std::nullopt;
 }
 
 void AppendStream(std::vector<unsigned char>& chunk, const VST3MemoryStream& stream)
