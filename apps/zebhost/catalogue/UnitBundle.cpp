@@ -28,7 +28,7 @@ namespace
 // Those that a search of the catalogue takes.
 constexpr std::array<std::u16string_view, 4> kTypes = {u"aumx", u"aumf", u"aufx", u"aupn"};
 
-using Entry = std::map<UTF16String, UTF16String>;
+using UnitEntry = std::map<UTF16String, UTF16String>;
 
 // Four characters of Latin 1 as a number, in decimal.
 std::optional<std::string> Number(const UTF16String& code)
@@ -47,7 +47,7 @@ std::optional<std::string> Number(const UTF16String& code)
     return code.size() == kLength ? std::optional(std::to_string(number)) : std::nullopt;
 }
 
-std::optional<PluginLocator> ToLocator(Entry entry)
+std::optional<PluginLocator> ToLocator(UnitEntry entry)
 {
     const auto type = Number(entry[u"type"]);
     const auto subType = Number(entry[u"subtype"]);
@@ -119,7 +119,7 @@ private:
     UTF16String mText;
     UTF16String mList;
     UTF16String mKey;
-    Entry mEntry;
+    UnitEntry mEntry;
 };
 
 // The component layer of Linux takes these ahead of what it finds in its folders; macOS knows what is installed.
