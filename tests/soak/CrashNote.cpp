@@ -47,6 +47,11 @@ void UseSignalStack()
     constexpr std::size_t kBytes = 0x10000;
     thread_local std::array<std::byte, kBytes> memory;
     stack_t stack{};
+    if (sigaltstack(nullptr, &stack) == 0 && (stack.ss_flags & SS_DISABLE) == 0)
+    {
+        return; // a sanitizer's, which it takes down itself
+    }
+    stack = {};
     stack.ss_sp = memory.data();
     stack.ss_size = memory.size();
     sigaltstack(&stack, nullptr);
