@@ -72,7 +72,8 @@ TEST_F(PluginPlacesTest, SaysWhatAPluginIsCalled)
     WriteText(mFolder / "Effect.dll", "text");
     for (const char* command : {"scan", "info", "block"})
     {
-        EXPECT_THAT(Run({command, Path("Effect.dll")}).LastLine(), HasSubstr(".vst3, .vst, .component or .so")) << command;
+        EXPECT_THAT(Run({command, Path("Effect.dll")}).LastLine(), HasSubstr(".vst3, .vst, .component or .so"))
+            << command;
     }
 }
 
