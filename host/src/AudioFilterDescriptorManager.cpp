@@ -90,8 +90,8 @@ void AudioFilterDescriptorManager::AddAudioFilterDescriptor(DescriptorPtr descri
             mDescriptorIndex->Remove(entry);
         }
     }
-    mDescriptors.push_back(descriptor);
     Enter(*mDescriptorIndex, descriptor);
+    mDescriptors.push_back(std::move(descriptor));
 }
 
 AudioFilterDescriptorManager::DescriptorPtr

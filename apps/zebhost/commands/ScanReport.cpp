@@ -117,7 +117,7 @@ std::optional<Failure> ScanReport::FailureOf(const std::vector<std::string>& pat
     }
     const auto isNamed = [&named](const Result& result)
     {
-        return named.count(result.path) != 0;
+        return named.contains(result.path);
     };
     const auto found =
         std::find_if(mResults.begin(), mResults.end(),
