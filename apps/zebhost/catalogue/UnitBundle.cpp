@@ -122,13 +122,17 @@ private:
     UnitEntry mEntry;
 };
 
-// The component layer of Linux takes these ahead of what it finds in its folders; macOS knows what is installed.
+// The component layer of Linux takes these ahead of what it finds in its folders; macOS knows what is installed. It
+// goes through the environment so that workers have it, too. Once is enough: a path is asked about more than once.
 void Announce(const fs::path& bundle)
 {
     constexpr const char* kVariable = "AUDIO_COMPONENT_BUNDLES";
-    const char* const before = std::getenv(kVariable);
-    const std::string all = bundle.string() + (before != nullptr ? ':' + std::string(before) : std::string());
-    setenv(kVariable, all.c_str(), 1);
+    const char* const value = std::getenv(kVariable);
+    const std::string before = value != nullptr ? value : "";
+    if ((':' + before + ':').find(':' + bundle.string() + ':') == std::string::npos)
+    {
+        setenv(kVariable, (bundle.string() + (before.empty() ? "" : ':' + before)).c_str(), 1);
+    }
 }
 
 } // namespace

@@ -137,10 +137,11 @@ enum AudioUnitParameterOptions : UInt32
 {
     // Whoever reads the info releases its strings; without the flag the unit keeps them alive until Close.
     kAudioUnitParameterFlag_CFNameRelease = 1U << 4,
-    kAudioUnitParameterFlag_MeterReadOnly = 1U << 15, // a level to be watched: a view reads it again and again
-    kAudioUnitParameterFlag_IsHighResolution =
-        1U << 23, // no difference to this host
-                  // Not to be automated, and hidden from the application's lists; this host's view marks it.
+    // A level to be watched: a view reads it again and again.
+    kAudioUnitParameterFlag_MeterReadOnly = 1U << 15,
+    // No difference to this host.
+    kAudioUnitParameterFlag_IsHighResolution = 1U << 23,
+    // Not to be automated, and hidden from the application's lists; this host's view marks it.
     kAudioUnitParameterFlag_NonRealTime = 1U << 24,
     kAudioUnitParameterFlag_CanRamp = 1U << 25,
     kAudioUnitParameterFlag_ExpertMode = 1U << 26,      // no difference to this host
