@@ -15,7 +15,7 @@ namespace zebcore::filesupport
 namespace
 {
 
-constexpr const char* kAction = "cannot read";
+constexpr const char* kCannotRead = "cannot read";
 
 struct stat Status(const FileDescriptor& descriptor)
 {
@@ -30,10 +30,10 @@ struct stat Status(const FileDescriptor& descriptor)
 IPlatformByteStream::IPlatformByteStream(const File& file, utility::Flags<unsigned int> flags)
 {
     if (!flags.IsSet(kOpenForReading))
-        throw file_exception(kAction, file.FullPath(), EINVAL);
-    mDescriptor = std::make_unique<FileDescriptor>(file.FullPath(), O_RDONLY, 0, kAction);
+        throw file_exception(kCannotRead, file.FullPath(), EINVAL);
+    mDescriptor = std::make_unique<FileDescriptor>(file.FullPath(), O_RDONLY, 0, kCannotRead);
     if (S_ISDIR(Status(*mDescriptor).st_mode))
-        throw file_exception(kAction, file.FullPath(), EISDIR);
+        throw file_exception(kCannotRead, file.FullPath(), EISDIR);
 }
 
 IPlatformByteStream::~IPlatformByteStream() = default;

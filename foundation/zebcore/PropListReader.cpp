@@ -18,7 +18,6 @@ namespace
 {
 
 constexpr std::u8string_view kBlanks = u8" \t\r\n";
-constexpr int kHexadecimal = 16;
 
 // Succeeds for the whole text only. `format` is a base or a std::chars_format.
 template <typename T, typename... Format>
@@ -36,7 +35,7 @@ bool ParseFloat(std::u8string_view text, float& value)
     if (!text.starts_with(kNaNPrefix))
         return ParseNumber(text, value);
     std::uint32_t bits = 0;
-    if (!ParseNumber(text.substr(kNaNPrefix.size()), bits, kHexadecimal))
+    if (!ParseNumber(text.substr(kNaNPrefix.size()), bits, kNaNBase))
         return false;
     value = std::bit_cast<float>(bits);
     return true;

@@ -17,7 +17,6 @@ namespace zebcore::proplist
 namespace
 {
 
-constexpr int kHexadecimal = 16;
 constexpr std::size_t kLongText = std::size_t{1} << 16U;
 
 // `format` is a base or nothing.
@@ -35,7 +34,7 @@ void AppendFloat(UTF8String& out, float value)
     if (!std::isnan(value))
         return AppendNumber(out, value);
     out += kNaNPrefix;
-    AppendNumber(out, std::bit_cast<std::uint32_t>(value), kHexadecimal);
+    AppendNumber(out, std::bit_cast<std::uint32_t>(value), kNaNBase);
 }
 
 } // namespace

@@ -22,7 +22,7 @@ namespace zebcore::filesupport
 namespace
 {
 
-constexpr const char* kAction = "cannot save";
+constexpr const char* kCannotSave = "cannot save";
 constexpr int kMaxLinks = 40; // as many as the system follows
 constexpr mode_t kAllModeBits = 07777;
 constexpr mode_t kPermissionBits = 0777; // without those that act in the owner's name
@@ -33,7 +33,7 @@ UTF16String ReadLink(const UTF16String& path)
     std::vector<char> buffer(4096);
     const ssize_t length = readlink(ToNativePath(path).c_str(), buffer.data(), buffer.size());
     if (length < 0 && errno != EINVAL && errno != ENOENT)
-        throw file_exception(kAction, path, errno);
+        throw file_exception(kCannotSave, path, errno);
     return length <= 0 ? UTF16String() : FromNativePath({buffer.data(), static_cast<std::size_t>(length)});
 }
 
@@ -41,7 +41,7 @@ File ResolveLinks(const File& target)
 {
     UTF16String path = target.FullPath();
     if (path.empty() || path.find(u'\0') != UTF16String::npos)
-        throw file_exception(kAction, path, EINVAL);
+        throw file_exception(kCannotSave, path, EINVAL);
     for (int i = 0; i < kMaxLinks; ++i)
     {
         const UTF16String link = ReadLink(path);
@@ -49,14 +49,14 @@ File ResolveLinks(const File& target)
             return File(path);
         path = link.front() == u'/' ? link : Join(ParentOf(path), link);
     }
-    throw file_exception(kAction, target.FullPath(), ELOOP);
+    throw file_exception(kCannotSave, target.FullPath(), ELOOP);
 }
 
 bool IsThere(const File& target)
 {
     const FileStatus status = GetFileStatus(target.FullPath());
     if (status.mError == 0 && !S_ISREG(status.mStat.st_mode))
-        throw file_exception(kAction, target.FullPath(), "It is not a regular file");
+        throw file_exception(kCannotSave, target.FullPath(), "It is not a regular file");
     return status.mError == 0;
 }
 
@@ -117,7 +117,7 @@ void SafeSave::Flush() const
 {
     try
     {
-        FileDescriptor temp(mTemp.FullPath(), O_RDONLY, 0, kAction);
+        FileDescriptor temp(mTemp.FullPath(), O_RDONLY, 0, kCannotSave);
         // Only now: the permissions of the old file may forbid writing.
         TakeOnOwnerAndPermissions(temp.Get(), mTarget);
         temp.Flush();
@@ -125,7 +125,7 @@ void SafeSave::Flush() const
     }
     catch (const file_exception& failure)
     {
-        throw file_exception(kAction, mTarget.FullPath(), failure.Error());
+        throw file_exception(kCannotSave, mTarget.FullPath(), failure.Error());
     }
 }
 
@@ -138,7 +138,7 @@ void SafeSave::Replace()
     const int error = errno;
     if (mReplaces && IsRefusal(error))
         throw file_delete_exception("cannot replace", mTarget.FullPath(), error);
-    throw file_exception(kAction, mTarget.FullPath(), error);
+    throw file_exception(kCannotSave, mTarget.FullPath(), error);
 }
 
 void SafeSave::FlushFolder() const

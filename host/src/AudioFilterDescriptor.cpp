@@ -3,6 +3,7 @@
 #include "foundation/zebcore/Localizer.h"
 #include "foundation/zebcore/PropList.h"
 #include "foundation/zebcore/RefCountedInterface.h"
+#include "host/src/EntryKeys.h"
 
 #include <map>
 
@@ -12,14 +13,9 @@ namespace zebaudiofilterhost
 namespace
 {
 
-const UTF8String kKey_Locator = u8"locator";
-const UTF8String kKey_Name = u8"name";
-const UTF8String kKey_Vendor = u8"vendor";
-const UTF8String kKey_Version = u8"version";
 const UTF8String kKey_Category = u8"category";
 const UTF8String kKey_ID = u8"id";
 const UTF8String kKey_FactoryGuid = u8"factory_guid";
-const UTF8String kKey_Enabled = u8"enabled";
 const UTF8String kKey_Synth = u8"synth";
 const UTF8String kKey_Mono = u8"mono";
 const UTF8String kKey_Stereo = u8"stereo";

@@ -18,11 +18,11 @@ namespace zebaudiofilterhost
 namespace
 {
 
-const UTF8String kKey_Version = u8"version";
+const UTF8String kKey_BlockListVersion = u8"version";
 const UTF8String kKey_NumBannedPluginFiles = u8"num_banned_plugin_files";
 const UTF8String kKey_BannedPluginFiles = u8"banned_plugin_files";
 
-constexpr unsigned int kConfigurationVersion = 1;
+constexpr unsigned int kBlockListVersion = 1;
 
 using zebcore::utility::CaseInsensitive::Equal;
 
@@ -56,8 +56,8 @@ void BannedPluginManager::LoadConfiguration(File& file)
     PropList list;
     zebcore::proplist::utils::LoadPropList(file.FullPath(), list, false);
     unsigned int version = 0;
-    list.GetValue(kKey_Version, version);
-    if (version == kConfigurationVersion)
+    list.GetValue(kKey_BlockListVersion, version);
+    if (version == kBlockListVersion)
     {
         ReadBannedPlugins(list);
     }
@@ -66,7 +66,7 @@ void BannedPluginManager::LoadConfiguration(File& file)
 void BannedPluginManager::SaveConfiguration(File& file) const
 {
     PropList list;
-    list.SetValue(kKey_Version, kConfigurationVersion);
+    list.SetValue(kKey_BlockListVersion, kBlockListVersion);
     WriteBannedPlugins(list);
     zebcore::proplist::utils::SavePropList(file, list);
 }

@@ -1,6 +1,7 @@
 #include "host/PluginModuleInfo.h"
 
 #include "foundation/zebcore/PropList.h"
+#include "host/src/EntryKeys.h"
 
 namespace zebaudiofilterhost
 {
@@ -8,12 +9,7 @@ namespace zebaudiofilterhost
 namespace
 {
 
-const UTF8String kKey_Locator = u8"locator";
-const UTF8String kKey_Name = u8"name";
-const UTF8String kKey_Vendor = u8"vendor";
-const UTF8String kKey_Version = u8"version";
 const UTF8String kKey_Type = u8"type";
-const UTF8String kKey_Enabled = u8"enabled";
 const UTF8String kKey_IsShell = u8"isShell";
 const UTF8String kKey_HasNonSynth = u8"hasNonSynth";
 

@@ -19,7 +19,7 @@ namespace zebaudiofilterhost
 namespace
 {
 
-const UTF8String kKey_Version = u8"version";
+const UTF8String kKey_ConfigurationVersion = u8"version";
 const UTF8String kKey_NumTechInfos = u8"num_tech_infos";
 const UTF8String kKey_TechInfo = u8"tech_info";
 const UTF8String kKey_TechType = u8"tech_type";
@@ -180,7 +180,7 @@ void PluginModuleInfoManager::LoadConfiguration(File& file)
     if (file.Exists())
     {
         zebcore::proplist::utils::LoadPropList(file.FullPath(), list, false);
-        list.GetValue(kKey_Version, version);
+        list.GetValue(kKey_ConfigurationVersion, version);
     }
     // There is no migration: a file of another version counts as none, and the next save replaces it.
     if (version == kConfigurationVersion)
@@ -229,7 +229,7 @@ void PluginModuleInfoManager::SaveConfiguration(File& file, bool withDirectories
 
 void PluginModuleInfoManager::BuildConfigurationPropList(PropList& list, bool withDirectories) const
 {
-    list.SetValue(kKey_Version, kConfigurationVersion);
+    list.SetValue(kKey_ConfigurationVersion, kConfigurationVersion);
     if (withDirectories)
     {
         WriteDirectories(list);

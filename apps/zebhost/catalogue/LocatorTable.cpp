@@ -19,7 +19,7 @@ namespace FileUtils = zebcore::utility::FileUtils;
 namespace
 {
 
-constexpr int kVersion = 1;
+constexpr int kTableVersion = 1;
 
 std::string Key(const PluginLocator& locator)
 {
@@ -41,7 +41,7 @@ void LocatorTable::Load()
     mEntries.clear();
     std::ifstream stream(mFile, std::ios::binary);
     const Json document = Json::parse(stream, nullptr, false);
-    if (!document.is_object() || document.value("version", Json()) != kVersion || !document.contains(mSection) ||
+    if (!document.is_object() || document.value("version", Json()) != kTableVersion || !document.contains(mSection) ||
         !document[mSection].is_object())
     {
         return;
@@ -62,7 +62,7 @@ void LocatorTable::Save(Saving saving) const
     {
         entries[key] = entry;
     }
-    const std::string text = ToText(Json{{"version", kVersion}, {mSection, entries}});
+    const std::string text = ToText(Json{{"version", kTableVersion}, {mSection, entries}});
     std::filesystem::create_directories(mFile.parent_path());
     if (saving == Saving::Quick)
     {

@@ -24,7 +24,7 @@ using zebcore::proplist::PropList;
 namespace
 {
 
-constexpr unsigned int kVersion = 1;
+constexpr unsigned int kStoreVersion = 1;
 constexpr const char8_t* kVersionKey = u8"version";
 constexpr const char8_t* kFilterIDKey = u8"filter_id";
 constexpr const char8_t* kFilterNameKey = u8"filter_name";
@@ -43,7 +43,7 @@ std::optional<PropList> ReadPreset(const fs::path& file)
     std::optional<PropList> list(std::in_place); // Filled where it stays: a preset may have megabytes
     unsigned int version = 0;
     const bool sound = zebcore::proplist::utils::LoadPropList(ToFile(file).FullPath(), *list, false) &&
-                       list->GetValue(kVersionKey, version) && version == kVersion &&
+                       list->GetValue(kVersionKey, version) && version == kStoreVersion &&
                        list->GetSubList(kPresetKey) != nullptr;
     if (!sound)
     {
@@ -55,7 +55,7 @@ std::optional<PropList> ReadPreset(const fs::path& file)
 void WritePreset(AudioFilter& filter, const fs::path& file)
 {
     PropList list;
-    list.SetValue(kVersionKey, kVersion);
+    list.SetValue(kVersionKey, kStoreVersion);
     list.SetValue(kFilterIDKey, filter.GetID());
     list.SetValue(kFilterNameKey, filter.GetDisplayName());
     PresetData preset(list.GetOrCreateSubList(kPresetKey));

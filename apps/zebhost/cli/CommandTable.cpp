@@ -11,7 +11,7 @@ namespace zebhost
 namespace
 {
 
-std::vector<CommandSpec> Joined(std::initializer_list<std::vector<CommandSpec>> groups)
+std::vector<CommandSpec> AllOf(std::initializer_list<std::vector<CommandSpec>> groups)
 {
     std::vector<CommandSpec> all;
     for (const std::vector<CommandSpec>& group : groups)
@@ -25,8 +25,8 @@ std::vector<CommandSpec> Joined(std::initializer_list<std::vector<CommandSpec>> 
 
 const std::vector<CommandSpec>& CommandTable()
 {
-    static const std::vector<CommandSpec> sTable = Joined({CatalogueCommands(), RenderCommands(), PresetCommands(),
-                                                           EditorCommands(), BlockCommands(), ShellCommands()});
+    static const std::vector<CommandSpec> sTable = AllOf({CatalogueCommands(), RenderCommands(), PresetCommands(),
+                                                          EditorCommands(), BlockCommands(), ShellCommands()});
     return sTable;
 }
 

@@ -40,7 +40,7 @@ CommandSpec LoadSpec()
     };
 }
 
-CommandSpec ListSpec()
+CommandSpec PresetListSpec()
 {
     return {
         "preset list",
@@ -58,7 +58,7 @@ CommandSpec ListSpec()
 
 std::vector<CommandSpec> PresetCommands()
 {
-    return {SaveSpec(), LoadSpec(), ListSpec()};
+    return {SaveSpec(), LoadSpec(), PresetListSpec()};
 }
 
 std::vector<CommandSpec> EditorCommands()

@@ -25,7 +25,7 @@ using zebaudiofilterhost::AudioFilter;
 namespace
 {
 
-std::vector<float> Values(const AudioFilter& filter)
+std::vector<float> ValuesOf(const AudioFilter& filter)
 {
     std::vector<float> values;
     for (int index = 0; index < filter.GetParameterCount(); ++index)
@@ -92,7 +92,7 @@ ExitCode RunEdit(CommandContext& context)
     {
         pictureFile.emplace(arguments.Text("screenshot"), arguments.Has("overwrite"));
     }
-    const std::vector<float> before = Values(*filter);
+    const std::vector<float> before = ValuesOf(*filter);
     const EditorOutcome outcome = RunEditor(*filter, filter.Name(), milliseconds, pictureFile.has_value());
     if (!outcome.trouble.empty())
     {

@@ -24,6 +24,7 @@ inline constexpr std::u8string_view kFloatsElement = u8"floats";
 inline constexpr std::u8string_view kTrue = u8"true";
 inline constexpr std::u8string_view kFalse = u8"false";
 
-inline constexpr std::u8string_view kNaNPrefix = u8"nan:"; // the bits in hexadecimal follow
+inline constexpr std::u8string_view kNaNPrefix = u8"nan:"; // the bits follow, to this base
+inline constexpr int kNaNBase = 16;
 
 } // namespace zebcore::proplist

@@ -19,7 +19,7 @@ constexpr int kOpeningWidth = 480;
 constexpr int kOpeningHeight = 640; // at most: fits the smallest screens
 constexpr int kRowsPerTurn = 3;     // of the wheel
 constexpr unsigned int kLevelMs = 50;
-constexpr float kListenerSeconds = 0.03F;
+constexpr float kPollSeconds = 0.03F;
 constexpr xcb_button_t kLeftButton = 1;
 constexpr xcb_button_t kWheelUp = 4;
 constexpr xcb_button_t kWheelDown = 5;
@@ -115,8 +115,8 @@ void GenericView::Listen()
 {
     mWatch = zebcore::threads::AddDescriptorWatch(xcb_get_file_descriptor(mConnection.get()),
                                                   [this](int) { OnReadable(); });
-    if (AUEventListenerCreate(OnParameterChanged, this, CFRunLoopGetCurrent(), kCFRunLoopDefaultMode,
-                              kListenerSeconds, kListenerSeconds, &mListener) != noErr)
+    if (AUEventListenerCreate(OnParameterChanged, this, CFRunLoopGetCurrent(), kCFRunLoopDefaultMode, kPollSeconds,
+                              kPollSeconds, &mListener) != noErr)
         mListener = nullptr;
 }
 

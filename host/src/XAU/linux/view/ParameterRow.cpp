@@ -18,7 +18,7 @@ namespace zebaudiofilterhost::xau
 namespace
 {
 
-constexpr UInt32 kMaxParameters = 32768;
+constexpr UInt32 kMaxRows = 32768;
 constexpr double kMaxNames = 64.0; // of steps: the unit is asked for each
 constexpr std::size_t kMaxText = 256;
 
@@ -201,7 +201,7 @@ std::vector<AudioUnitParameterID> ReadParameterIDs(AudioUnit unit)
     UInt32 size = 0;
     if (read(nullptr, size) != noErr)
         return {};
-    const UInt32 count = std::min(static_cast<UInt32>(size / sizeof(AudioUnitParameterID)), kMaxParameters);
+    const UInt32 count = std::min(static_cast<UInt32>(size / sizeof(AudioUnitParameterID)), kMaxRows);
     const auto announced = static_cast<UInt32>(count * sizeof(AudioUnitParameterID));
     std::vector<AudioUnitParameterID> ids(std::max<std::size_t>(count, 1)); // null would ask for the size
     size = announced;
