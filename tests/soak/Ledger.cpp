@@ -5,6 +5,16 @@
 namespace soak
 {
 
+namespace
+{
+
+std::ptrdiff_t Difference(std::size_t after, std::size_t before)
+{
+    return static_cast<std::ptrdiff_t>(after) - static_cast<std::ptrdiff_t>(before);
+}
+
+} // namespace
+
 Ledger::Ledger(const std::vector<std::string>& names)
 {
     for (const std::string& name : names)
@@ -19,17 +29,18 @@ void Ledger::AddTurn(std::size_t index, int lives, int editors, const Resources&
     ++account.turns;
     account.lives += lives;
     account.editors += editors;
-    account.growth += static_cast<std::ptrdiff_t>(after.inUse) - static_cast<std::ptrdiff_t>(before.inUse);
+    account.growth += Difference(after.inUse, before.inUse);
+    account.resident += Difference(after.resident, before.resident);
     account.descriptors += after.descriptors - before.descriptors;
     account.threads += after.threads - before.threads;
 }
 
-std::vector<Ledger::Account> Ledger::Worst(std::size_t most) const
+std::vector<Ledger::Account> Ledger::Worst(std::size_t most, std::ptrdiff_t Account::*kind) const
 {
     std::vector<Account> worst;
     std::copy_if(mAccounts.begin(), mAccounts.end(), std::back_inserter(worst),
                  [](const Account& account) { return account.HasLeft(); });
-    std::sort(worst.begin(), worst.end(), [](const Account& a, const Account& b) { return a.growth > b.growth; });
+    std::sort(worst.begin(), worst.end(), [kind](const Account& a, const Account& b) { return a.*kind > b.*kind; });
     worst.resize(std::min(worst.size(), most));
     return worst;
 }

@@ -9,7 +9,8 @@
 namespace soak
 {
 
-/// Who has made the heap grow. Only what is measured while nothing else lives can be put down to one effect. [main]
+/// Who has made the process grow. Only what is measured while nothing else lives can be put down to one effect.
+/// [main]
 class Ledger
 {
 public:
@@ -17,14 +18,15 @@ public:
     {
         std::string name;
         int turns = 0;
-        int lives = 0;             // filters in these
-        int editors = 0;           // openings in these
-        std::ptrdiff_t growth = 0; // bytes in these; less than 0 where something from before was given back
-        int descriptors = 0;       // that were left open in these
-        int threads = 0;           // that were left running in these
+        int lives = 0;               // filters in these
+        int editors = 0;             // openings in these
+        std::ptrdiff_t growth = 0;   // of the heap, in bytes; less than 0 where something from before was given back
+        std::ptrdiff_t resident = 0; // growth of resident memory, in bytes: what the heap has no part in too
+        int descriptors = 0;         // that were left open in these
+        int threads = 0;             // that were left running in these
 
         double PerLife() const { return lives == 0 ? 0.0 : static_cast<double>(growth) / lives; }
-        bool HasLeft() const { return growth > 0 || descriptors > 0 || threads > 0; }
+        bool HasLeft() const { return growth > 0 || resident > 0 || descriptors > 0 || threads > 0; }
     };
 
     /// The accounts stand in the order of the names.
@@ -34,8 +36,9 @@ public:
     void AddTurn(std::size_t index, int lives, int editors, const Resources& before, const Resources& after);
 
     const std::vector<Account>& Accounts() const { return mAccounts; }
-    /// The `most` accounts that have grown by most, worst first; those that have left nothing are left out.
-    std::vector<Account> Worst(std::size_t most) const;
+    /// The `most` accounts whose `kind` of memory has grown by most, worst first; those that have left nothing are
+    /// left out.
+    std::vector<Account> Worst(std::size_t most, std::ptrdiff_t Account::*kind) const;
 
 private:
     std::vector<Account> mAccounts;

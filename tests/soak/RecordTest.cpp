@@ -94,19 +94,26 @@ TEST(RecordTest, DoesNotPassARunThatTestedNothing)
 
 TEST(LedgerTest, PutsWhatStaysDownToItsEffect)
 {
-    Ledger ledger({"tight", "leaks", "leaks more", "keeps a descriptor"});
-    const Resources before{0, 1000, 10, 3};
+    Ledger ledger({"tight", "leaks", "leaks more", "keeps a descriptor", "maps memory"});
+    const Resources before{5000, 1000, 10, 3};
     ledger.AddTurn(0, 5, 1, before, before);
-    ledger.AddTurn(1, 5, 1, before, {0, 1050, 10, 3});
-    ledger.AddTurn(1, 5, 1, before, {0, 1050, 10, 3});
-    ledger.AddTurn(2, 5, 1, before, {0, 1900, 10, 3});
-    ledger.AddTurn(3, 5, 1, before, {0, 990, 11, 3});
-    std::vector<std::string> names;
-    for (const Ledger::Account& account : ledger.Worst(5))
+    ledger.AddTurn(1, 5, 1, before, {5000, 1050, 10, 3});
+    ledger.AddTurn(1, 5, 1, before, {5000, 1050, 10, 3});
+    ledger.AddTurn(2, 5, 1, before, {5800, 1900, 10, 3});
+    ledger.AddTurn(3, 5, 1, before, {4900, 990, 11, 3});
+    ledger.AddTurn(4, 5, 1, before, {9000, 980, 10, 3});
+    const auto worst = [&ledger](std::size_t most, std::ptrdiff_t Ledger::Account::*kind)
     {
-        names.push_back(account.name);
-    }
-    EXPECT_THAT(names, ElementsAre("leaks more", "leaks", "keeps a descriptor"));
+        std::vector<std::string> names;
+        for (const Ledger::Account& account : ledger.Worst(most, kind))
+        {
+            names.push_back(account.name);
+        }
+        return names;
+    };
+    EXPECT_THAT(worst(5, &Ledger::Account::growth),
+                ElementsAre("leaks more", "leaks", "keeps a descriptor", "maps memory"));
+    EXPECT_THAT(worst(2, &Ledger::Account::resident), ElementsAre("maps memory", "leaks more"));
     EXPECT_EQ(ledger.Accounts()[1].PerLife(), 10.0);
 }
 

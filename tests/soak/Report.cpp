@@ -33,6 +33,7 @@ Json ToJson(const Ledger::Account& account)
             {"editors", account.editors},
             {"grownBytes", account.growth},
             {"bytesPerFilter", account.PerLife()},
+            {"residentBytes", account.resident},
             {"descriptors", account.descriptors},
             {"threads", account.threads}};
 }
@@ -94,11 +95,12 @@ void SayWhatWasThrown(const Console& console, const std::vector<Throws::Entry>& 
     }
 }
 
-void SayWhatStays(const Console& console, const Ledger& ledger)
+void SayWhatStays(const Console& console, const Ledger& ledger, std::ptrdiff_t Ledger::Account::*kind)
 {
-    for (const Ledger::Account& account : ledger.Worst(kMostNamed))
+    for (const Ledger::Account& account : ledger.Worst(kMostNamed, kind))
     {
-        console.Say("soak: " + account.name + ", alone, has left " + std::to_string(account.growth) + " bytes, " +
+        console.Say("soak: " + account.name + ", alone, has left " + std::to_string(account.growth) +
+                    " bytes of the heap, " + std::to_string(account.resident) + " of resident memory, " +
                     std::to_string(account.descriptors) + " descriptors and " + std::to_string(account.threads) +
                     " threads behind, after " + std::to_string(account.lives) + " filters and " +
                     std::to_string(account.editors) + " editors");
@@ -109,7 +111,8 @@ void SayWhatStays(const Console& console, const Ledger& ledger)
 
 void SayFindings(const Console& console, const Findings& findings)
 {
-    SayWhatStays(console, findings.ledger);
+    SayWhatStays(console, findings.ledger, &Ledger::Account::growth);
+    SayWhatStays(console, findings.ledger, &Ledger::Account::resident);
     SayWhatWasThrown(console, findings.score.throws.Entries());
     if (!findings.leftOut.empty())
     {

@@ -108,8 +108,10 @@ void Measure(VSTPluginMainProc entry, Display* display, int lives, const char* w
     const soak::Resources after = soak::MeasureResources();
     const double count = lives;
     std::cout << "  " << what << ": "
-              << (static_cast<double>(after.inUse) - static_cast<double>(before.inUse)) / count << " bytes, "
-              << (after.descriptors - before.descriptors) / count << " descriptors, "
+              << (static_cast<double>(after.inUse) - static_cast<double>(before.inUse)) / count
+              << " bytes of the heap, "
+              << (static_cast<double>(after.resident) - static_cast<double>(before.resident)) / count
+              << " of resident memory, " << (after.descriptors - before.descriptors) / count << " descriptors, "
               << (after.threads - before.threads) / count << " threads a life" << std::endl;
 }
 
