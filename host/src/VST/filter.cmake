@@ -3,6 +3,7 @@ set(ZEB_VST_FILTER_SOURCES
     src/AudioMasterHandlerMap.cpp
     src/VSTAudioFilter.cpp
     src/VSTHostCallback.cpp
+    src/VSTParameterSetting.cpp
     src/VSTPins.cpp
     src/VSTProcessing.cpp
     src/VSTSuspension.cpp

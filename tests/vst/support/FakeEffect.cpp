@@ -225,6 +225,8 @@ void FakeEffect::SetParameter(AEffect* self, std::int32_t index, float value)
     FakeEffect& fake = SelfOf(self);
     fake.Record({"setParameter", -1, index, 0, nullptr, value});
     fake.ParameterAt(index) = value;
+    if (fake.onSet)
+        fake.onSet(index, value);
 }
 
 float FakeEffect::GetParameter(AEffect* self, std::int32_t index)

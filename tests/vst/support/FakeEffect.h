@@ -53,6 +53,9 @@ public:
     Render replace;
     Render accumulate;
 
+    // What setParameter does when the value is there.
+    std::function<void(int index, float value)> onSet;
+
     // One value for each of effect.numParams; grows at need.
     std::vector<float> parameters;
 

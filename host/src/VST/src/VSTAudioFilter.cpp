@@ -8,6 +8,7 @@
 #include "host/src/VST/src/VSTEffectText.h"
 #include "host/src/VST/src/VSTFilterID.h"
 #include "host/src/VST/src/VSTParameterInfo.h"
+#include "host/src/VST/src/VSTParameterSetting.h"
 
 #include <algorithm>
 #include <string_view>
@@ -118,7 +119,10 @@ int VSTAudioFilter::GetParameterCount() const
 void VSTAudioFilter::SetParameter(int index, float value)
 {
     if (index >= 0 && index < GetParameterCount() && GetEffect()->setParameter)
+    {
+        const VSTParameterSetting setting(this, index);
         GetEffect()->setParameter(GetEffect(), index, value);
+    }
     AudioFilter::SetParameter(index, value);
 }
 

@@ -115,6 +115,7 @@ private:
     void ProcessSlice(AEffect& effect, float** in, float** out, int offset, int frames);
     void ClearAccumulated(int offset, int frames);
 
+    void Automate(int index, float value);
     long long PinConnected(int index, long long value) const;
     long long GetTime(long long wanted);
 

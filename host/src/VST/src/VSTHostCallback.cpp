@@ -5,6 +5,7 @@
 #include "foundation/zebcore/Trace.h"
 #include "host/PluginModule.h"
 #include "host/src/VST/src/VSTAudioFilter.h"
+#include "host/src/VST/src/VSTParameterSetting.h"
 #include "host/src/VST/src/VSTText.h"
 
 #include <algorithm>
@@ -121,7 +122,7 @@ long long VSTAudioFilter::AudioMasterCallback(int opcode, int index, long long v
     switch (opcode)
     {
     case audioMasterAutomate:
-        SetParameterAutomated(index, opt);
+        Automate(index, opt);
         return 0;
     case audioMasterPinConnected:
         return PinConnected(index, value);
@@ -140,6 +141,16 @@ void VSTAudioFilter::AddAudioMasterHandler(void* owner, const AudioMasterHandler
 void VSTAudioFilter::RemoveAudioMasterHandler(void* owner)
 {
     mHandlers.Erase(owner);
+}
+
+// A plug-in that reports a parameter from the very call that sets it, or two parameters that report each other, would
+// be set again without end. The plug-in has that value already, so everybody else is told, and it is not.
+void VSTAudioFilter::Automate(int index, float value)
+{
+    if (!VSTParameterSetting::IsUnderWay(this, index))
+        return SetParameterAutomated(index, value);
+    AudioFilter::SetParameter(index, value);
+    FireAutomatedParameterChange(index, value);
 }
 
 // 0 says that the pin is connected. Pins count as far as the buses have channels, not as far as the plug-in has pins.
