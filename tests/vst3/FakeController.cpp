@@ -69,6 +69,8 @@ public:
     }
     int32 PLUGIN_API getParameterCount() override
     {
+        if (mPlugin.countingParameters)
+            mPlugin.countingParameters();
         return mPlugin.parameterCount == -1 ? static_cast<int32>(mPlugin.parameters.size()) : mPlugin.parameterCount;
     }
     tresult PLUGIN_API getParameterInfo(int32 index, ParameterInfo& info) override

@@ -100,19 +100,20 @@ IPluginFactory* FakePlugin::MakeFactory()
 
 boost::intrusive_ptr<zebaudiofilterhost::vst3::VST3AudioFilter> FakePlugin::MakeFilter()
 {
-    IPluginFactory* factory = MakeFactory();
-    boost::intrusive_ptr<zebaudiofilterhost::vst3::VST3AudioFilter> filter(
-        new zebaudiofilterhost::vst3::VST3AudioFilter(factory, classInfo));
-    factory->release();
-    return filter;
+    const auto factory = zebaudiofilterhost::vst3::PluginPtr<IPluginFactory>::Adopt(MakeFactory());
+    return new zebaudiofilterhost::vst3::VST3AudioFilter(factory.Get(), classInfo);
 }
 
 void FakePlugin::Call(const std::string& text)
 {
     if (!recording)
         return;
-    const std::lock_guard lock(mMutex);
-    mCalls.push_back(text);
+    {
+        const std::lock_guard lock(mMutex);
+        mCalls.push_back(text);
+    }
+    if (called)
+        called(text);
 }
 
 std::vector<std::string> FakePlugin::Calls() const

@@ -133,6 +133,10 @@ public:
     tresult attachedResult = kResultOk;
     ViewRect viewSize{0, 0, 400, 300};
 
+    // Run at their time, and may throw.
+    std::function<void(const std::string&)> called; // with the text of each call that is written down
+    std::function<void()> countingParameters;
+
     // What the host gave; not owned.
     FUnknown* hostContext = nullptr;
     IComponentHandler* handler = nullptr;

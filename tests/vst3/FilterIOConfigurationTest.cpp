@@ -7,12 +7,15 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <array>
 #include <cstring>
+#include <vector>
 
 using namespace fakeplugin;
 using testing::ElementsAre;
 using zebaudiofilterhost::AudioChannelLabel;
 using zebaudiofilterhost::AudioFilterBusDescription;
+using zebaudiofilterhost::ChannelFlags;
 using zebaudiofilterhost::ChannelLayout;
 using zebaudiofilterhost::PluginLocator;
 using zebaudiofilterhost::UTF16String;
@@ -127,6 +130,40 @@ TEST(FilterIOConfiguration, RefusedRequestLeavesTheBuses)
     filter->RequestIOConfiguration({mono}, {mono});
     EXPECT_EQ(filter->GetNumberOfInputChannels(), 1);
     EXPECT_EQ(plugin.CallsTo("component.activateBus").size(), 2U);
+}
+
+// As the interface has it: the plug-in comes as near as it can, and refuses all the same.
+TEST(FilterIOConfiguration, PluginThatRefusesAndFollowsStaysWithinItsBuffers)
+{
+    constexpr int kFrames = 3000;
+    constexpr int kOwnChannels = 8; // the filter keeps its two
+    FakePlugin plugin;
+    const auto filter = plugin.MakeFilter();
+    plugin.setArrangementsResult = kResultFalse;
+    const ChannelLayout stereo = zebmediatypes::CreateStereoChannelLayout();
+    filter->RequestIOConfiguration({stereo}, {stereo});
+    filter->SetBlockSize(kFrames);
+    filter->Resume();
+    plugin.process = [](ProcessData& data)
+    {
+        for (int channel = 0; channel < kOwnChannels; ++channel)
+        {
+            const float* const in = data.inputs[0].channelBuffers32[channel];
+            float* const out = data.outputs[0].channelBuffers32[channel];
+            for (int32 frame = 0; frame < data.numSamples; ++frame)
+                out[frame] = channel < 2 ? 2 * in[frame] : in[frame] + 1;
+        }
+        return kResultOk;
+    };
+    std::vector<float> left(kFrames, 0.5F);
+    std::vector<float> right(kFrames, 0.25F);
+    std::array<float*, 2> channels = {left.data(), right.data()};
+    ChannelFlags silent;
+    for (int block = 0; block < 2; ++block) // the second finds what the first has written beside its buses
+        filter->ProcessWithMapping(channels.data(), channels.data(), kFrames, ChannelFlags(), silent);
+    EXPECT_THAT(left, testing::Each(2.0F));
+    EXPECT_THAT(right, testing::Each(1.0F));
+    filter->Suspend();
 }
 
 TEST(FilterIOConfiguration, SubCategoriesDecideInTheirOrder)

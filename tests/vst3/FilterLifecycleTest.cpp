@@ -8,7 +8,10 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <stdexcept>
+#include <string>
 #include <string_view>
+#include <vector>
 
 using namespace fakeplugin;
 using testing::ElementsAre;
@@ -59,6 +62,46 @@ TEST(FilterLifecycle, DestructionCallsInOrder)
                             "controller.setComponentHandler null", "controller.terminate", "controller destroyed",
                             "component.terminate", "component destroyed", "factory destroyed"));
     EXPECT_EQ(plugin.livingObjects, 0);
+}
+
+TEST(FilterLifecycle, PluginThatThrowsWhileItIsMadeIsTakenDown)
+{
+    FakePlugin plugin;
+    plugin.countingParameters = []
+    {
+        throw std::runtime_error("no parameters");
+    };
+    EXPECT_THROW(plugin.MakeFilter(), std::runtime_error);
+    EXPECT_EQ(plugin.CallsTo("controller.setComponentHandler"),
+              (std::vector<std::string>{"controller.setComponentHandler", "controller.setComponentHandler null"}));
+    EXPECT_EQ(plugin.CallsTo("controller.terminate").size(), 1U);
+    EXPECT_EQ(plugin.CallsTo("component.terminate").size(), 1U);
+    EXPECT_EQ(plugin.livingObjects, 0);
+}
+
+TEST(FilterLifecycle, RestartOfAPluginThatGoesTouchesNothing)
+{
+    FakePlugin plugin;
+    auto filter = plugin.MakeFilter();
+    int asked = 0;
+    int answers = 0;
+    plugin.ClearCalls();
+    plugin.countingParameters = [&]
+    {
+        ++asked;
+    };
+    plugin.called = [&, host = filter.get()](const std::string& call)
+    {
+        if (call == "controller.setComponentHandler null" || call == "component.terminate")
+        {
+            EXPECT_EQ(host->restartComponent(kParamTitlesChanged | kLatencyChanged), kResultOk);
+            ++answers;
+        }
+    };
+    filter.reset();
+    EXPECT_EQ(answers, 2);
+    EXPECT_EQ(asked, 0);
+    EXPECT_TRUE(plugin.CallsTo("processor.getLatencySamples").empty());
 }
 
 TEST(FilterLifecycle, SingleComponentIsTerminatedOnce)

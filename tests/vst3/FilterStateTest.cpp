@@ -87,6 +87,41 @@ TEST_F(FilterState, LoadCallsInOrder)
                                             "controller.setState ctl"));
 }
 
+TEST_F(FilterState, OlderParameterChangesDoNotReachThePluginBehindIt)
+{
+    plugin.parameters = {{1}};
+    const auto filter = plugin.MakeFilter();
+    std::vector<double> values;
+    plugin.process = [&](ProcessData& data)
+    {
+        for (int index = 0; index < data.inputParameterChanges->getParameterCount(); ++index)
+        {
+            int32 offset = 0;
+            data.inputParameterChanges->getParameterData(index)->getPoint(0, offset, values.emplace_back());
+        }
+        return kResultOk;
+    };
+    filter->SetParameter(0, 0.75F);
+    Chunk chunk = MakeChunk(10, 0, "short");
+    preset.SetChunkData(chunk.data(), chunk.size());
+    filter->LoadChunkData(preset);
+    filter->FlushMessageQueue();
+    EXPECT_THAT(values, ElementsAre(0.75)) << "nothing was loaded";
+
+    filter->SetParameter(0, 0.5F);
+    chunk = MakeChunk(4, 0, "COMP");
+    preset.SetChunkData(chunk.data(), chunk.size());
+    // A plug-in may set parameters while it takes its state.
+    plugin.called = [&](const std::string& call)
+    {
+        if (call.starts_with("controller.setComponentState"))
+            filter->performEdit(1, 0.25);
+    };
+    filter->LoadChunkData(preset);
+    filter->FlushMessageQueue();
+    EXPECT_THAT(values, ElementsAre(0.75, 0.25));
+}
+
 TEST_F(FilterState, EmptyComponentStateIsLoadedAndEmptyControllerStateIsNot)
 {
     const auto filter = plugin.MakeFilter();

@@ -80,6 +80,42 @@ TEST(FilterThreads, RestartsAndEditsWhileAudioRuns)
     EXPECT_EQ(filter->GetParameterCount(), 20);
 }
 
+TEST(FilterThreads, APluginThatGoesIsNotAskedWhatItsOwnThreadTells)
+{
+    for (int round = 0; round < 100; ++round)
+    {
+        FakePlugin plugin;
+        plugin.parameters = {{1}, {2}, {3}};
+        std::atomic<bool> running = true;
+        std::atomic<bool> isAsked = false;
+        auto filter = plugin.MakeFilter();
+        plugin.countingParameters = [&]
+        {
+            isAsked = true;
+            std::this_thread::yield();
+            isAsked = false;
+        };
+        std::thread teller;
+        plugin.called = [&](const std::string& call)
+        {
+            EXPECT_FALSE(call.starts_with("controller.setComponentHandler") && isAsked);
+            if (call == "component.terminate") // where such plug-ins end their threads
+            {
+                running = false;
+                teller.join();
+            }
+        };
+        teller = std::thread(
+            [&, host = filter.get()]
+            {
+                while (running)
+                    host->restartComponent(kParamTitlesChanged | kLatencyChanged);
+            });
+        filter.reset();
+        EXPECT_FALSE(teller.joinable());
+    }
+}
+
 TEST(FilterThreads, RestartFromInsideProcess)
 {
     FakePlugin plugin;

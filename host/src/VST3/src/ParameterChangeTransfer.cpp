@@ -100,6 +100,12 @@ void ParameterChangeTransfer::AddChange(ParamID id, double value, int32 sampleOf
     MarkWritten();
 }
 
+void ParameterChangeTransfer::Discard()
+{
+    const Table::Reader reader(mTable);
+    (*reader)->DiscardAll();
+}
+
 // Behind the write. An exchange, and not a store, so that who takes the mark off sees what everybody wrote who had
 // set it.
 void ParameterChangeTransfer::MarkWritten()

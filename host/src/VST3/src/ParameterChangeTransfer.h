@@ -63,6 +63,9 @@ public:
     /// [main, suspended]
     bool TransferChangesFrom(ParameterChanges& changes) { return !changes.IsEmpty() && ReadAll(changes); }
 
+    /// Drops what is pending. A change that is being read meanwhile can still be read. [any]
+    void Discard();
+
     /// Gives `other` these IDs and a copy of what is pending here. Allocates. [any but process]
     void CopyTo(ParameterChangeTransfer& other) const;
 

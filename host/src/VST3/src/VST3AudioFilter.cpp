@@ -63,12 +63,30 @@ VST3AudioFilter::VST3AudioFilter(Steinberg::IPluginFactory* factory, const Stein
     // From the start, so that a flush ahead of the first Resume delivers what it takes out of the transfer.
     mProcessData.inputParameterChanges = &mInputChanges;
     mProcessData.outputParameterChanges = &mOutputChanges;
+    try
+    {
+        BringUp(classInfo);
+    }
+    catch (...) // no destructor follows, and threads of the plug-in's own may know this object
+    {
+        TakeDown();
+        throw;
+    }
+}
 
+VST3AudioFilter::~VST3AudioFilter()
+{
+    TakeDown();
+}
+
+void VST3AudioFilter::BringUp(const Steinberg::PClassInfo& classInfo)
+{
     UTF16String name = ReadClassInfo(classInfo);
     const bool ok = CreatePlugin(name);
     ConnectController();
     SetDisplayName(name);
     mInitialized = ok;
+    mRestarts.Open(); // what a thread of the plug-in's own told earlier is found out now
     BuildParameterInfos();
     TakeOfferedQueues();
     BuildIOConfiguration();
@@ -79,9 +97,10 @@ VST3AudioFilter::VST3AudioFilter(Steinberg::IPluginFactory* factory, const Stein
     mProcessContext = {};
 }
 
-VST3AudioFilter::~VST3AudioFilter()
+void VST3AudioFilter::TakeDown()
 {
     ZEB_TRACE("~VST3AudioFilter", "entry");
+    mRestarts.Close();
     ReleaseParameters();
     if (mVendorEffect)
     {

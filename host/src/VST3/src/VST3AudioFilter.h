@@ -2,6 +2,7 @@
 
 #include "audiofilter/AudioFilter.h"
 #include "audiofilter/Tempo.h"
+#include "host/src/VST3/src/CallGate.h"
 #include "host/src/VST3/src/HostRunLoop.h"
 #include "host/src/VST3/src/ParameterChangeTransfer.h"
 #include "host/src/VST3/src/ParameterChanges.h"
@@ -43,8 +44,8 @@ class VST3AudioFilter : public AudioFilter,
                         public IVST3CorvaneVendorSpecificHost
 {
 public:
-    /// Makes the plug-in and everything of it. `factory` gets a reference and must not be null. A failing plug-in
-    /// throws nothing. [main]
+    /// Makes the plug-in and everything of it. `factory` gets a reference and must not be null. What fails throws
+    /// nothing; what the plug-in throws passes through, once it is taken down. [main]
     VST3AudioFilter(Steinberg::IPluginFactory* factory, const Steinberg::PClassInfo& classInfo);
 
     /// Takes the plug-in down in a fixed order. The filter must be suspended. [main]
@@ -125,6 +126,7 @@ private:
     };
 
     // Construction, in this order.
+    void BringUp(const Steinberg::PClassInfo& classInfo);
     UTF16String ReadClassInfo(const Steinberg::PClassInfo& classInfo);
     UTF16String ReadUnicodeClassInfo(Steinberg::IPluginFactory3& factory);
     UTF16String ReadClassInfo2(Steinberg::IPluginFactory2& factory);
@@ -135,6 +137,7 @@ private:
     void CreateEditor();
 
     // Destruction, in this order.
+    void TakeDown();
     void ReleaseParameters();
     void DisconnectController();
     void ReleaseController();
@@ -173,6 +176,10 @@ private:
     void ClearProcessedInput();
     ChannelFlags CollectOutputSilence() const;
 
+    // Some plug-ins change their buses when they refuse an arrangement, or at any other call, and go by what they
+    // have then: so many more channels are there for them to touch.
+    static constexpr std::size_t kSpareChannels = 64;
+
     std::array<char, 16> mClassID = {};
     PluginPtr<Steinberg::Vst::IComponent> mComponent;
     PluginPtr<Steinberg::Vst::IAudioProcessor> mProcessor;
@@ -200,6 +207,8 @@ private:
     std::vector<unsigned long long> mInputBits; // of each input bus, the bits of its channels in the filter's flags
     std::vector<float*> mInputChannels;         // what the bus buffers point into, by channel of the filter
     std::vector<float*> mOutputChannels;
+    std::vector<float> mSilence;            // behind those of the inputs
+    std::vector<float> mDiscard;            // behind those of the outputs
     PluginPtr<VST3EventList> mInputEvents;  // null without an event bus
     ParameterChanges mInputChanges;         // what process reads
     ParameterChangeTransfer mInputTransfer; // waiting for the processor
@@ -212,6 +221,7 @@ private:
     std::atomic<QueueSet*> mSpentQueues = nullptr;   // owned list; freed on the main thread
     std::atomic<bool> mFlushing = false;
     HostRunLoop mRunLoop;
+    CallGate mRestarts; // of restartComponent, which asks controller and processor
 };
 
 } // namespace zebaudiofilterhost::vst3

@@ -43,14 +43,15 @@ tresult PLUGIN_API VST3AudioFilter::restartComponent(Steinberg::int32 flags)
     using namespace Steinberg::Vst;
     const bool parameters = (flags & (kParamValuesChanged | kParamTitlesChanged)) != 0;
     const bool latency = (flags & kLatencyChanged) != 0;
-    if (parameters)
+    const CallGate::Call call(mRestarts);
+    if (parameters && call)
     {
         BuildParameterInfos();
         if (CurrentThreadIDIsMainThreadID())
             mParameters.FreeRetired();
         GetParameterPropertiesChangedSignal()();
     }
-    if (latency && mProcessor)
+    if (latency && call && mProcessor)
         mLatency = static_cast<int>(mProcessor->getLatencySamples());
     return parameters || latency ? kResultOk : kResultFalse;
 }

@@ -155,9 +155,10 @@ ChannelFlags VST3AudioFilter::CollectOutputSilence() const
 void VST3AudioFilter::ProcessSlice(float** in, float** out, int offset, int frames)
 {
     mProcessData.numSamples = frames;
-    for (std::size_t channel = 0; channel < mInputChannels.size(); ++channel)
+    // Those behind the filter's channels stay as they are.
+    for (std::size_t channel = 0; channel + kSpareChannels < mInputChannels.size(); ++channel)
         mInputChannels[channel] = in[channel] + offset;
-    for (std::size_t channel = 0; channel < mOutputChannels.size(); ++channel)
+    for (std::size_t channel = 0; channel + kSpareChannels < mOutputChannels.size(); ++channel)
         mOutputChannels[channel] = out[channel] + offset;
 
     // Also when the plug-in throws: it must not get the same changes twice.

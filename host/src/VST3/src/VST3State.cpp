@@ -129,6 +129,7 @@ bool VST3AudioFilter::LoadChunkData(const PresetData& presetData)
     {
         VST3MemoryStream stream;
         ShowBytes(stream, *componentState);
+        mInputTransfer.Discard(); // what waits is older than this state
         mComponent->setState(&stream);
         stream.seek(0, IBStream::kIBSeekSet, nullptr);
         if (mController)

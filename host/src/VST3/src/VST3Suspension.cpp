@@ -13,11 +13,13 @@ using Steinberg::Vst::AudioBusBuffers;
 namespace
 {
 
-// One element a bus; the buses share `channels`, which has a pointer for each channel of the filter.
+// One element a bus; the buses share `channels`, which has a pointer for each channel of the filter, and behind them
+// as many `spares` that point to `spare`.
 void AllocateBuses(const std::vector<AudioFilterBusDescription>& descriptions, int channelCount,
-                   std::vector<AudioBusBuffers>& buses, std::vector<float*>& channels)
+                   std::vector<AudioBusBuffers>& buses, std::vector<float*>& channels, std::size_t spares,
+                   float* spare)
 {
-    channels.assign(static_cast<std::size_t>(channelCount), nullptr);
+    channels.assign(static_cast<std::size_t>(channelCount) + spares, spare);
     buses.assign(descriptions.size(), AudioBusBuffers());
     float** next = channels.data();
     for (std::size_t index = 0; index < descriptions.size(); ++index)
@@ -151,9 +153,14 @@ void VST3AudioFilter::SetupProcessing()
 void VST3AudioFilter::AllocateBusBuffers()
 {
     FreeBusBuffers();
-    AllocateBuses(GetInputBuses(), GetNumberOfInputChannels(), mInputBuffers, mInputChannels);
+    const auto frames = static_cast<std::size_t>(std::max(mMaxBlockSize, mBlockSize));
+    mSilence.assign(frames, 0.0F);
+    mDiscard.assign(frames, 0.0F);
+    AllocateBuses(GetInputBuses(), GetNumberOfInputChannels(), mInputBuffers, mInputChannels, kSpareChannels,
+                  mSilence.data());
     mInputBits = BitsOfBuses(GetInputBuses());
-    AllocateBuses(GetOutputBuses(), GetNumberOfOutputChannels(), mOutputBuffers, mOutputChannels);
+    AllocateBuses(GetOutputBuses(), GetNumberOfOutputChannels(), mOutputBuffers, mOutputChannels, kSpareChannels,
+                  mDiscard.data());
 }
 
 void VST3AudioFilter::FreeBusBuffers()

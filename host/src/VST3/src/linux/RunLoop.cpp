@@ -114,7 +114,7 @@ tresult PLUGIN_API RunLoop::registerEventHandler(IEventHandler* handler, Steinbe
 {
     if (!handler || fd < 0)
         return kInvalidArgument;
-    if (mClosed || !CurrentThreadIDIsMainThreadID())
+    if (!CurrentThreadIDIsMainThreadID() || mClosed)
         return kResultFalse;
     const auto registration = std::make_shared<Registration>();
     registration->mNumber = mNextNumber;
@@ -145,7 +145,7 @@ tresult PLUGIN_API RunLoop::registerTimer(ITimerHandler* handler, Steinberg::Lin
 {
     if (!handler)
         return kInvalidArgument;
-    if (mClosed || !CurrentThreadIDIsMainThreadID())
+    if (!CurrentThreadIDIsMainThreadID() || mClosed)
         return kResultFalse;
     const auto registration = std::make_shared<Registration>();
     registration->mNumber = mNextNumber;
