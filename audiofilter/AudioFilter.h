@@ -47,6 +47,10 @@ enum RenderingContext
 /// without parameters and buses that reports silence. A filter with a posted parameter change outlives the
 /// application's last pointer until the change has run, so suspend it before letting go, and flush it if it gets no
 /// ticks: else it stays for ever. It dies on the main thread.
+///
+/// What a plug-in throws in Process goes no further. Out of its other calls it may pass through, such as
+/// SetParameter, and ProcessWithMapping and ticks, which run posted changes: an application that catches it drops the
+/// filter.
 class ZEB_EXPORT AudioFilter : public virtual zebcore::utility::RefCountedObject,
                                public ProcessMessageHandler,
                                private boost::noncopyable
@@ -158,9 +162,10 @@ public:
     /// Stops processing. Call it after the last block. Fires the suspended-state signal. [main]
     virtual void Suspend();
 
-    /// Runs waiting parameter changes, sizes everything for the block size, buses and maps of now and for the latency
-    /// known so far, and starts processing. Fires the suspended-state signal. If GetInitialDelay differs afterwards,
-    /// Suspend and Resume once more: what passes by the plug-in is then aligned. [main, suspended]
+    /// Runs waiting parameter changes, as many as one flush takes, sizes everything for the block size, buses and
+    /// maps of now and for the latency known so far, and starts processing. Fires the suspended-state signal. If
+    /// GetInitialDelay differs afterwards, Suspend and Resume once more: what passes by the plug-in is then aligned.
+    /// [main, suspended]
     virtual void Resume();
 
     /// Real time at first. [main, suspended]
@@ -214,7 +219,8 @@ public:
     /// Fires the preset-changed signal in any case. [main]
     virtual bool LoadSettings(const PresetData& preset);
 
-    /// Replaces the content of the preset by the settings of this filter. [main]
+    /// Replaces the content of the preset by the settings of this filter. Changes that the plug-in has not got yet may be
+    /// missing: FlushMessageQueue ahead of it, or a tick, hands them over. [main]
     virtual void SaveSettings(PresetData& preset) const;
 
     /// Takes over a preset's chunk; false on failure, and here. [main]
@@ -309,7 +315,9 @@ public:
 
     // Parameters
 
-    /// Sets a parameter ahead of the next block or, while suspended, at the next timer tick. Never waits. [main]
+    /// Sets a parameter ahead of the next block or, while suspended, at the next timer tick. Never waits. The process
+    /// thread is handed 32 changes at a time, in the order of posting; what does not fit follows at the next post,
+    /// tick or FlushMessageQueue. Without ticks, flush every 32 changes. [main]
     void PostSetParameter(int index, float value);
 
     /// Grows with every SetParameter, LoadSettings and BumpParameterDirtyCount; for pollers. [any]
@@ -401,7 +409,8 @@ public:
 
     // Cloning
 
-    /// Runs the filter's queued parameter changes and clones it; `filter` must not be null. [main]
+    /// Runs the filter's queued parameter changes, as many as one flush takes, and clones it; `filter` must not be
+    /// null. [main]
     static boost::intrusive_ptr<AudioFilter> Clone(boost::intrusive_ptr<AudioFilter> filter);
 
     // Signals. Slots run on the thread that fires.

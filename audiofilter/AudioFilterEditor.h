@@ -26,7 +26,8 @@ public:
     /// The size of the view in pixels; may be asked before Open. [main]
     virtual zebcore::geom::RectT<int> GetEditorRect() const = 0;
 
-    /// Attaches the view to the platform view `parent`: an NSView*, or the X11 window's number. [main]
+    /// Attaches the view to the platform view `parent`, which must not be null: an NSView*, or the X11 window's
+    /// number. A plug-in that refuses shows nothing; nobody is told. [main]
     virtual void Open(void* parent) = 0;
 
     /// Detaches the view. [main]

@@ -38,8 +38,8 @@ public:
     boost::intrusive_ptr<AudioFilterParameterInfo> GetParameterInfo(int index) const override;
     bool DoPresetsUseChunkData() const override;
 
-    /// Keeps the preset as it is, whatever its version, type and count; always true. Parameter values do not follow.
-    /// [main]
+    /// Keeps the preset as it is, whatever its version, type and count; always true. Parameter values do not follow,
+    /// no signal fires, and GetParameterDirtyCount stays. [main]
     bool LoadSettings(const PresetData& preset) override;
     void SaveSettings(PresetData& preset) const override;
     bool IsProxy() const override;

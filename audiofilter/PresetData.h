@@ -69,6 +69,7 @@ public:
 
     /// False if there is no chunk, or one that can't be decoded.
     bool GetChunkData(std::vector<unsigned char>& chunk) const;
+    /// data may be null if size is 0; null with a size changes nothing.
     void SetChunkData(const unsigned char* data, unsigned long size);
 
     /// The custom section, which both forms create if it is missing. Owned by the PropList; null only without one.

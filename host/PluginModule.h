@@ -21,7 +21,9 @@ public:
     PluginModule(const PluginModule&) = delete;
     PluginModule& operator=(const PluginModule&) = delete;
 
-    /// True when the OS module is there, also from an earlier call. Never throws.
+    /// True when the OS module is there, here also from an earlier call; what a technology needs beside it may still
+    /// be missing, and its Load is then false. Does not throw here; what a plug-in's entry throws passes through a
+    /// technology's.
     virtual bool Load();
     virtual void Unload();
 
@@ -31,7 +33,7 @@ public:
 
     /// The language that plug-ins are told, "en_US" until set. To be set before plug-ins load.
     static void SetLocaleIdentifier(const UTF16String& locale);
-    /// Valid until the next SetLocaleIdentifier.
+    /// Valid until the next SetLocaleIdentifier. [any]
     static const char* GetLocaleIdentifier();
     /// The user interface theme that plug-ins are told, empty until set.
     static void SetThemeXML(const UTF8String& theme);

@@ -38,14 +38,14 @@ public:
     PluginModuleInfoManager(const PluginModuleInfoManager&) = delete;
     PluginModuleInfoManager& operator=(const PluginModuleInfoManager&) = delete;
 
-    /// The first technology of a type stays. [main], or a static initializer
+    /// The first technology of a type stays; null is ignored. [main], or a static initializer
     void AddPluginTechnology(TechnologyPtr technology);
     /// Null if there is none.
     TechnologyPtr GetPluginTechnology(TechnologyType type) const;
     /// In the order of TechnologyType.
     std::vector<TechnologyPtr> GetPluginTechnologies() const;
 
-    /// Replaces the record of the same locator, enabled flag and all, and emits the signal.
+    /// Replaces the record of the same locator, enabled flag and all, and emits the signal. Null is ignored.
     void AddPluginModuleInfo(PluginInfoPtr info);
     /// All records in order of arrival. Every change of the records invalidates the iterators.
     PluginInfoIterator PluginInfoBegin() const;

@@ -26,7 +26,8 @@ public:
     ProcessMessageHandler(const ProcessMessageHandler&) = delete;
     ProcessMessageHandler& operator=(const ProcessMessageHandler&) = delete;
 
-    /// Runs what waits: on the main thread PumpFromMainThread, elsewhere PumpFromProcessThread. [any]
+    /// Runs what waits: on the main thread PumpFromMainThread, elsewhere PumpFromProcessThread.
+    /// [main], or the process thread
     virtual void FlushMessageQueue();
 
     virtual ~ProcessMessageHandler();

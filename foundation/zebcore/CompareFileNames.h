@@ -12,7 +12,7 @@ namespace zebcore::filesupport
 /// zero or positive as `a` comes before, names the same file as, or comes after `b`. A strict ordering. [any]
 ZEB_EXPORT int CompareFileNames(const UTF16String& a, const UTF16String& b);
 
-// Equal for paths that CompareFileNames takes as one.
-std::size_t HashFileName(const UTF16String& path);
+/// Equal for paths that CompareFileNames takes as one. [any]
+ZEB_EXPORT std::size_t HashFileName(const UTF16String& path);
 
 } // namespace zebcore::filesupport

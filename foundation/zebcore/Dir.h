@@ -44,11 +44,11 @@ public:
     /// Sets another directory of preference files; an empty one restores the user's own. [main]
     static void SetPrefDir(const Dir& dir);
 
-    /// Walks the sub-directories in a fixed order, that of their names by code unit or that of `order`, a "less than"
-    /// on names. Links to directories count, except those that lead back to this directory or one above it, since
-    /// such a walk would never end. What can't be read is left out. With `recursive` the sub-directories of each
-    /// follow it. `goOn`, which may be null, is asked between directories and ends the walk when it returns false.
-    /// What the iterator yields is what was there at the call.
+    /// Walks the sub-directories in a fixed order, that of their names by code unit or, unless it is null, that of
+    /// `order`, a "less than" on names. Links to directories count, except those that lead back to this directory or
+    /// one above it, since such a walk would never end. What can't be read is left out. With `recursive` the
+    /// sub-directories of each follow it. `goOn`, which may be null, is asked between directories and ends the walk
+    /// when it returns false. What the iterator yields is what was there at the call.
     DirIterator
     BeginSubdirs(bool recursive, boost::function<bool()>* goOn,
                  boost::shared_ptr<boost::function<bool(const UTF16String&, const UTF16String&)>> order) const;

@@ -10,7 +10,8 @@
 namespace zebaudiofilterhost
 {
 
-/// The places whose memory order holds something up. What is relaxed in the code is not among them.
+/// The places of the rings, and of what they share, whose memory order holds something up. What is relaxed in the
+/// code is not among them.
 enum class OrderSite
 {
     kNone,
