@@ -40,8 +40,6 @@ def count_instructions(options, folder, measurements):
     script = ROOT / 'benchmarks/report/instructions.py'
     if options.only and not {'P1', 'P2', 'P3', 'P9'} & set(options.only.split(',')):
         return
-    if not script.exists():
-        return
     if shutil.which('valgrind') is None:
         measurements.problems.append('instructions: valgrind is not installed')
         return

@@ -3,8 +3,6 @@
 #include "foundation/zebcore/Export.h"
 #include "foundation/zebcore/StringTypes.h"
 
-#include <concepts>
-#include <cstddef>
 #include <ostream>
 #include <sstream>
 #include <string>

@@ -77,11 +77,8 @@ protected:
 
     Float32 GetValue(AudioUnitParameterID id) const { return mValues.at(id).load(std::memory_order_relaxed); }
     Float64 GetSampleRate() const { return mOutputFormat.mSampleRate; }
-    UInt32 GetInputChannels(std::size_t input) const { return mInputFormats[input].mChannelsPerFrame; }
     UInt32 GetOutputChannels() const { return mOutputFormat.mChannelsPerFrame; }
     UInt32 GetMaxFrames() const { return mMaxFrames; }
-    const HostCallbackInfo& GetHost() const { return mHost; }
-    bool IsInitialized() const { return mIsInitialized; }
 
 private:
     const ParameterDescription* FindParameter(AudioUnitParameterID id) const;

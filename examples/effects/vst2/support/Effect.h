@@ -71,7 +71,6 @@ protected:
     virtual long long Answer(const Call& call);
 
     float Get(std::int32_t index) const;
-    std::int32_t ParameterCount() const { return mEffect.numParams; }
     float SampleRate() const { return mSampleRate; }
     void SetChannels(std::int32_t inputs, std::int32_t outputs);
     void SetProgramCount(std::int32_t count) { mEffect.numPrograms = count; }
