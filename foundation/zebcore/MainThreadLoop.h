@@ -28,8 +28,8 @@ inline constexpr WatchID kNoWatch = 0;
 
 /// Calls the handler whenever the descriptor is readable, has an error or has been hung up, for as long as that is
 /// so. A descriptor may have several watches, also with the same handler; they are called in the order of adding. The
-/// descriptor stays the caller's, and is to be closed after its watches have been removed. kNoWatch when it can't be
-/// watched. [main]
+/// descriptor stays the caller's, blocking or not, and is to be closed after its watches have been removed. kNoWatch
+/// when it can't be watched. [main]
 ZEB_EXPORT WatchID AddDescriptorWatch(int descriptor, boost::function<void(int descriptor)> handler);
 /// The handler is not called again. Does nothing if there is no such watch. [main]
 ZEB_EXPORT void RemoveDescriptorWatch(WatchID watch);

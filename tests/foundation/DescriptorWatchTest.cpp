@@ -6,6 +6,7 @@
 #include <sys/socket.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <filesystem>
 #include <memory>
 #include <stdexcept>
@@ -257,9 +258,72 @@ TEST_F(DescriptorWatchTest, RemovingLeavesTheDescriptorOpen)
 TEST_F(DescriptorWatchTest, WhatCantBeWatchedIsRefused)
 {
     EXPECT_EQ(kNoWatch, AddDescriptorWatch(-1, [](int) {}));
-    const int folder = open(std::filesystem::temp_directory_path().c_str(), O_RDONLY | O_DIRECTORY);
-    EXPECT_EQ(kNoWatch, AddDescriptorWatch(folder, [](int) {}));
-    close(folder);
+    for (const std::filesystem::path& path :
+         {std::filesystem::temp_directory_path(), std::filesystem::path("/proc/self/exe"),
+          std::filesystem::path("/dev/null"), std::filesystem::path("/dev/zero")})
+    {
+        const int descriptor = open(path.c_str(), O_RDONLY);
+        ASSERT_NE(-1, descriptor) << path;
+        EXPECT_EQ(kNoWatch, AddDescriptorWatch(descriptor, [](int) {})) << path;
+        close(descriptor);
+        EXPECT_EQ(kNoWatch, AddDescriptorWatch(descriptor, [](int) {})) << path;
+    }
+}
+
+// A plug-in that reads whole messages from a blocking descriptor relies on waiting for their second half.
+TEST_F(DescriptorWatchTest, ABlockingDescriptorStaysSo)
+{
+    for (const int flag : {0, O_NONBLOCK})
+    {
+        int ends[2];
+        ASSERT_EQ(0, pipe2(ends, flag));
+        const auto expectFlag = [&]
+        {
+            EXPECT_EQ(flag, fcntl(ends[0], F_GETFL) & O_NONBLOCK);
+        };
+        Watch(ends[0],
+              [&](int descriptor)
+              {
+                  expectFlag();
+                  ReadOne(descriptor);
+              });
+        expectFlag();
+        ASSERT_EQ(1, write(ends[1], "x", 1));
+        RanNow();
+        expectFlag();
+        RemoveDescriptorWatch(mWatches.back());
+        expectFlag();
+        close(ends[0]);
+        close(ends[1]);
+    }
+}
+
+// What comes to a number that has been closed while a duplicate of it lives on.
+TEST_F(DescriptorWatchTest, ADuplicateOfAClosedDescriptorWakesNobody)
+{
+    for (const bool isRemoved : {true, false})
+    {
+        Pair first;
+        const int number = first.Watched();
+        const WatchID old = Note(number, 'o');
+        EXPECT_EQ("", RanNow());
+        const int duplicate = dup(number);
+        first.Close(0);
+        if (isRemoved)
+            RemoveDescriptorWatch(old);
+        const Pair second;
+        ASSERT_EQ(number, second.Watched()) << "the lowest number is taken";
+        if (isRemoved)
+            Note(number, 'n');
+        first.Send();
+        EXPECT_EQ("", RanNow());
+        EXPECT_EQ("", RanNow());
+        second.Send();
+        EXPECT_EQ(isRemoved ? "n" : "o", RanNow());
+        for (const WatchID watch : mWatches)
+            RemoveDescriptorWatch(watch);
+        close(duplicate);
+    }
 }
 
 TEST_F(DescriptorWatchTest, ADescriptorEndsAWait)

@@ -9,7 +9,9 @@
 #include <boost/asio/posix/stream_descriptor.hpp>
 #include <boost/asio/post.hpp>
 
-#include <sys/stat.h>
+#include <poll.h>
+#include <sys/epoll.h>
+#include <unistd.h>
 
 #include <atomic>
 #include <map>
@@ -23,27 +25,45 @@ namespace
 
 namespace asio = boost::asio;
 
-/// epoll refuses files and directories, which would be readable for ever.
-bool CanBeWatched(int descriptor)
+/// What was seen may have been read by now, or belong to an open file that has lost this number to another one.
+bool IsReady(int descriptor)
 {
-    struct stat status = {};
-    return fstat(descriptor, &status) == 0 && !S_ISREG(status.st_mode) && !S_ISDIR(status.st_mode);
+    pollfd state{descriptor, POLLIN, 0};
+    return poll(&state, 1, 0) > 0 && (state.revents & POLLNVAL) == 0;
 }
 
-/// A registration of a descriptor with the reactor. A report that is under way for an earlier registration finds its
-/// source gone and is dropped.
-struct Source
+/// A descriptor that is watched, by an epoll instance of its own, which Asio waits for. To wait for the descriptor
+/// itself Asio would make it non-blocking, and that for everybody who shares the open file. The instance refuses what
+/// can't be watched, and with it goes all that it has seen, even if the descriptor was closed and a duplicate lives
+/// on. A report that is under way for an earlier registration finds its source gone and is dropped.
+class Source
 {
-    Source(asio::io_context& context, int descriptor, boost::system::error_code& error) : mStream(context)
-    {
-        mStream.assign(descriptor, error);
-    }
+public:
+    explicit Source(asio::io_context& context) : mStream(context) {}
     Source(const Source&) = delete;
     Source& operator=(const Source&) = delete;
     ~Source()
     {
+        // Closing alone would leave it with Asio if a process that was forked off still has it.
         if (mStream.is_open())
-            mStream.release();
+            close(mStream.release());
+    }
+
+    bool Open(int descriptor)
+    {
+        const int instance = epoll_create1(EPOLL_CLOEXEC);
+        if (instance < 0)
+            return false;
+        boost::system::error_code error;
+        mStream.assign(instance, error);
+        if (error)
+        {
+            close(instance);
+            return false;
+        }
+        epoll_event event{};
+        event.events = EPOLLIN; // errors and hang-ups come unasked
+        return epoll_ctl(instance, EPOLL_CTL_ADD, descriptor, &event) == 0;
     }
 
     asio::posix::stream_descriptor mStream;
@@ -63,11 +83,8 @@ public:
     bool Register(int descriptor)
     {
         mSources.erase(descriptor);
-        if (!CanBeWatched(descriptor))
-            return false;
-        boost::system::error_code error;
-        auto source = std::make_shared<Source>(mContext, descriptor, error);
-        if (error)
+        auto source = std::make_shared<Source>(mContext);
+        if (!source->Open(descriptor))
             return false;
         mSources.emplace(descriptor, std::move(source));
         return true;
@@ -78,7 +95,6 @@ public:
         const auto known = mSources.find(descriptor);
         if (known == mSources.end() || std::exchange(known->second->mAwaited, true))
             return;
-        // An error and a hang-up end this wait too.
         known->second->mStream.async_wait(
             asio::posix::stream_descriptor::wait_read,
             [this, descriptor, watched = std::weak_ptr<Source>(known->second)](boost::system::error_code error)
@@ -87,8 +103,12 @@ public:
                 if (!source)
                     return;
                 source->mAwaited = false;
-                if (!error)
+                if (error)
+                    return;
+                if (IsReady(descriptor))
                     mReport(descriptor);
+                else if (Register(descriptor))
+                    Await(descriptor);
             });
     }
 
