@@ -20,7 +20,12 @@ configure_file(${PROJECT_SOURCE_DIR}/cmake/zebaudiofilterhost.pc.in ${PROJECT_BI
 install(FILES ${PROJECT_BINARY_DIR}/zebaudiofilterhost.pc DESTINATION ${CMAKE_INSTALL_LIBDIR}/pkgconfig)
 
 if(TARGET zebhost)
-    set_target_properties(zebhost PROPERTIES INSTALL_RPATH $ORIGIN/../${CMAKE_INSTALL_LIBDIR})
+    if(APPLE)
+        set(own_folder @loader_path)
+    else()
+        set(own_folder $ORIGIN)
+    endif()
+    set_target_properties(zebhost PROPERTIES INSTALL_RPATH ${own_folder}/../${CMAKE_INSTALL_LIBDIR})
     install(TARGETS zebhost)
 
     # The program prints its own manual page and completions, all from the table of its options.
