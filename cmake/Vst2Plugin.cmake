@@ -25,7 +25,10 @@ function(zeb_vst2_plugin name)
     set(folder ${PROJECT_BINARY_DIR}/${arg_FOLDER})
     if(APPLE)
         set_target_properties(${name} PROPERTIES
-            BUNDLE TRUE BUNDLE_EXTENSION vst LIBRARY_OUTPUT_DIRECTORY ${folder})
+            BUNDLE TRUE BUNDLE_EXTENSION vst
+            MACOSX_BUNDLE_INFO_PLIST ${PROJECT_SOURCE_DIR}/cmake/EffectInfo.plist.in
+            MACOSX_BUNDLE_GUI_IDENTIFIER org.zeb.examples.${arg_TITLE}
+            LIBRARY_OUTPUT_DIRECTORY ${folder})
         return()
     endif()
     if(arg_LAYOUT STREQUAL bundle)

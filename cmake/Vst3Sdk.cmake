@@ -22,6 +22,9 @@ target_compile_definitions(zeb_vst3_sdk PUBLIC RELEASE=1)
 set_property(TARGET zeb_vst3_sdk PROPERTY UNITY_BUILD OFF) # It defines by macros what a neighbour defines too
 # The SDK's interfaces have no virtual destructor, and nobody deletes through them.
 target_compile_options(zeb_vst3_sdk PRIVATE -w INTERFACE -Wno-non-virtual-dtor)
+if(APPLE)
+    target_link_libraries(zeb_vst3_sdk PUBLIC "-framework CoreFoundation")
+endif()
 
 # zeb_vst3_plugin(TARGET SOURCES ... [BUNDLE name] [FOLDER vst3|fixtures|hazards] [LIBRARIES ...] [DEFINITIONS ...])
 #   A real bundle: <build>/FOLDER/BUNDLE.vst3/Contents/<arch>-linux/BUNDLE.so; on macOS Contents/MacOS/BUNDLE. Without
@@ -40,6 +43,8 @@ function(zeb_vst3_plugin name)
     set_target_properties(${name} PROPERTIES PREFIX "" OUTPUT_NAME ${arg_BUNDLE})
     if(APPLE)
         set_target_properties(${name} PROPERTIES BUNDLE TRUE BUNDLE_EXTENSION vst3
+            MACOSX_BUNDLE_INFO_PLIST ${PROJECT_SOURCE_DIR}/cmake/EffectInfo.plist.in
+            MACOSX_BUNDLE_GUI_IDENTIFIER org.zeb.examples.${arg_BUNDLE}
             LIBRARY_OUTPUT_DIRECTORY ${PROJECT_BINARY_DIR}/${arg_FOLDER})
     else()
         target_link_options(${name} PRIVATE LINKER:--exclude-libs,ALL)
