@@ -2,6 +2,8 @@
 
 #include "host/src/XAU/src/CallGuarded.h"
 
+#include <boost/smart_ptr/intrusive_ptr.hpp>
+
 namespace zebaudiofilterhost::xau
 {
 
