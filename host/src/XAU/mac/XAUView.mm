@@ -33,6 +33,13 @@ namespace zebaudiofilterhost::xau
 namespace
 {
 
+// References of CoreFoundation are pointers to Foundation's objects of the same name.
+template <class Object>
+Object* ToObject(const void* reference)
+{
+    return static_cast<Object*>(const_cast<void*>(reference));
+}
+
 // What the unit makes by its own factory. Null where something of it cannot be had.
 NSView* MakeCocoaView(AudioUnit unit)
 {
@@ -50,8 +57,8 @@ NSView* MakeCocoaView(AudioUnit unit)
             noErr &&
         size >= sizeof(AudioUnitCocoaViewInfo))
     {
-        NSURL* location = (NSURL*)info->mCocoaAUViewBundleLocation;
-        NSString* className = (NSString*)info->mCocoaAUViewClass[0];
+        NSURL* location = ToObject<NSURL>(info->mCocoaAUViewBundleLocation);
+        NSString* className = ToObject<NSString>(info->mCocoaAUViewClass[0]);
         NSBundle* bundle = location && className ? [NSBundle bundleWithPath:[location path]] : nil;
         if (location && className && !bundle)
             NSLog(@"Error loading AU view's bundle");
