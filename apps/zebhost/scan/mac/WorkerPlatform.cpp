@@ -1,5 +1,7 @@
 #include "scan/WorkerPlatform.h"
 
+#include <cerrno>
+#include <chrono>
 #include <csignal>
 #include <cstdint>
 #include <thread>
@@ -33,13 +35,19 @@ bool DieWith(pid_t parent)
         return false;
     }
     std::thread(
-        [queue]
+        [queue, parent]
         {
+            constexpr std::chrono::milliseconds kAgain(100);
             struct kevent event
             {
             };
-            while (kevent(queue, nullptr, 0, &event, 1, nullptr) < 1)
+            // A plug-in may have closed the queue. The parent's end is then seen by the new parent alone.
+            while (kevent(queue, nullptr, 0, &event, 1, nullptr) < 1 && getppid() == parent)
             {
+                if (errno != EINTR)
+                {
+                    std::this_thread::sleep_for(kAgain);
+                }
             }
             kill(getpid(), SIGKILL);
         })
