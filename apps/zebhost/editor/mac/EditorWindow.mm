@@ -23,27 +23,58 @@
 namespace zebhost
 {
 
+namespace
+{
+
+Picture ToPicture(NSBitmapImageRep* image)
+{
+    Picture picture{static_cast<int>([image pixelsWide]), static_cast<int>([image pixelsHigh]), {}};
+    for (int y = 0; y < picture.height; ++y)
+    {
+        @autoreleasepool // Two colours a pixel would be kept to the end of the picture
+        {
+            for (int x = 0; x < picture.width; ++x)
+            {
+                NSColor* colour = [[image colorAtX:x y:y] colorUsingColorSpace:[NSColorSpace sRGBColorSpace]];
+                for (const CGFloat part : {[colour redComponent], [colour greenComponent], [colour blueComponent]})
+                {
+                    picture.pixels.push_back(static_cast<std::uint8_t>(std::clamp(part, 0.0, 1.0) * 255));
+                }
+            }
+        }
+    }
+    return picture;
+}
+
+} // namespace
+
 class EditorWindow::Native
 {
 public:
     Native(const std::string& title, int width, int height)
     {
-        [NSApplication sharedApplication];
-        [NSApp setActivationPolicy:NSApplicationActivationPolicyRegular];
-        mDelegate = [[ZebhostWindowDelegate alloc] init];
-        mWindow = [[NSWindow alloc] initWithContentRect:NSMakeRect(0, 0, width, height)
-                                              styleMask:NSWindowStyleMaskTitled | NSWindowStyleMaskClosable
-                                                backing:NSBackingStoreBuffered
-                                                  defer:NO];
-        if (mWindow == nil)
+        @autoreleasepool
         {
-            throw Failure(ExitCode::JobFailed, "there is no screen to open a window on: log in to the desktop");
+            [NSApplication sharedApplication];
+            [NSApp setActivationPolicy:NSApplicationActivationPolicyRegular];
+            [NSApp finishLaunching];
+            mDelegate = [[ZebhostWindowDelegate alloc] init];
+            mWindow = [[NSWindow alloc] initWithContentRect:NSMakeRect(0, 0, width, height)
+                                                  styleMask:NSWindowStyleMaskTitled | NSWindowStyleMaskClosable
+                                                    backing:NSBackingStoreBuffered
+                                                      defer:NO];
+            if (mWindow == nil)
+            {
+                throw Failure(ExitCode::JobFailed, "there is no screen to open a window on: log in to the desktop");
+            }
+            [mWindow setReleasedWhenClosed:NO];
+            [mWindow setDelegate:mDelegate];
+            [mWindow setTitle:[NSString stringWithUTF8String:title.c_str()]];
+            [mWindow center];
+            [mWindow makeKeyAndOrderFront:nil];
+            // The terminal that started this program is the active one.
+            [NSApp activateIgnoringOtherApps:YES];
         }
-        [mWindow setReleasedWhenClosed:NO];
-        [mWindow setDelegate:mDelegate];
-        [mWindow setTitle:[NSString stringWithUTF8String:title.c_str()]];
-        [mWindow center];
-        [mWindow makeKeyAndOrderFront:nil];
     }
 
     ~Native()
@@ -63,37 +94,31 @@ public:
 
     void Update()
     {
-        while (NSEvent* event = [NSApp nextEventMatchingMask:NSEventMaskAny
-                                                   untilDate:[NSDate distantPast]
-                                                      inMode:NSDefaultRunLoopMode
-                                                     dequeue:YES])
+        @autoreleasepool
         {
-            [NSApp sendEvent:event];
+            while (NSEvent* event = [NSApp nextEventMatchingMask:NSEventMaskAny
+                                                       untilDate:[NSDate distantPast]
+                                                          inMode:NSDefaultRunLoopMode
+                                                         dequeue:YES])
+            {
+                [NSApp sendEvent:event];
+            }
         }
     }
 
     Picture TakePicture() const
     {
-        NSView* view = [mWindow contentView];
-        NSBitmapImageRep* image = [view bitmapImageRepForCachingDisplayInRect:[view bounds]];
-        if (image == nil)
+        @autoreleasepool
         {
-            return {};
-        }
-        [view cacheDisplayInRect:[view bounds] toBitmapImageRep:image];
-        Picture picture{static_cast<int>([image pixelsWide]), static_cast<int>([image pixelsHigh]), {}};
-        for (int y = 0; y < picture.height; ++y)
-        {
-            for (int x = 0; x < picture.width; ++x)
+            NSView* view = [mWindow contentView];
+            NSBitmapImageRep* image = [view bitmapImageRepForCachingDisplayInRect:[view bounds]];
+            if (image == nil)
             {
-                NSColor* colour = [[image colorAtX:x y:y] colorUsingColorSpace:[NSColorSpace sRGBColorSpace]];
-                for (const CGFloat part : {[colour redComponent], [colour greenComponent], [colour blueComponent]})
-                {
-                    picture.pixels.push_back(static_cast<std::uint8_t>(std::clamp(part, 0.0, 1.0) * 255));
-                }
+                return {};
             }
+            [view cacheDisplayInRect:[view bounds] toBitmapImageRep:image];
+            return ToPicture(image);
         }
-        return picture;
     }
 
 private:
