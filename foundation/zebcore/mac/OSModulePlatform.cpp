@@ -1,5 +1,8 @@
 #include "foundation/zebcore/internal/OSModulePlatform.h"
 
+#include "foundation/zebcore/NativePath.h"
+#include "foundation/zebcore/mac/MACtoZEB.h"
+
 #include <CoreFoundation/CoreFoundation.h>
 
 #include <array>
@@ -33,6 +36,19 @@ std::string ExecutablePath(CFBundleRef bundle)
     return result;
 }
 
+/// In the words of the system, a sentence.
+std::string TakeDescription(CFErrorRef error)
+{
+    const CFStringRef description = error == nullptr ? nullptr : CFErrorCopyDescription(error);
+    if (error != nullptr)
+        CFRelease(error);
+    if (description == nullptr)
+        return "unknown reason.";
+    const std::string text = filesupport::ToNativePath(MACtoZEB(description));
+    CFRelease(description);
+    return text;
+}
+
 } // namespace
 
 std::string FindBinary(const std::string& path, std::string& failure)
@@ -52,11 +68,19 @@ std::string FindBinary(const std::string& path, std::string& failure)
 
 void* OpenModule(const std::string& path, const std::string& /*binary*/, std::string& failure)
 {
-    // The code itself is loaded when the first function is looked up.
     const CFBundleRef bundle = CreateBundle(path);
     if (bundle == nullptr)
+    {
         failure = "\"" + path + "\" is not a plug-in bundle.";
-    return bundle;
+        return nullptr;
+    }
+    // The code itself is loaded when the first function is looked up, where a failure has no words.
+    CFErrorRef error = nullptr;
+    if (CFBundlePreflightExecutable(bundle, &error))
+        return bundle;
+    failure = "\"" + path + "\" could not be loaded: " + TakeDescription(error);
+    CFRelease(bundle);
+    return nullptr;
 }
 
 void CloseModule(void* handle)
