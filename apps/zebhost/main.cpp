@@ -1,4 +1,5 @@
 #include "catalogue/PluginFinder.h"
+#include "catalogue/SettingsJournal.h"
 #include "catalogue/SettingsLock.h"
 #include "cli/ArgumentParser.h"
 #include "cli/Failure.h"
@@ -52,7 +53,7 @@ bool ChangesSettings(const Arguments& arguments)
 void LoadToRead(const SettingsFolder& folder, Catalogue& catalogue)
 {
     const std::unique_ptr<SettingsLock> lock =
-        std::filesystem::exists(folder.Journal()) ? SettingsLock::IfFree(folder.Path()) : nullptr;
+        SettingsJournal(folder.Journal()).Exists() ? SettingsLock::IfFree(folder.Path()) : nullptr;
     catalogue.Load();
     try
     {
@@ -153,6 +154,11 @@ ExitCode Guarded(int argc, const char* const* argv, Console& console)
     catch (const Failure& failure)
     {
         return Report(failure, arguments, json, console);
+    }
+    catch (const std::filesystem::filesystem_error& error)
+    {
+        return Report(Failure(ExitCode::FileTrouble, std::string(error.what()) + ": make it readable and writable"),
+                      arguments, json, console);
     }
     catch (const std::exception& error)
     {

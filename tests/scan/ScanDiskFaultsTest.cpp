@@ -126,6 +126,18 @@ TEST_F(ScanDiskFaultsTest, AJournalThatCannotBeWrittenEndsTheScanAndBlocksNothin
     }
 }
 
+TEST_F(ScanDiskFaultsTest, APresetWithoutRoomIsNoMatterOfPermissions)
+{
+    for (const auto& [fault, advice] :
+         {std::pair("write:full:", "make room"), std::pair("rename:refused:", "writable")})
+    {
+        const RunResult result = RunOnFaultyDisk(std::string(fault) + "warm.xml",
+                                                 {"preset", "save", Bundle("a").string(), Path("warm.xml")});
+        EXPECT_EQ(result.code, 7) << fault << result.err;
+        EXPECT_THAT(result.LastLine(), testing::AllOf(HasSubstr("warm.xml"), HasSubstr(advice))) << fault;
+    }
+}
+
 TEST_F(ScanDiskFaultsTest, WithRoomAgainTheNextScanGoesOn)
 {
     RunOnFaultyDisk(std::string("write:full:") + kCatalogue, {"scan"});

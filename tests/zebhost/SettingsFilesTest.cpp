@@ -76,12 +76,45 @@ TEST_F(SettingsFilesTest, LosingTheReasonsLosesNothingElse)
     }
 }
 
+TEST_F(SettingsFilesTest, DamagedTablesAreToldOfAndKeptAside)
+{
+    const std::vector<std::pair<std::string, std::vector<std::string>>> tables = {
+        {"DynamicAudioPlugInBlacklist.reasons.json", {"block", "Zeb Delay"}},
+        {"AudioPluginManagerSettings.binaries.json", {"scan", "--full"}}};
+    for (const auto& [name, saving] : tables)
+    {
+        for (const char* damage : {"garbage", "", "{\"version\":9}", "{\"version\":1,\"blocked\":{\"3:x\":7}}"})
+        {
+            fs::remove_all(Settings());
+            Succeed({"scan"});
+            Succeed({"block", "Zeb Gain", "--reason", "why"});
+            WriteText(Settings() / name, damage);
+            EXPECT_THAT(Succeed({"blocks"}).err, HasSubstr(name + " is damaged")) << damage;
+            EXPECT_EQ(ReadText(Settings() / name), damage) << "a command that saves nothing must change nothing";
+            EXPECT_THAT(Succeed(saving).err, HasSubstr("kept as")) << damage;
+            EXPECT_EQ(Aside(name), damage);
+            EXPECT_EQ(Succeed({"blocks"}).err, "") << damage;
+        }
+    }
+}
+
 TEST_F(SettingsFilesTest, APlaceThatCannotBeWrittenIsTold)
 {
     WriteText(mFolder / "settings", "a file where the folder should be");
     const RunResult result = Run({"scan"});
     EXPECT_EQ(result.code, 7);
     EXPECT_THAT(result.LastLine(), HasSubstr("--settings"));
+}
+
+TEST_F(SettingsFilesTest, APlaceThatCannotBeReadIsTold)
+{
+    fs::create_symlink("settings", mFolder / "settings");
+    for (const char* command : {"list", "blocks", "scan"})
+    {
+        const RunResult result = Run({command});
+        EXPECT_EQ(result.code, 7) << command;
+        EXPECT_THAT(result.LastLine(), testing::AllOf(HasSubstr("settings"), HasSubstr("readable"))) << command;
+    }
 }
 
 TEST_F(SettingsFilesTest, WithoutSettingsThePreferenceFolderIsUsed)

@@ -1,9 +1,21 @@
 #include "catalogue/BinaryStamps.h"
 
+#include "catalogue/LocatorText.h"
+
+#include <utility>
+
 namespace zebhost
 {
 
 using zebaudiofilterhost::PluginLocator;
+
+namespace
+{
+
+// Holds the locator, which the key of its entry does not give back.
+constexpr const char* kToBeTried = "toBeTried";
+
+} // namespace
 
 BinaryStamps::BinaryStamps(const std::filesystem::path& file) : mTable(file, "binaries")
 {
@@ -37,6 +49,33 @@ std::optional<BinaryStamps::Entry> BinaryStamps::Find(const PluginLocator& locat
 void BinaryStamps::Set(const PluginLocator& locator, const Entry& entry)
 {
     mTable.Set(locator, ToJson(entry));
+}
+
+void BinaryStamps::MarkToBeTried(const PluginLocator& locator)
+{
+    const Json* const before = mTable.Find(locator);
+    Json entry = before == nullptr ? Json::object() : *before;
+    entry[kToBeTried] = LocatorText(locator);
+    mTable.Set(locator, std::move(entry));
+}
+
+bool BinaryStamps::IsToBeTried(const PluginLocator& locator) const
+{
+    const Json* const entry = mTable.Find(locator);
+    return entry != nullptr && entry->contains(kToBeTried);
+}
+
+std::vector<PluginLocator> BinaryStamps::AllToBeTried() const
+{
+    std::vector<PluginLocator> locators;
+    for (const auto& [key, entry] : mTable.Entries())
+    {
+        if (const std::optional<PluginLocator> locator = ParseLocatorText(TextIn(entry, kToBeTried)))
+        {
+            locators.push_back(*locator);
+        }
+    }
+    return locators;
 }
 
 } // namespace zebhost

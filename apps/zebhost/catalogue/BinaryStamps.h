@@ -4,6 +4,8 @@
 #include "catalogue/LocatorTable.h"
 
 #include <optional>
+#include <string>
+#include <vector>
 
 namespace zebhost
 {
@@ -15,7 +17,8 @@ class BinaryStamps
 public:
     explicit BinaryStamps(const std::filesystem::path& file);
 
-    void Load() { mTable.Load(); }
+    // False if the file is damaged. Throws zebcore's file_exception.
+    bool Load() { return mTable.Load(); }
     // Throws zebcore's file_exception, or filesystem_error.
     void Save(LocatorTable::Saving saving) const { mTable.Save(saving); }
 
@@ -30,6 +33,12 @@ public:
     std::optional<Entry> Find(const zebaudiofilterhost::PluginLocator& locator) const;
     void Set(const zebaudiofilterhost::PluginLocator& locator, const Entry& entry);
     void Remove(const zebaudiofilterhost::PluginLocator& locator) { mTable.Remove(locator); }
+
+    // The next scan tries these, wherever they lie and whatever became of them before. What it finds out takes the
+    // mark away.
+    void MarkToBeTried(const zebaudiofilterhost::PluginLocator& locator);
+    bool IsToBeTried(const zebaudiofilterhost::PluginLocator& locator) const;
+    std::vector<zebaudiofilterhost::PluginLocator> AllToBeTried() const;
 
 private:
     LocatorTable mTable;

@@ -36,7 +36,8 @@ class BlockReasons
 public:
     explicit BlockReasons(const std::filesystem::path& file);
 
-    void Load() { mTable.Load(); }
+    // False if the file is damaged. Throws zebcore's file_exception.
+    bool Load() { return mTable.Load(); }
     // Throws zebcore's file_exception, or filesystem_error.
     void Save(LocatorTable::Saving saving) const { mTable.Save(saving); }
 

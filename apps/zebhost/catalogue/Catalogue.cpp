@@ -1,6 +1,7 @@
 #include "catalogue/Catalogue.h"
 
 #include "catalogue/PluginFinder.h"
+#include "catalogue/WantOfRoom.h"
 #include "cli/Failure.h"
 #include "output/PrintableText.h"
 
@@ -11,7 +12,6 @@
 #include <host/PluginModuleInfoManager.h>
 
 #include <algorithm>
-#include <cerrno>
 #include <iterator>
 #include <optional>
 
@@ -33,8 +33,7 @@ constexpr unsigned int kBlockListVersion = 1;
 
 std::string Remedy(int error)
 {
-    const bool isFull = error == ENOSPC || error == EDQUOT || error == EFBIG;
-    return (isFull ? std::string(": make room") : ": make it readable and writable") +
+    return std::string(IsWantOfRoom(error) ? ": make room" : ": make it readable and writable") +
            ", or name another folder with --settings";
 }
 
@@ -63,19 +62,6 @@ bool IsCatalogueEmpty()
            AudioFilterDescriptorManager::GetInstance().GetExternalInfos().empty();
 }
 
-std::filesystem::path FreeName(const std::filesystem::path& path)
-{
-    for (int number = 1;; ++number)
-    {
-        std::filesystem::path candidate = path;
-        candidate += ".damaged-" + std::to_string(number);
-        if (!std::filesystem::exists(std::filesystem::symlink_status(candidate)))
-        {
-            return candidate;
-        }
-    }
-}
-
 bool IsOnPermanentList(const PluginLocator& locator)
 {
     // The texts that a VST 3 scan looks its plug-ins up with.
@@ -91,6 +77,7 @@ Catalogue::Catalogue(const SettingsFolder& folder, Console& console)
     , mReasons(folder.BlockReasons())
     , mStamps(folder.BinaryStamps())
     , mJournal(folder.Journal())
+    , mDamaged(console)
 {
 }
 
@@ -115,9 +102,12 @@ void Catalogue::LoadFiles()
             // Only what came out empty can have been damaged, so a sound catalogue is read once.
             if (file.Exists() && IsCatalogueEmpty() && !IsSound(mFolder.Catalogue(), kSettingsVersion))
             {
-                NoteDamaged(mFolder.Catalogue());
+                mDamaged.Note(mFolder.Catalogue());
             }
-            mStamps.Load();
+            if (!mStamps.Load())
+            {
+                mDamaged.Note(mFolder.BinaryStamps());
+            }
         });
 }
 
@@ -231,12 +221,12 @@ void Catalogue::SaveNoted()
         {
             if (mUnsaved.stamps)
             {
-                mStamps.Save(LocatorTable::Saving::Flushed);
+                WriteStamps(LocatorTable::Saving::Flushed);
             }
             if (mUnsaved.blocks)
             {
                 SaveBlockList();
-                mReasons.Save(LocatorTable::Saving::Flushed);
+                SaveReasons(LocatorTable::Saving::Flushed);
             }
             // Up to here it speaks for what is half saved.
             mJournal.Remove();
@@ -254,7 +244,7 @@ void Catalogue::LoadBlocks()
             blocks.LoadConfiguration(dynamic);
             if (dynamic.Exists() && !IsSound(mFolder.Blocks(), kBlockListVersion))
             {
-                NoteDamaged(mFolder.Blocks());
+                mDamaged.Note(mFolder.Blocks());
             }
             File permanent = ToFile(mFolder.PermanentBlocks());
             if (permanent.Exists() && !blocks.LoadStaticConfiguration(permanent))
@@ -263,7 +253,10 @@ void Catalogue::LoadBlocks()
                               " is damaged and was ignored: mend or "
                               "remove it");
             }
-            mReasons.Load();
+            if (!mReasons.Load())
+            {
+                mDamaged.Note(mFolder.BlockReasons());
+            }
         });
 }
 
@@ -275,31 +268,13 @@ bool Catalogue::IsSound(const std::filesystem::path& path, unsigned int version)
            list.GetValue(u8"version", found) && found == version;
 }
 
-void Catalogue::NoteDamaged(const std::filesystem::path& path)
-{
-    mDamaged.insert(path);
-    mConsole.Warn("zebhost: " + path.string() +
-                  " is damaged or of another version, and was ignored; it will be kept under another name when a new "
-                  "one is saved");
-}
-
-void Catalogue::SetAsideIfDamaged(const std::filesystem::path& path)
-{
-    if (mDamaged.erase(path) != 0)
-    {
-        const std::filesystem::path aside = FreeName(path);
-        std::filesystem::rename(path, aside);
-        mConsole.Warn("zebhost: the damaged file is kept as " + aside.string());
-    }
-}
-
 void Catalogue::Save()
 {
     WithFiles(
         [this]
         {
             std::filesystem::create_directories(mFolder.Path());
-            SetAsideIfDamaged(mFolder.Catalogue());
+            mDamaged.SetAside(mFolder.Catalogue());
             // Not SaveConfiguration, which keeps silent when the system refuses to give up the old file.
             zebcore::proplist::PropList list;
             PluginModuleInfoManager::GetInstance().BuildConfigurationPropList(list, true);
@@ -311,7 +286,7 @@ void Catalogue::Save()
 void Catalogue::SaveBlockList()
 {
     std::filesystem::create_directories(mFolder.Path());
-    SetAsideIfDamaged(mFolder.Blocks());
+    mDamaged.SetAside(mFolder.Blocks());
     File file = ToFile(mFolder.Blocks());
     BannedPluginManager::GetInstance().SaveConfiguration(file);
     for (const PluginLocator& locator : mLifted)
@@ -323,7 +298,19 @@ void Catalogue::SaveBlockList()
 
 void Catalogue::SaveStamps(LocatorTable::Saving saving)
 {
-    WithFiles([this, saving] { mStamps.Save(saving); });
+    WithFiles([this, saving] { WriteStamps(saving); });
+}
+
+void Catalogue::WriteStamps(LocatorTable::Saving saving)
+{
+    mDamaged.SetAside(mFolder.BinaryStamps());
+    mStamps.Save(saving);
+}
+
+void Catalogue::SaveReasons(LocatorTable::Saving saving)
+{
+    mDamaged.SetAside(mFolder.BlockReasons());
+    mReasons.Save(saving);
 }
 
 std::vector<Catalogue::Descriptor> Catalogue::Effects() const
@@ -370,7 +357,7 @@ void Catalogue::Block(const PluginLocator& locator, const BlockReason& reason, L
     WithFiles(
         [this, saving]
         {
-            mReasons.Save(saving);
+            SaveReasons(saving);
             SaveBlockList();
         });
 }
@@ -383,7 +370,7 @@ void Catalogue::Unblock(const PluginLocator& locator)
         [this]
         {
             SaveBlockList();
-            mReasons.Save(LocatorTable::Saving::Quick);
+            SaveReasons(LocatorTable::Saving::Quick);
         });
 }
 

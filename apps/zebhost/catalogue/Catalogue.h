@@ -2,6 +2,7 @@
 
 #include "catalogue/BinaryStamps.h"
 #include "catalogue/BlockReasons.h"
+#include "catalogue/DamagedFiles.h"
 #include "catalogue/ScanFact.h"
 #include "catalogue/SettingsFolder.h"
 #include "catalogue/SettingsJournal.h"
@@ -11,7 +12,6 @@
 #include <host/PluginLocator.h>
 
 #include <cstdint>
-#include <set>
 #include <string>
 #include <vector>
 
@@ -77,8 +77,8 @@ private:
     bool HasResult(const zebaudiofilterhost::PluginLocator& locator, const BlockReason& why) const;
     void SaveBlockList();
     bool IsSound(const std::filesystem::path& path, unsigned int version) const;
-    void NoteDamaged(const std::filesystem::path& path);
-    void SetAsideIfDamaged(const std::filesystem::path& path);
+    void SaveReasons(LocatorTable::Saving saving);
+    void WriteStamps(LocatorTable::Saving saving);
 
     const SettingsFolder& mFolder;
     Console& mConsole;
@@ -87,7 +87,7 @@ private:
     BinaryStamps mStamps;
     SettingsJournal mJournal;
     Unsaved mUnsaved; // of what stands in the journal
-    std::set<std::filesystem::path> mDamaged;
+    DamagedFiles mDamaged;
 };
 
 } // namespace zebhost

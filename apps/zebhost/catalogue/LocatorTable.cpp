@@ -8,7 +8,10 @@
 #include <foundation/zebcore/SafeSave.h>
 #include <foundation/zebcore/XmlUtils.h>
 
+#include <cerrno>
 #include <fstream>
+#include <optional>
+#include <sstream>
 
 namespace zebhost
 {
@@ -29,6 +32,24 @@ std::string Key(const PluginLocator& locator)
     return ToUTF8(key);
 }
 
+// Nothing if there is no such file.
+std::optional<std::string> TextOf(const std::filesystem::path& file)
+{
+    std::ifstream stream(file, std::ios::binary);
+    const int error = stream ? 0 : errno;
+    if (error == ENOENT || error == ENOTDIR)
+    {
+        return std::nullopt;
+    }
+    if (error != 0)
+    {
+        throw zebcore::filesupport::file_exception("cannot read", ToFile(file).FullPath(), error);
+    }
+    std::ostringstream text;
+    text << stream.rdbuf();
+    return text.str();
+}
+
 } // namespace
 
 LocatorTable::LocatorTable(std::filesystem::path file, std::string section)
@@ -36,23 +57,30 @@ LocatorTable::LocatorTable(std::filesystem::path file, std::string section)
 {
 }
 
-void LocatorTable::Load()
+bool LocatorTable::Load()
 {
     mEntries.clear();
-    std::ifstream stream(mFile, std::ios::binary);
-    const Json document = Json::parse(stream, nullptr, false);
+    const std::optional<std::string> text = TextOf(mFile);
+    if (!text)
+    {
+        return true;
+    }
+    const Json document = Json::parse(*text, nullptr, false);
     if (!document.is_object() || document.value("version", Json()) != kTableVersion || !document.contains(mSection) ||
         !document[mSection].is_object())
     {
-        return;
+        return false;
     }
+    bool isSound = true;
     for (const auto& [key, entry] : document[mSection].items())
     {
         if (entry.is_object())
         {
             mEntries[key] = entry;
         }
+        isSound = isSound && entry.is_object();
     }
+    return isSound;
 }
 
 void LocatorTable::Save(Saving saving) const

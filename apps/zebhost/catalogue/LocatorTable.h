@@ -18,7 +18,9 @@ class LocatorTable
 public:
     LocatorTable(std::filesystem::path file, std::string section);
 
-    void Load();
+    // False if there is a file, and not all of it could be taken. Throws zebcore's file_exception if it cannot be
+    // read.
+    bool Load();
 
     enum class Saving
     {
@@ -32,6 +34,8 @@ public:
     const Json* Find(const zebaudiofilterhost::PluginLocator& locator) const;
     void Set(const zebaudiofilterhost::PluginLocator& locator, Json entry);
     void Remove(const zebaudiofilterhost::PluginLocator& locator);
+    // By keys that are good for nothing but telling entries apart.
+    const std::map<std::string, Json>& Entries() const { return mEntries; }
 
 private:
     void SaveQuickly(const std::string& text) const;

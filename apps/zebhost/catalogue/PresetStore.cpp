@@ -2,7 +2,9 @@
 
 #include "catalogue/FileNames.h"
 #include "catalogue/SettingsFolder.h"
+#include "catalogue/WantOfRoom.h"
 #include "cli/Failure.h"
+#include "cli/StartFolder.h"
 #include "output/PrintableText.h"
 #include "output/Strings.h"
 
@@ -65,9 +67,11 @@ void WritePreset(AudioFilter& filter, const fs::path& file)
     zebcore::proplist::utils::SavePropList(target, list);
 }
 
-Failure FileTrouble(const fs::path& file, const std::string& what)
+Failure FileTrouble(const fs::path& file, const std::string& what, int error)
 {
-    return Failure(ExitCode::FileTrouble, what + ": make " + file.string() + " readable and writable");
+    return Failure(ExitCode::FileTrouble,
+                   what +
+                       (IsWantOfRoom(error) ? ": make room" : ": make " + file.string() + " readable and writable"));
 }
 
 } // namespace
@@ -85,7 +89,7 @@ fs::path PresetStore::FileOf(const std::string& filterID, const std::string& pre
 {
     if (IsFile(preset))
     {
-        return fs::absolute(preset).lexically_normal();
+        return fs::absolute(startfolder::Resolve(preset)).lexically_normal();
     }
     constexpr std::size_t kLongestName = 240;
     const std::string name = EncodeFileName(preset);
@@ -110,11 +114,11 @@ fs::path PresetStore::Save(AudioFilter& filter, const std::string& preset, bool 
     }
     catch (const zebcore::filesupport::file_exception& trouble)
     {
-        throw FileTrouble(file, trouble.what());
+        throw FileTrouble(file, trouble.what(), trouble.Error());
     }
     catch (const fs::filesystem_error& trouble)
     {
-        throw FileTrouble(file, trouble.what());
+        throw FileTrouble(file, trouble.what(), trouble.code().value());
     }
     return file;
 }
@@ -155,7 +159,7 @@ void PresetStore::Load(AudioFilter& filter, const std::string& preset) const
     }
     catch (const zebcore::filesupport::file_exception& trouble)
     {
-        throw FileTrouble(file, trouble.what());
+        throw FileTrouble(file, trouble.what(), trouble.Error());
     }
 }
 
@@ -164,9 +168,12 @@ std::vector<PresetStore::Entry> PresetStore::List(const std::string& filterID) c
     std::vector<Entry> entries;
     const fs::path top = filterID.empty() ? mFolder : mFolder / EncodeFileName(filterID);
     std::error_code error;
-    for (const fs::directory_entry& each : fs::recursive_directory_iterator(top, error))
+    for (fs::recursive_directory_iterator at(top, fs::directory_options::skip_permission_denied, error), end;
+         !error && at != end; at.increment(error))
     {
-        if (!each.is_regular_file(error) || each.path().extension() != ".xml")
+        const fs::directory_entry& each = *at;
+        std::error_code isGone;
+        if (!each.is_regular_file(isGone) || each.path().extension() != ".xml")
         {
             continue;
         }
