@@ -31,12 +31,11 @@ CLI::Option* AddOption(CLI::App& app, const OptionSpec& row)
         return app.add_flag(name);
     }
     CLI::Option* option = app.add_option(name)->type_size(1)->expected(1)->allow_extra_args(false);
-    option->multi_option_policy(row.repeatable ? CLI::MultiOptionPolicy::TakeAll : CLI::MultiOptionPolicy::Throw);
-    return option;
+    return option->multi_option_policy(CLI::MultiOptionPolicy::TakeAll);
 }
 
-// What is missing is told later, in words of our own; so nothing is required here. Extra arguments of an option would
-// have brackets around a value taken off, which may stand in a file's name.
+// What is missing or too much is told later, in words of our own; so nothing is required here. Extra arguments of an
+// option would have brackets around a value taken off, which may stand in a file's name.
 CLI::Option* AddOperand(CLI::App& app, const OperandSpec& row)
 {
     constexpr int kAnyNumber = 1 << 20;
@@ -97,6 +96,42 @@ std::string ParsedCommandName(const CLI::App& root)
     return Joined(words, " ");
 }
 
+[[noreturn]] void RefuseUsage(const std::string& what, const std::string& command)
+{
+    const std::string help = command.empty() ? "zebhost --help" : "zebhost " + command + " --help";
+    throw Failure(ExitCode::Usage, what + "; see '" + help + "'");
+}
+
+// No command has a use for an empty text: it is what a variable without a value leaves behind in a script.
+void CheckNotEmpty(const std::string& what, std::string_view name, const Arguments& arguments)
+{
+    const std::vector<std::string> given = arguments.All(name);
+    if (std::find(given.begin(), given.end(), "") != given.end())
+    {
+        RefuseUsage(what + " is empty: give something, or leave it out", arguments.command);
+    }
+}
+
+void CheckOptions(const std::vector<OptionSpec>& options, const Arguments& arguments)
+{
+    for (const OptionSpec& option : options)
+    {
+        const std::string dashed = "--" + std::string(option.name);
+        const std::vector<std::string> given = arguments.All(option.name);
+        CheckNotEmpty(dashed, option.name, arguments);
+        if (option.values == Values::None &&
+            std::any_of(given.begin(), given.end(), [](const std::string& value) { return value != "true"; }))
+        {
+            RefuseUsage(dashed + " takes no value", arguments.command);
+        }
+        if (option.values != Values::None && !option.repeatable && given.size() > 1)
+        {
+            RefuseUsage(dashed + " is given " + std::to_string(given.size()) + " times: give it once",
+                        arguments.command);
+        }
+    }
+}
+
 void CheckChoice(std::string_view what, const std::vector<std::string>& given,
                  const std::vector<std::string_view>& choices)
 {
@@ -128,18 +163,6 @@ void CheckChoices(const CommandSpec& row, const Arguments& arguments)
     }
 }
 
-[[noreturn]] void RefuseUsage(const std::string& what, const std::string& command)
-{
-    const std::string help = command.empty() ? "zebhost --help" : "zebhost " + command + " --help";
-    throw Failure(ExitCode::Usage, what + "; see '" + help + "'");
-}
-
-std::string InOneLine(std::string text)
-{
-    std::replace(text.begin(), text.end(), '\n', ' ');
-    return std::string(Trimmed(text));
-}
-
 void CheckOperands(const CommandSpec& row, const Arguments& arguments)
 {
     for (const OperandSpec& operand : row.operands)
@@ -149,6 +172,7 @@ void CheckOperands(const CommandSpec& row, const Arguments& arguments)
             RefuseUsage(std::string(operand.name) + " is missing: give " + std::string(operand.help),
                         arguments.command);
         }
+        CheckNotEmpty(std::string(operand.name), operand.name, arguments);
     }
 }
 
@@ -181,6 +205,7 @@ public:
         catch (const CLI::CallForHelp&)
         {
             arguments.Add("help", {});
+            RefuseUnknownCommand();
         }
         catch (const CLI::CallForVersion&)
         {
@@ -190,9 +215,15 @@ public:
         {
             RefuseExtras();
         }
+        // An option at the end of the line: all other numbers of values are taken here.
+        catch (const CLI::ArgumentMismatch& error)
+        {
+            const std::string text = error.what();
+            RefuseUsage(text.substr(0, text.find(':')) + " needs a value", ParsedCommandName(mRoot));
+        }
         catch (const CLI::ParseError& error)
         {
-            RefuseUsage(InOneLine(error.what()), ParsedCommandName(mRoot));
+            RefuseUsage(error.what(), ParsedCommandName(mRoot));
         }
         arguments.command = ParsedCommandName(mRoot);
         Collect(arguments);
@@ -200,6 +231,16 @@ public:
     }
 
 private:
+    // Help is for what there is.
+    void RefuseUnknownCommand() const
+    {
+        const std::vector<std::string> extras = mRoot.remaining(true);
+        if (FindCommand(ParsedCommandName(mRoot)) == nullptr && !extras.empty())
+        {
+            RefuseExtras();
+        }
+    }
+
     [[noreturn]] void RefuseExtras() const
     {
         const std::string command = ParsedCommandName(mRoot);
@@ -227,6 +268,8 @@ private:
                         arguments.command);
         }
         TakeValues(command->options, arguments);
+        CheckOptions(CommonOptions(), arguments);
+        CheckOptions(command->row->options, arguments);
         CheckOperands(*command->row, arguments);
         CheckChoices(*command->row, arguments);
     }
