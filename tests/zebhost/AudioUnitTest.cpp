@@ -79,8 +79,9 @@ TEST_F(AudioUnitTest, AUnitThatIsGoneIsDropped)
 TEST_F(AudioUnitTest, BlocksTellOfUnitsByTheirNames)
 {
     constexpr const char* kFullName = "Zeb: Zeb Unit Gain";
-    for (const char* selector : {"Zeb Unit Gain", kGainID})
+    for (const char* selector : {"Zeb Unit Gain", kGainID, kFullName})
     {
+        EXPECT_EQ(Succeed({"info", selector, "--json"}).Json().at("filter").at("id"), kGainID) << selector;
         EXPECT_THAT(Succeed({"block", selector}).err, HasSubstr(std::string(kFullName) + " is blocked"));
         EXPECT_THAT(Succeed({"blocks"}).out, testing::AllOf(HasSubstr(kFullName), Not(HasSubstr("1635083896"))));
         const RunResult refused = Run({"info", kGainID});

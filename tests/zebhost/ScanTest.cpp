@@ -108,6 +108,13 @@ TEST_F(ScanTest, APathMayBeAFolderABundleOrNothing)
     EXPECT_THAT(nothing.LastLine(), HasSubstr(Path("Nothing.vst3")));
     WriteText(Path("file.txt"), "no plug-in");
     EXPECT_EQ(Run({"scan", Path("file.txt")}).code, 3);
+    fs::create_directories(mFolder / "empty");
+    EXPECT_THAT(Succeed({"scan", Path("empty")}).LastLine(),
+                testing::AllOf(HasSubstr(Path("empty")), Not(HasSubstr("--full"))));
+    fs::create_symlink("loop", mFolder / "loop");
+    const RunResult unreadable = Run({"scan", Path("loop")});
+    EXPECT_EQ(unreadable.code, 7);
+    EXPECT_THAT(unreadable.LastLine(), HasSubstr("cannot be read"));
 }
 
 TEST_F(ScanTest, TellsWhyANamedBundleCouldNotBeLoaded)
@@ -159,6 +166,26 @@ TEST_F(ScanTest, LeavesBlockedPluginsAlone)
     Succeed({"unblock", "ZebGain.vst3"});
     Succeed({"scan"});
     EXPECT_THAT(Names(), UnorderedElementsAre("Zeb Delay", "Zeb Gain"));
+}
+
+TEST_F(ScanTest, TriesWhatWasUnblockedWhereverItLies)
+{
+    const fs::path folder = LinkFolder({EffectBundle("ZebGain"), HazardBundle("CrashInEntry")});
+    SearchIn(mFolder / "none");
+    EXPECT_EQ(States(Succeed({"scan", folder.string(), "--json"}).Json()).at("CrashInEntry.vst3"), "crashed");
+    Succeed({"block", "ZebGain.vst3"});
+    EXPECT_EQ(States(Succeed({"scan", "--json"}).Json()).at("ZebGain.vst3"), "dropped");
+    EXPECT_EQ(Succeed({"blocks", "--names"}).out, "CrashInEntry.vst3\nZebGain.vst3\n");
+    for (const char* name : {"ZebGain", "CrashInEntry.vst3"})
+    {
+        EXPECT_THAT(Succeed({"unblock", name}).LastLine(), HasSubstr("the next 'zebhost scan' tries it"));
+    }
+    EXPECT_THAT(Succeed({"scan", "--dry-run"}).out, HasSubstr("was unblocked"));
+    const std::map<std::string, std::string> states = States(Succeed({"scan", "--json"}).Json());
+    EXPECT_EQ(states.at("ZebGain.vst3"), "scanned");
+    EXPECT_EQ(states.at("CrashInEntry.vst3"), "crashed");
+    EXPECT_THAT(Names(), UnorderedElementsAre("Zeb Gain"));
+    EXPECT_THAT(Succeed({"scan"}).LastLine(), HasSubstr("nothing to scan, 1 blocked before"));
 }
 
 TEST_F(ScanTest, ThePermanentListKeepsPluginsOut)

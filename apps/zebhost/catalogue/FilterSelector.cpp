@@ -4,6 +4,7 @@
 #include "catalogue/PluginFinder.h"
 #include "catalogue/ScanSession.h"
 #include "cli/Failure.h"
+#include "cli/StartFolder.h"
 #include "output/PrintableText.h"
 #include "output/Strings.h"
 
@@ -40,7 +41,7 @@ bool LooksLikeID(const std::string& text)
 bool IsThere(const std::string& path)
 {
     std::error_code error;
-    return std::filesystem::exists(path, error);
+    return std::filesystem::exists(startfolder::Resolve(path), error);
 }
 
 // A '#' may also stand in the path itself, so the longest path that is there counts.
@@ -166,6 +167,11 @@ Catalogue::Descriptor FilterSelector::Select(const std::string& text) const
                           "no filter has the ID " + text + ": 'zebhost list --long' shows all IDs");
         }
     }
+    else if (const std::optional<PluginLocator> called = FindCalled(text))
+    {
+        const bool isFile = called->GetTechnologyType() != zebaudiofilterhost::kTechnologyAudioUnit;
+        found = isFile ? FindByPath(PathOf(*called), {}) : mCatalogue.EffectsOf(*called).front();
+    }
     else if (const std::optional<PathAndClass> split = SplitPath(text))
     {
         found = FindByPath(split->path, split->className);
@@ -183,12 +189,39 @@ Catalogue::Descriptor FilterSelector::Select(const std::string& text) const
 
 std::vector<PluginLocator> FilterSelector::SelectPlugins(const std::string& text) const
 {
+    if (const std::optional<PluginLocator> called = FindCalled(text))
+    {
+        return {*called};
+    }
     if (!LooksLikeID(text) && (IsBundlePath(text) || text.find('/') != std::string::npos))
     {
         return NamedPlugins(text, " is not named like a plug-in: its name ends in ");
     }
     const auto byID = AudioFilterDescriptorManager::GetInstance().GetComponentDescriptorForID(FromUTF8(text));
     return {(byID != nullptr ? byID : FindByName(text))->GetLocator()};
+}
+
+std::optional<PluginLocator> FilterSelector::FindCalled(const std::string& text) const
+{
+    if (IsBundlePath(text) && IsThere(text))
+    {
+        return std::nullopt;
+    }
+    Descriptors fitting = mCatalogue.Effects();
+    std::erase_if(fitting,
+                  [&text](const Catalogue::Descriptor& each) { return !IsCalled(each->GetLocator(), text); });
+    if (fitting.empty())
+    {
+        return std::nullopt;
+    }
+    const PluginLocator first = fitting.front()->GetLocator();
+    if (std::any_of(fitting.begin(), fitting.end(),
+                    [&first](const Catalogue::Descriptor& each) { return each->GetLocator() != first; }))
+    {
+        throw Failure(ExitCode::NotFound, text + " fits several plug-ins: give the path of one of the above",
+                      Candidates(fitting));
+    }
+    return first;
 }
 
 Catalogue::Descriptor FilterSelector::FindByPath(const std::string& path, const std::string& className) const

@@ -2,6 +2,7 @@
 
 #include "catalogue/UnitBundle.h"
 #include "cli/Failure.h"
+#include "cli/StartFolder.h"
 #include "output/PrintableText.h"
 
 #include <foundation/zebcore/NativePath.h>
@@ -73,7 +74,7 @@ std::string SpelledCodes(const std::string& id)
 
 fs::path Normal(const fs::path& path)
 {
-    const fs::path normal = fs::absolute(path).lexically_normal();
+    const fs::path normal = fs::absolute(startfolder::Resolve(path)).lexically_normal();
     return normal.has_filename() ? normal : normal.parent_path();
 }
 
@@ -89,6 +90,15 @@ bool IsWorthVisiting(const fs::directory_entry& entry)
     return zebaudiofilterhost::vst::IsVSTPlugin(FromNativePath(entry.path().string()));
 }
 
+void CheckReadable(const fs::path& path, const std::error_code& error)
+{
+    if (error)
+    {
+        throw Failure(ExitCode::FileTrouble,
+                      path.string() + " cannot be read: " + error.message() + "; make it readable");
+    }
+}
+
 // A link back to a folder above would never end, so each real folder is searched once.
 void SearchFolder(const fs::path& folder, std::set<fs::path>& seen, std::vector<PluginLocator>& found)
 {
@@ -98,12 +108,12 @@ void SearchFolder(const fs::path& folder, std::set<fs::path>& seen, std::vector<
         return;
     }
     std::vector<fs::path> children;
-    for (const fs::directory_entry& entry :
-         fs::directory_iterator(folder, fs::directory_options::skip_permission_denied, error))
+    for (fs::directory_iterator at(folder, fs::directory_options::skip_permission_denied, error), end;
+         !error && at != end; at.increment(error))
     {
-        if (IsWorthVisiting(entry))
+        if (IsWorthVisiting(*at))
         {
-            children.push_back(entry.path());
+            children.push_back(at->path());
         }
     }
     std::sort(children.begin(), children.end());
@@ -177,6 +187,13 @@ std::string SelectorWord(const PluginLocator& locator)
     return selector.find(' ') == std::string::npos ? selector : '"' + selector + '"';
 }
 
+bool IsCalled(const PluginLocator& locator, const std::string& text)
+{
+    return locator.GetTechnologyType() == zebaudiofilterhost::kTechnologyAudioUnit
+               ? PlaceOf(locator) == text
+               : fs::path(PathOf(locator)).filename() == text;
+}
+
 bool IsInstalled(const PluginLocator& locator)
 {
     const TechnologyType type = locator.GetTechnologyType();
@@ -193,8 +210,9 @@ bool IsInstalled(const PluginLocator& locator)
 std::vector<PluginLocator> FindPlugins(const fs::path& path)
 {
     std::error_code error;
-    if (!fs::exists(path, error))
+    if (!fs::exists(startfolder::Resolve(path), error))
     {
+        CheckReadable(path, error);
         throw Failure(ExitCode::NotFound, path.string() + ": there is nothing at this path; check its spelling");
     }
     if (IsBundlePath(path))
@@ -206,12 +224,14 @@ std::vector<PluginLocator> FindPlugins(const fs::path& path)
         }
         return plugins;
     }
-    if (!fs::is_directory(path, error))
+    if (!fs::is_directory(startfolder::Resolve(path), error))
     {
         throw Failure(ExitCode::NotFound, path.string() +
                                               " is no plug-in: give a bundle or file whose name ends in " +
                                               kPluginNameEnds + ", or a folder that holds such");
     }
+    static_cast<void>(fs::directory_iterator(startfolder::Resolve(path), error));
+    CheckReadable(path, error);
     std::vector<PluginLocator> found;
     std::set<fs::path> seen;
     SearchFolder(Normal(path), seen, found);

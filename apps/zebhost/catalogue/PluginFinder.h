@@ -32,6 +32,9 @@ std::string SelectorOf(const zebaudiofilterhost::PluginLocator& locator);
 // The same as one word for a shell.
 std::string SelectorWord(const zebaudiofilterhost::PluginLocator& locator);
 
+// Whether the text is the path's last part; of a plug-in that is no file, what PlaceOf shows.
+bool IsCalled(const zebaudiofilterhost::PluginLocator& locator, const std::string& text);
+
 // Whether the plug-in's file or bundle is there; for one that is no file, whether its technology still finds it.
 bool IsInstalled(const zebaudiofilterhost::PluginLocator& locator);
 
@@ -40,7 +43,8 @@ bool IsInstalled(const zebaudiofilterhost::PluginLocator& locator);
 void UseStandardPlaces();
 
 // The plug-in itself, or all plug-ins below a folder, in the order of their names; the inside of a bundle is not
-// searched, and a plain file is looked into without loading it. Throws a Failure if there is nothing at the path.
+// searched, and a plain file is looked into without loading it. Throws a Failure if there is nothing at the path,
+// or nothing that can be read.
 std::vector<zebaudiofilterhost::PluginLocator> FindPlugins(const std::filesystem::path& path);
 
 // Without those that a symbolic link leads to a second time; the first of each stays.

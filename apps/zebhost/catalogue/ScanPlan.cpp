@@ -20,6 +20,8 @@ using zebaudiofilterhost::PluginModuleInfoManager;
 namespace
 {
 
+constexpr const char* kUnblocked = "was unblocked";
+
 // What is no file is looked up among all that is found, from which the blocked are left out.
 bool IsThere(const PluginLocator& locator)
 {
@@ -38,7 +40,7 @@ class Planner
 public:
     Planner(const Catalogue& catalogue, const ScanWishes& wishes) : mCatalogue(catalogue), mWishes(wishes) {}
 
-    // A plug-in of the standard places that is not on the dynamic list.
+    // A plug-in of the standard places, or one to be tried, that is not on the dynamic list.
     void AddFound(const PluginLocator& locator)
     {
         if (mCatalogue.IsBlocked(locator))
@@ -48,7 +50,11 @@ public:
         }
         const std::optional<BinaryStamps::Entry> last = mCatalogue.Stamps().Find(locator);
         const bool hasChanged = last && last->binary != StampOf(locator);
-        if (IsKnown(locator))
+        if (mCatalogue.Stamps().IsToBeTried(locator))
+        {
+            AddToScan(locator, kUnblocked);
+        }
+        else if (IsKnown(locator))
         {
             AddKnown(locator, last.has_value(), hasChanged, mWishes.full);
         }
@@ -93,6 +99,11 @@ public:
         if (!IsThere(locator))
         {
             mPlan.toDrop.push_back({locator, "gone"});
+            return;
+        }
+        if (mCatalogue.Stamps().IsToBeTried(locator))
+        {
+            AddToScan(locator, kUnblocked);
             return;
         }
         const std::optional<BinaryStamps::Entry> last = mCatalogue.Stamps().Find(locator);
@@ -177,8 +188,12 @@ ScanPlan PlanStandardScan(const Catalogue& catalogue, const ScanWishes& wishes)
     Planner planner(catalogue, wishes);
     std::vector<PluginLocator> removed;
     // All that is there, since a link to a plug-in that is in the catalogue already would look new.
-    for (const PluginLocator& locator :
-         WithoutDoubles(PluginModuleInfoManager::GetInstance().CollectPotentialPlugins(false, removed)))
+    std::vector<PluginLocator> found = PluginModuleInfoManager::GetInstance().CollectPotentialPlugins(false, removed);
+    const std::vector<PluginLocator> toBeTried = catalogue.Stamps().AllToBeTried();
+    std::copy_if(toBeTried.begin(), toBeTried.end(), std::back_inserter(found),
+                 [&blocks](const PluginLocator& locator)
+                 { return IsInstalled(locator) && !IsKnown(locator) && !blocks.IsPluginBanned(locator); });
+    for (const PluginLocator& locator : WithoutDoubles(found))
     {
         planner.AddFound(locator);
     }

@@ -16,7 +16,8 @@ struct ScanPlan
     struct Item
     {
         zebaudiofilterhost::PluginLocator locator;
-        // "new", "changed", "asked for", "full scan", "failed before", "was blocked", "was blocked, and has changed";
+        // "new", "changed", "asked for", "full scan", "failed before", "was blocked", "was blocked, and has changed",
+        // "was unblocked";
         // of what is dropped "gone", "blocked"; of what is skipped why it was blocked or
         // could not be loaded
         std::string why;

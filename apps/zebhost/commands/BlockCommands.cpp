@@ -7,7 +7,8 @@
 
 #include <host/BannedPluginManager.h>
 
-#include <optional>
+#include <filesystem>
+#include <map>
 #include <vector>
 
 namespace zebhost
@@ -102,14 +103,30 @@ void Tell(const CommandContext& context, const std::vector<PluginLocator>& locat
     }
 }
 
-// So that the next scan tries it.
-void ForgetProblem(Catalogue& catalogue, const PluginLocator& locator)
+// A scan without paths may not find the units of a bundle that lies elsewhere.
+std::string WhatTriesIt(const PluginLocator& locator, const std::string& text)
 {
-    const std::optional<BinaryStamps::Entry> last = catalogue.Stamps().Find(locator);
-    if (last && !last->problem.empty())
+    if (!IsInstalled(locator))
     {
-        catalogue.Stamps().Remove(locator);
-        catalogue.SaveStamps(LocatorTable::Saving::Flushed);
+        return "; there is nothing at its place now";
+    }
+    const bool isUnitOfBundle =
+        locator.GetTechnologyType() == zebaudiofilterhost::kTechnologyAudioUnit && IsBundlePath(text);
+    return isUnitOfBundle ? "; 'zebhost scan " + text + "' tries it" : "; the next 'zebhost scan' tries it";
+}
+
+// Of several with one file name, the paths.
+void PrintNames(const CommandContext& context)
+{
+    std::map<std::string, std::vector<std::string>> places;
+    for (const PluginLocator& locator : Blocked())
+    {
+        const std::string place = PlaceOf(locator);
+        places[place == PathOf(locator) ? std::filesystem::path(place).filename().string() : place].push_back(place);
+    }
+    for (const auto& [name, all] : places)
+    {
+        context.console.Print((all.size() == 1 ? name : Joined(all, "\n")) + "\n");
     }
 }
 
@@ -125,6 +142,10 @@ ExitCode RunBlock(CommandContext& context)
     why.isByHand = true;
     for (const PluginLocator& locator : locators)
     {
+        if (!IsInstalled(locator))
+        {
+            context.console.Remark("zebhost: there is nothing at " + PlaceOf(locator) + " now");
+        }
         context.catalogue.Block(locator, why);
     }
     Tell(context, locators, " is blocked; 'zebhost unblock' lets it be used again");
@@ -133,13 +154,15 @@ ExitCode RunBlock(CommandContext& context)
 
 ExitCode RunUnblock(CommandContext& context)
 {
-    const std::vector<PluginLocator> locators = BlockedPlugins(context, context.arguments.Text("PLUGIN"));
+    const std::string text = context.arguments.Text("PLUGIN");
+    const std::vector<PluginLocator> locators = BlockedPlugins(context, text);
     for (const PluginLocator& locator : locators)
     {
         context.catalogue.Unblock(locator);
-        ForgetProblem(context.catalogue, locator);
+        context.catalogue.Stamps().MarkToBeTried(locator);
     }
-    Tell(context, locators, " is not blocked any more; the next 'zebhost scan' tries it");
+    context.catalogue.SaveStamps(LocatorTable::Saving::Flushed);
+    Tell(context, locators, " is not blocked any more" + WhatTriesIt(locators.front(), text));
     return ExitCode::Done;
 }
 
@@ -158,6 +181,10 @@ ExitCode RunBlocks(CommandContext& context)
     if (context.WantsJson())
     {
         context.Print(document);
+    }
+    else if (context.arguments.Has("names"))
+    {
+        PrintNames(context);
     }
     else if (table.IsEmpty())
     {

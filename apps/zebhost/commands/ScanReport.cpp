@@ -194,10 +194,17 @@ std::string ScanReport::Summary() const
                                  : "; 'zebhost blocks' tells why";
     if (mPlan.toScan.empty())
     {
-        return "zebhost: nothing to scan" + rest + "; --full scans again what is in the catalogue";
+        return "zebhost: nothing to scan" + rest + (mPlan.blocked.empty() ? WhatElse() : hint);
     }
     return "zebhost: " + Counted(mFinished, "plug-in") + " scanned, " + Counted(effects, "effect") + " found" + rest +
            hint;
+}
+
+std::string ScanReport::WhatElse() const
+{
+    const std::vector<std::string> paths = mContext.arguments.All("PATH");
+    return paths.empty() ? "; --full scans again what is in the catalogue"
+                         : " in " + Joined(paths, ", ") + ": a plug-in's name ends in " + kPluginNameEnds;
 }
 
 std::string ScanReport::PlanSummary() const

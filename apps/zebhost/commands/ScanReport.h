@@ -47,6 +47,8 @@ private:
     };
 
     void Add(const std::vector<ScanPlan::Item>& items, const char* state);
+    // What to do when there was nothing to scan.
+    std::string WhatElse() const;
     std::size_t Count(const char* state) const;
     void Print(Json document) const;
 
