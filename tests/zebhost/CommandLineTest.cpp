@@ -48,6 +48,8 @@ TEST_F(CommandLineTest, WrongUseEndsWithCodeTwoAndTellsWhereHelpIs)
         {"render", "Gain", "a.wav", "b.wav", "--format", "12"},
         {"render", "Gain", "a.wav", "b.wav", "--block", "64", "--block", "128"},
         {"completion", "csh"},
+        {"frob", "--help"},
+        {"preset", "frob", "--help"},
     };
     for (const std::vector<std::string>& line : lines)
     {
@@ -55,6 +57,34 @@ TEST_F(CommandLineTest, WrongUseEndsWithCodeTwoAndTellsWhereHelpIs)
         EXPECT_EQ(result.code, 2) << testing::PrintToString(line) << result.err;
         EXPECT_EQ(result.out, "") << testing::PrintToString(line);
         EXPECT_THAT(result.LastLine(), StartsWith("zebhost: ")) << testing::PrintToString(line);
+    }
+}
+
+TEST_F(CommandLineTest, WhatIsWrongIsSaidInWordsOfItsOwn)
+{
+    const std::vector<std::pair<std::vector<std::string>, std::string>> lines = {
+        {{"params", "Gain", "--set"}, "--set needs a value"},
+        {{"list", "--trace"}, "--trace needs a value"},
+        {{"render", "Gain", "a.wav", "b.wav", "--tempo", "90", "--tempo", "91"}, "--tempo is given 2 times"},
+        {{"list", "--json=no"}, "--json takes no value"},
+        {{"info", ""}, "FILTER is empty"},
+        {{"params", ""}, "FILTER is empty"},
+        {{"edit", ""}, "FILTER is empty"},
+        {{"preset", "list", ""}, "FILTER is empty"},
+        {{"preset", "save", "Gain", ""}, "PRESET is empty"},
+        {{"block", ""}, "PLUGIN is empty"},
+        {{"unblock", ""}, "PLUGIN is empty"},
+        {{"scan", "folder", ""}, "PATH is empty"},
+        {{"blocks", "--settings", ""}, "--settings is empty"},
+        {{"render", "Gain", "a.wav", "b.wav", "--automation", ""}, "--automation is empty"},
+        {{"render", "Gain", "a.wav", "b.wav", "--side-chain", ""}, "--side-chain is empty"},
+        {{"render", "Gain", "a.wav", "b.wav", "--on", ""}, "--on is empty"},
+    };
+    for (const auto& [line, words] : lines)
+    {
+        const RunResult result = Run(line);
+        EXPECT_EQ(result.code, 2) << words << result.err;
+        EXPECT_THAT(result.LastLine(), StartsWith("zebhost: " + words)) << testing::PrintToString(line);
     }
 }
 
@@ -173,9 +203,78 @@ printf '%s\n' "${COMPREPLY[@]}"
     EXPECT_EQ(complete({"preset", "l"}), "load\nlist\n");
     EXPECT_EQ(complete({"render", "--side"}), "--side-chain\n");
     EXPECT_EQ(complete({"render", "--format", "fl"}), "float\n");
-    EXPECT_EQ(complete({"info", "Zeb Ga"}), "Zeb Gain\n");
+    for (const char* typed : {"Zeb Ga", "Zeb\\ Ga", "\"Zeb Ga", "'Zeb Ga"})
+    {
+        EXPECT_EQ(complete({"info", typed}), "Zeb Gain\n") << typed;
+    }
+    std::filesystem::create_directories(mFolder / "a folder");
+    WriteText(Path("a [file].wav"), "");
+    EXPECT_EQ(complete({"--settings", Path("a")}), Path("a folder") + "\n");
+    EXPECT_EQ(complete({"list", "--settings", Path("a\\ f")}), Path("a folder") + "\n");
+    EXPECT_EQ(complete({"render", "Zeb\\ Gain", "\"" + Path("a [")}), Path("a [file].wav") + "\n");
+    EXPECT_EQ(complete({"unblock", ""}), "\n");
+    Succeed({"block", "Zeb Gain"});
+    EXPECT_EQ(complete({"unblock", ""}), "ZebGain.vst3\n");
     EXPECT_EQ(complete({"completion", "z"}), "zsh\n");
     EXPECT_EQ(complete({"console", "zeb"}), "zebaudiofilterhost.BuildPrivatePluginConfig\n");
+}
+
+// What the shell's own functions make of what they are given is the shell's.
+TEST_F(CommandLineTest, ZshIsOfferedTheSame)
+{
+    if (RunProgram({"zsh", "-f", "-c", ":"}, mVariables, mFolder).code != 0)
+    {
+        GTEST_SKIP() << "zsh is not installed: its completion was not tried";
+    }
+    Succeed({"scan", "--quiet"});
+    Succeed({"block", "Zeb Delay"});
+    WriteText(Path("zebhost.zsh"), Succeed({"completion", "zsh"}).out);
+    WriteText(Path("try.zsh"), R"(
+compdef() { :; }
+_files() { print -r -- files "$@"; }
+compadd() { shift; print -rl -- "$@"; }
+zebhost() { )" ZEBHOST_PROGRAM R"( --settings "$SETTINGS" "$@"; }
+. "$1"; shift
+words=(zebhost "$@"); CURRENT=$#words; PREFIX=$words[-1]
+_zebhost
+)");
+    mVariables["SETTINGS"] = Settings().string();
+    const auto complete = [this](std::vector<std::string> words)
+    {
+        words.insert(words.begin(), {"zsh", "-f", Path("try.zsh"), Path("zebhost.zsh")});
+        const RunResult result = RunProgram(words, mVariables, mFolder);
+        EXPECT_EQ(result.err, "");
+        return result.out;
+    };
+    EXPECT_THAT(complete({"unb"}), HasSubstr("\nunblock\n"));
+    EXPECT_EQ(complete({"preset", ""}), "save\nload\nlist\n");
+    EXPECT_THAT(complete({"info", ""}), testing::AllOf(StartsWith("files\n"), HasSubstr("\nZeb Gain\n")));
+    EXPECT_EQ(complete({"unblock", ""}), "ZebDelay.vst3\n");
+    EXPECT_EQ(complete({"--settings", ""}), "files -/\n");
+    EXPECT_EQ(complete({"preset", "list", "--settings", ""}), "files -/\n");
+    EXPECT_THAT(complete({"render", "-"}), HasSubstr("\n--side-chain\n"));
+}
+
+TEST_F(CommandLineTest, FishOffersFiltersAndWhatIsBlocked)
+{
+    if (RunProgram({"fish", "--no-config", "-c", ":"}, mVariables, mFolder).code != 0)
+    {
+        GTEST_SKIP() << "fish is not installed: its completion was not tried";
+    }
+    Succeed({"scan", "--quiet"});
+    Succeed({"block", "Zeb Delay"});
+    WriteText(Path("try.fish"), "function zebhost; " ZEBHOST_PROGRAM " --settings $SETTINGS $argv; end\n" +
+                                    Succeed({"completion", "fish"}).out + "complete -C $argv[1]\n");
+    mVariables["SETTINGS"] = Settings().string();
+    const auto complete = [this](const std::string& line)
+    {
+        const RunResult result = RunProgram({"fish", "--no-config", Path("try.fish"), line}, mVariables, mFolder);
+        EXPECT_EQ(result.err, "");
+        return result.out;
+    };
+    EXPECT_EQ(complete("zebhost unblock "), "ZebDelay.vst3\n");
+    EXPECT_THAT(complete("zebhost info Zeb"), HasSubstr("Zeb Gain\n"));
+    EXPECT_THAT(complete("zebhost unb"), StartsWith("unblock\t"));
 }
 
 } // namespace

@@ -16,6 +16,7 @@ enum class Values
     Folder,
     Filter,
     Plugin,
+    Blocked,
     ConsoleCommand,
     Choice
 };

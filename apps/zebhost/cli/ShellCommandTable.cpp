@@ -8,7 +8,8 @@ namespace
 
 OperandSpec PluginOperand()
 {
-    return {"PLUGIN", "a plug-in's path, or a filter of the catalogue by name or ID", Values::Plugin};
+    return {"PLUGIN", "a plug-in's path, or one of the catalogue by file name, or by name or ID of a filter",
+            Values::Plugin};
 }
 
 } // namespace
@@ -28,14 +29,17 @@ std::vector<CommandSpec> BlockCommands()
         "unblock",
         "let a blocked plug-in be used again",
         "The next scan tries it.",
-        {PluginOperand()},
+        {{"PLUGIN", "a path, a name or an ID, as 'zebhost blocks' shows it, or a file name", Values::Blocked}},
         {},
         {{"zebhost unblock ~/.vst3/Shaky.vst3", "by path"}, {"zebhost unblock Shaky.vst3", "by file name"}},
     };
     CommandSpec blocks = {
-        "blocks", "list blocked plug-ins with the reason",
-        "",       {},
-        {},       {{"zebhost blocks", "for reading"}, {"zebhost blocks --json", "for a script"}},
+        "blocks",
+        "list blocked plug-ins with the reason",
+        "",
+        {},
+        {{"names", "", "print what 'zebhost unblock' takes only, one a line"}},
+        {{"zebhost blocks", "for reading"}, {"zebhost blocks --json", "for a script"}},
     };
     return {block, unblock, blocks};
 }

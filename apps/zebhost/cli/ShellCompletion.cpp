@@ -71,43 +71,47 @@ std::string OptionWords(const CommandSpec& command)
     return own + (own.empty() ? "" : " ") + DashedNames(CommonOptions()) + " --help";
 }
 
-std::string BashValues(Values values, const std::vector<std::string_view>& choices)
+// The call that offers what can stand there; each shell has its own functions of these names.
+std::string OfferingOf(Values values, const std::vector<std::string_view>& choices)
 {
     switch (values)
     {
     case Values::Choice:
-        return "COMPREPLY=($(compgen -W '" + Joined({choices.begin(), choices.end()}, " ") + "' -- \"$cur\"))";
+        return "_zebhost_words " + Joined({choices.begin(), choices.end()}, " ");
     case Values::Filter:
     case Values::Plugin:
-        return "_zebhost_filters";
+        return "_zebhost_files; _zebhost_lines zebhost list --names --quiet";
+    case Values::Blocked:
+        return "_zebhost_lines zebhost blocks --names --quiet";
     case Values::ConsoleCommand:
-        return "COMPREPLY=($(compgen -W \"$(zebhost console --names --quiet 2>/dev/null)\" -- \"$cur\"))";
+        return "_zebhost_lines zebhost console --names --quiet";
     case Values::File:
-        return "compopt -o filenames; COMPREPLY=($(compgen -f -- \"$cur\"))";
+        return "_zebhost_files";
     case Values::Folder:
-        return "compopt -o filenames; COMPREPLY=($(compgen -d -- \"$cur\"))";
+        return "_zebhost_folders";
     case Values::None:
     case Values::Text:
     case Values::Number:
         break;
     }
-    return "COMPREPLY=()";
+    return ":";
 }
 
-void AddBashValues(std::string& script, const std::vector<OptionSpec>& options, const std::string& command)
+// `command` is a pattern.
+void AddOptionValues(std::string& script, const std::vector<OptionSpec>& options, const std::string& command)
 {
     for (const OptionSpec& option : options)
     {
         if (option.values != Values::None)
         {
-            script += "        '" + command + ":--" + std::string(option.name) + "') " +
-                      BashValues(option.values, option.choices) + "; return ;;\n";
+            script += "        " + command + ":--" + std::string(option.name) + ") " +
+                      OfferingOf(option.values, option.choices) + "; return ;;\n";
         }
     }
 }
 
 // The first operand is completed by its kind, every later one by the kind of the last.
-void AddBashOperands(std::string& script, const CommandSpec& command)
+void AddOperandValues(std::string& script, const CommandSpec& command)
 {
     if (command.operands.empty())
     {
@@ -116,7 +120,7 @@ void AddBashOperands(std::string& script, const CommandSpec& command)
     const OperandSpec& first = command.operands.front();
     const OperandSpec& last = command.operands.back();
     script += "        '" + std::string(command.name) + "') if (( operands == 0 )); then " +
-              BashValues(first.values, first.choices) + "; else " + BashValues(last.values, last.choices) +
+              OfferingOf(first.values, first.choices) + "; else " + OfferingOf(last.values, last.choices) +
               "; fi ;;\n";
 }
 
@@ -133,26 +137,62 @@ std::string TwoWordPattern()
     return Joined(patterns, "|");
 }
 
+// What was typed may be quoted; bash quotes what it takes over, if it counts as the name of a file.
 constexpr std::string_view kBashHead = R"(# bash completion for zebhost
-_zebhost_filters() {
-    local IFS=$'\n'
-    compopt -o filenames
-    COMPREPLY=($(compgen -f -- "$cur"))
-    local name
-    while read -r name; do
-        [[ $name == "$cur"* ]] && COMPREPLY+=("$name")
-    done < <(zebhost list --names --quiet 2>/dev/null)
+_zebhost_add() {
+    local line
+    while IFS= read -r line; do
+        [[ $line == "$typed"* ]] && COMPREPLY+=("$line")
+    done
 }
+_zebhost_words() { _zebhost_add < <(printf '%s\n' "$@"); }
+_zebhost_lines() { compopt -o filenames; _zebhost_add < <("$@" 2>/dev/null); }
+_zebhost_files() { compopt -o filenames; _zebhost_add < <(compgen -f -- "$typed"); }
+_zebhost_folders() { compopt -o filenames; _zebhost_add < <(compgen -d -- "$typed"); }
 _zebhost() {
-    local cur=${COMP_WORDS[COMP_CWORD]} prev=${COMP_WORDS[COMP_CWORD-1]} command= operands=0 word i skip=0
+    local cur=${COMP_WORDS[COMP_CWORD]} prev=${COMP_WORDS[COMP_CWORD-1]} typed
     COMPREPLY=()
-    for (( i = 1; i < COMP_CWORD; i++ )); do
-        word=${COMP_WORDS[i]}
+    case $cur in
+        [\"\']*) typed=${cur:1} ;;
+        *) typed=${cur//\\/} ;;
+    esac
+    _zebhost_offer "${COMP_WORDS[@]:1:COMP_CWORD-1}"
+}
+)";
+
+constexpr std::string_view kBashFoot = "complete -F _zebhost zebhost\n";
+
+constexpr std::string_view kZshHead = R"(#compdef zebhost
+_zebhost_words() { compadd -- "$@" }
+_zebhost_lines() {
+    local -a lines=("${(@f)$("$@" 2>/dev/null)}")
+    compadd -- "${(@)lines:#}"
+}
+_zebhost_files() { _files }
+_zebhost_folders() { _files -/ }
+_zebhost() {
+    local cur=$PREFIX prev=${words[CURRENT-1]}
+    _zebhost_offer "${(@)words[2,CURRENT-1]}"
+}
+)";
+
+// As a file in $fpath it is called at once; to be sourced it needs zsh's completion at work.
+constexpr std::string_view kZshFoot = R"(if [[ ${funcstack[1]} == _zebhost ]]; then
+    _zebhost "$@"
+else
+    (( $+functions[compdef] )) || { autoload -Uz compinit && compinit; }
+    compdef _zebhost zebhost
+fi
+)";
+
+constexpr std::string_view kOfferHead = R"(_zebhost_offer() {
+    local command= operands=0 word skip=0
+    for word in "$@"; do
         if (( skip )); then skip=0; continue; fi
         case $word in
         )";
 
-constexpr std::string_view kBashMiddle = R"() skip=1 ;;
+constexpr std::string_view kOfferMiddle = R"() skip=1 ;;
         -*) ;;
         *) if [[ -z $command ]]; then command=$word
            elif [[ $command =~ ^(@TWO@)$ ]]; then command="$command $word"
@@ -189,44 +229,47 @@ std::string ValueOptionPattern()
     return Joined({names.begin(), names.end()}, "|");
 }
 
-std::string BashCompletion()
+// In words that bash and zsh both understand, from the words before the one at hand.
+std::string OfferFunction()
 {
-    std::string script(kBashHead);
+    std::string script(kOfferHead);
     script += ValueOptionPattern();
-    script += Replaced(std::string(kBashMiddle), "@TWO@", TwoWordPattern());
+    script += Replaced(std::string(kOfferMiddle), "@TWO@", TwoWordPattern());
     for (const CommandSpec& command : CommandTable())
     {
-        AddBashValues(script, command.options, std::string(command.name));
-        AddBashValues(script, CommonOptions(), std::string(command.name));
+        AddOptionValues(script, command.options, "'" + std::string(command.name) + "'");
     }
+    AddOptionValues(script, CommonOptions(), "*");
     script += "    esac\n    if [[ $cur == -* ]]; then\n        case $command in\n";
     for (const CommandSpec& command : CommandTable())
     {
-        script += "        '" + std::string(command.name) + "') COMPREPLY=($(compgen -W '" + OptionWords(command) +
-                  "' -- \"$cur\")) ;;\n";
+        script += "        '" + std::string(command.name) + "') _zebhost_words " + OptionWords(command) + " ;;\n";
     }
-    script += "        *) COMPREPLY=($(compgen -W '" + DashedNames(CommonOptions()) +
-              " --help --version' -- \"$cur\")) ;;\n        esac\n        return\n    fi\n    case $command in\n";
-    script += "        '') COMPREPLY=($(compgen -W '" + Joined(FirstWords(), " ") + "' -- \"$cur\")) ;;\n";
+    script += "        *) _zebhost_words " + DashedNames(CommonOptions()) +
+              " --help --version ;;\n        esac\n        return\n    fi\n    case $command in\n";
+    script += "        '') _zebhost_words " + Joined(FirstWords(), " ") + " ;;\n";
     for (const std::string& word : FirstWords())
     {
         if (IsSecondWordNeeded(word))
         {
-            script += "        '" + word + "') COMPREPLY=($(compgen -W '" + Joined(SecondWords(word), " ") +
-                      "' -- \"$cur\")) ;;\n";
+            script += "        '" + word + "') _zebhost_words " + Joined(SecondWords(word), " ") + " ;;\n";
         }
     }
     for (const CommandSpec& command : CommandTable())
     {
-        AddBashOperands(script, command);
+        AddOperandValues(script, command);
     }
-    return script + "    esac\n}\ncomplete -F _zebhost zebhost\n";
+    return script + "    esac\n}\n";
 }
 
-// zsh runs bash's completion functions when told to.
+std::string BashCompletion()
+{
+    return std::string(kBashHead) + OfferFunction() + std::string(kBashFoot);
+}
+
 std::string ZshCompletion()
 {
-    return "#compdef zebhost\nautoload -U +X bashcompinit && bashcompinit\n" + BashCompletion();
+    return std::string(kZshHead) + OfferFunction() + std::string(kZshFoot);
 }
 
 std::string FishCondition(std::string_view command)
@@ -279,10 +322,11 @@ void AddFishCommand(std::string& script, const CommandSpec& command)
             script += "complete -c zebhost -n " + SingleQuoted(condition) +
                       " -a '(zebhost list --names --quiet 2>/dev/null)'\n";
         }
-        else if (operand.values == Values::ConsoleCommand)
+        else if (operand.values == Values::ConsoleCommand || operand.values == Values::Blocked)
         {
-            script += "complete -c zebhost -f -n " + SingleQuoted(condition) +
-                      " -a '(zebhost console --names --quiet 2>/dev/null)'\n";
+            const std::string lister = operand.values == Values::Blocked ? "blocks" : "console";
+            script += "complete -c zebhost -f -n " + SingleQuoted(condition) + " -a '(zebhost " + lister +
+                      " --names --quiet 2>/dev/null)'\n";
         }
         else if (operand.values == Values::Choice)
         {
