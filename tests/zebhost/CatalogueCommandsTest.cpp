@@ -171,6 +171,27 @@ TEST_F(CatalogueCommandsTest, BlockedPluginsAreRefusedEverywhere)
     EXPECT_EQ(Run({"unblock", EffectBundle("ZebGain").string()}).code, 3);
 }
 
+TEST_F(CatalogueCommandsTest, AFileNameMeansWhatTheCatalogueHasOfThatName)
+{
+    Succeed({"scan", "--quiet"});
+    EXPECT_EQ(NameOf("ZebGain.vst3"), "Zeb Gain");
+    EXPECT_EQ(Succeed({"block", "ZebGain.vst3", "--json"}).Json().at("path"), EffectBundle("ZebGain").string());
+    EXPECT_EQ(Run({"info", "ZebGain.vst3"}).code, 6);
+    const RunResult nothing = Succeed({"block", "Nowhere.vst3"});
+    EXPECT_THAT(nothing.err, testing::ContainsRegex("there is nothing at .*/Nowhere.vst3"));
+    EXPECT_THAT(Succeed({"unblock", "Nowhere.vst3"}).LastLine(), HasSubstr("nothing at its place"));
+}
+
+TEST_F(CatalogueCommandsTest, AReasonOfSeveralLinesStaysInOne)
+{
+    Succeed({"scan", "--quiet"});
+    Succeed({"block", "Zeb Gain", "--reason", "too loud\nand shrill"});
+    EXPECT_THAT(Succeed({"blocks"}).out, HasSubstr("too loud and shrill"));
+    EXPECT_THAT(Run({"info", "Zeb Gain"}).LastLine(),
+                testing::AllOf(testing::StartsWith("zebhost: "), HasSubstr("too loud and shrill")));
+    EXPECT_EQ(Succeed({"blocks", "--json"}).Json().at("blocked").at(0).at("reason"), "too loud\nand shrill");
+}
+
 } // namespace
 
 } // namespace zebtest

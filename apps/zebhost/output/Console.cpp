@@ -1,5 +1,7 @@
 #include "output/Console.h"
 
+#include "output/Strings.h"
+
 #include <algorithm>
 #include <cstdlib>
 
@@ -79,7 +81,7 @@ void Console::Warn(std::string_view text)
 {
     EraseProgress();
     std::fflush(mOutput);
-    const std::string line = std::string(text) + "\n";
+    const std::string line = InOneLine(std::string(text)) + "\n";
     std::fwrite(line.data(), 1, line.size(), stderr);
 }
 

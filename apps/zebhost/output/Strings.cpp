@@ -64,6 +64,20 @@ std::vector<std::string> Split(std::string_view text, char separator)
     }
 }
 
+std::string InOneLine(std::string text)
+{
+    constexpr unsigned char kDelete = 0x7F;
+    std::replace_if(
+        text.begin(), text.end(),
+        [](char letter)
+        {
+            const auto byte = static_cast<unsigned char>(letter);
+            return byte < ' ' || byte == kDelete;
+        },
+        ' ');
+    return text;
+}
+
 std::string Joined(const std::vector<std::string>& pieces, std::string_view separator)
 {
     std::string result;

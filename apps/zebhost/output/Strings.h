@@ -16,6 +16,8 @@ bool ContainsIgnoringCase(std::string_view text, std::string_view part);
 bool StartsWithIgnoringCase(std::string_view text, std::string_view start);
 // Empty pieces included: "a,,b" has three.
 std::vector<std::string> Split(std::string_view text, char separator);
+// With a blank for each control character, so that it stays in its line and steers no terminal.
+std::string InOneLine(std::string text);
 std::string Joined(const std::vector<std::string>& pieces, std::string_view separator);
 // "1 effect", "2 effects".
 std::string Counted(std::size_t count, std::string_view noun);

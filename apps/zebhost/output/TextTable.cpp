@@ -1,5 +1,7 @@
 #include "output/TextTable.h"
 
+#include "output/Strings.h"
+
 #include <algorithm>
 #include <utility>
 
@@ -40,6 +42,7 @@ TextTable::TextTable(std::vector<std::string> headings) : mHeadings(std::move(he
 void TextTable::AddRow(std::vector<std::string> cells)
 {
     cells.resize(mHeadings.size());
+    std::transform(cells.begin(), cells.end(), cells.begin(), InOneLine);
     mRows.push_back(std::move(cells));
 }
 
