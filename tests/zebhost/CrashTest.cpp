@@ -41,6 +41,17 @@ TEST_F(CrashTest, APluginThatEndsTheProcessWithoutAWordIsBlockedAllTheSame)
     EXPECT_EQ(Run({"scan", HazardBundle("ExitInEntry").string()}).code, 6);
 }
 
+TEST_F(CrashTest, APluginThatEndsTheProcessDoesNotEndACommandWell)
+{
+#ifndef __linux__
+    GTEST_SKIP() << "calls of _Exit are not seen on this system";
+#endif
+    const RunResult result = Run({"info", HazardBundle("ExitInEntry").string(), "--json"});
+    EXPECT_EQ(result.code, 5) << result.err;
+    EXPECT_EQ(result.Json().at("error").at("kind"), "crashed");
+    EXPECT_THAT(result.LastLine(), HasSubstr("ExitInEntry"));
+}
+
 TEST_F(CrashTest, APluginThatThrowsFailsAndIsNotBlocked)
 {
     for (const char* name : {"ThrowInEntry", "ThrowOnCreate"})

@@ -31,6 +31,8 @@ constexpr std::array<int, 6> kCrashSignals = {SIGSEGV, SIGBUS, SIGFPE, SIGILL, S
 constexpr int kDeepest = 4;
 
 std::array<Texts, kDeepest> sTexts;
+pid_t sProcess = 0; // whose end is told of: plug-ins make copies of it to start programs
+std::atomic<bool> sIsConcluding{false};
 std::atomic<int> sDepth{0};
 std::atomic<int> sEndCode{-1};
 std::string sCommand;
@@ -57,7 +59,7 @@ void WriteAll(int descriptor, std::string_view text)
     const int depth = sDepth.load();
     if (sEndCode.load() >= 0)
     {
-        _exit(sEndCode.load());
+        CrashGuard::End(sEndCode.load());
     }
     if (depth > 0)
     {
@@ -73,7 +75,7 @@ void WriteAll(int descriptor, std::string_view text)
     {
         unlink(sRemovedFile.c_str());
     }
-    _exit(static_cast<int>(ExitCode::Crashed));
+    CrashGuard::End(static_cast<int>(ExitCode::Crashed));
 }
 
 void OnSignal(int signal)
@@ -86,7 +88,7 @@ void OnExit()
 {
     if (sDepth.load() > 0)
     {
-        Conclude(false);
+        CrashGuard::NoteEnd();
     }
 }
 
@@ -94,6 +96,7 @@ void Install()
 {
     static const bool sInstalled = []
     {
+        sProcess = getpid();
         stack_t stack{};
         stack.ss_sp = sSignalStack.data();
         stack.ss_size = sSignalStack.size();
@@ -167,6 +170,21 @@ void CrashGuard::ExpectEnd(int code)
     constexpr unsigned int kLongestSeconds = 5;
     sEndCode.store(code);
     alarm(kLongestSeconds);
+}
+
+void CrashGuard::End(int code)
+{
+    sIsConcluding.store(true);
+    _exit(code);
+}
+
+void CrashGuard::NoteEnd()
+{
+    const bool isGuarded = sDepth.load() > 0 || sEndCode.load() >= 0;
+    if (isGuarded && getpid() == sProcess && !sIsConcluding.load())
+    {
+        Conclude(false);
+    }
 }
 
 void CrashGuard::RemoveOnCrash(const std::string& path)

@@ -27,6 +27,11 @@ public:
     // To be called when all is done and the process is about to end with `code`: what plug-ins do while they are
     // taken down, be it a crash or a hang, changes that no more.
     static void ExpectEnd(int code);
+    // Ends the process at once, with no word about a crash. [any]
+    [[noreturn]] static void End(int code);
+    // To be called when somebody ends the process without its last steps. Returns if nothing is guarded, or if it is
+    // not this process but a copy of it that a plug-in made. [any]
+    static void NoteEnd();
 
 private:
     int mPreviousDepth;

@@ -1,6 +1,7 @@
 #include "editor/EditorWindow.h"
 
 #include "cli/Failure.h"
+#include "filter/CrashGuard.h"
 
 #include <X11/Xlib.h>
 #include <X11/Xutil.h>
@@ -36,7 +37,7 @@ int EndWithoutServer(Display*)
 {
     constexpr std::string_view kMessage = "zebhost: the X server has gone, and the window with it: start it again\n";
     [[maybe_unused]] const ssize_t written = write(STDERR_FILENO, kMessage.data(), kMessage.size());
-    _exit(static_cast<int>(ExitCode::JobFailed));
+    CrashGuard::End(static_cast<int>(ExitCode::JobFailed));
 }
 
 Display* OpenDisplay()
