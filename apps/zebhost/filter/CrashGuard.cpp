@@ -56,6 +56,10 @@ void WriteAll(int descriptor, std::string_view text)
 // Tells what happened, cleans up and ends the process.
 [[noreturn]] void Conclude(bool timedOut)
 {
+    if (getpid() != sProcess)
+    {
+        _exit(static_cast<int>(ExitCode::Crashed));
+    }
     const int depth = sDepth.load();
     if (sEndCode.load() >= 0)
     {
