@@ -4,6 +4,7 @@
 #include "cli/ArgumentParser.h"
 #include "cli/Failure.h"
 #include "cli/HelpText.h"
+#include "cli/StartFolder.h"
 #include "commands/Commands.h"
 #include "filter/CrashGuard.h"
 #include "output/Tracing.h"
@@ -182,6 +183,7 @@ int main(int argc, char** argv)
     {
         zebhost::RunScanWorker(argc, argv);
     }
+    zebhost::startfolder::Remember();
     zebhost::Console console;
     zebhost::ExitCode code = zebhost::Guarded(argc, argv, console);
     if (!console.Flush() && code == zebhost::ExitCode::Done)

@@ -1,5 +1,5 @@
 # The same program with VST 2 plug-ins.
-add_executable(zebhost_vst2_test VST2Test.cpp support/Sound.cpp support/Zebhost.cpp)
+add_executable(zebhost_vst2_test VST2Test.cpp WorkingFolderTest.cpp support/Sound.cpp support/Zebhost.cpp)
 target_link_libraries(zebhost_vst2_test PRIVATE zebhost_parts zeb_options GTest::gtest_main GTest::gmock)
 target_include_directories(zebhost_vst2_test PRIVATE ${PROJECT_SOURCE_DIR})
 target_compile_definitions(zebhost_vst2_test PRIVATE ZEBHOST_PROGRAM="$<TARGET_FILE:zebhost>")

@@ -2,6 +2,7 @@
 
 #include "audio/ChannelNames.h"
 #include "cli/Failure.h"
+#include "cli/StartFolder.h"
 
 #include <algorithm>
 #include <array>
@@ -71,12 +72,13 @@ void NameSidesAsSurround(ChannelLayout& layout)
 
 AudioFileReader::AudioFileReader(const std::string& path) : mPath(path)
 {
+    const std::filesystem::path file = startfolder::Resolve(path);
     std::error_code error;
-    if (!std::filesystem::exists(path, error))
+    if (!std::filesystem::exists(file, error))
     {
         throw Failure(ExitCode::FileTrouble, path + ": there is no such file; check its spelling");
     }
-    mFile.reset(sf_open(path.c_str(), SFM_READ, &mInfo));
+    mFile.reset(sf_open(file.c_str(), SFM_READ, &mInfo));
     if (mFile == nullptr || mInfo.channels < 1 || mInfo.samplerate < 1)
     {
         throw Failure(ExitCode::FileTrouble, path + " cannot be read as a sound file (" + sf_strerror(nullptr) +

@@ -1,6 +1,7 @@
 #include "audio/OutputFile.h"
 
 #include "cli/Failure.h"
+#include "cli/StartFolder.h"
 #include "filter/CrashGuard.h"
 
 #include <cerrno>
@@ -29,16 +30,16 @@ mode_t UsualMode()
 
 } // namespace
 
-OutputFile::OutputFile(const std::string& path, bool overwrite) : mPath(path), mOverwrite(overwrite)
+OutputFile::OutputFile(const std::string& path, bool overwrite)
+    : mPath(path), mTarget(startfolder::Resolve(path)), mOverwrite(overwrite)
 {
     std::error_code error;
-    if (fs::is_directory(path, error))
+    if (fs::is_directory(mTarget, error))
     {
         throw Failure(ExitCode::FileTrouble, path + " is a folder: name a file in it, or use --out-dir");
     }
     RefuseExisting();
-    const fs::path target(path);
-    mTemporary = (target.parent_path() / ("." + target.filename().string().substr(0, 200) + ".XXXXXX")).string();
+    mTemporary = (mTarget.parent_path() / ("." + mTarget.filename().string().substr(0, 200) + ".XXXXXX")).string();
     mDescriptor = mkstemp(mTemporary.data());
     if (mDescriptor < 0)
     {
@@ -49,7 +50,7 @@ OutputFile::OutputFile(const std::string& path, bool overwrite) : mPath(path), m
     struct stat old
     {
     };
-    const bool replaces = stat(path.c_str(), &old) == 0;
+    const bool replaces = stat(mTarget.c_str(), &old) == 0;
     fchmod(mDescriptor, replaces ? old.st_mode & 07777 : UsualMode());
     CrashGuard::RemoveOnCrash(mTemporary);
 }
@@ -82,7 +83,7 @@ void OutputFile::Commit()
 void OutputFile::RefuseExisting() const
 {
     std::error_code error;
-    if (!mOverwrite && fs::exists(fs::symlink_status(mPath, error)))
+    if (!mOverwrite && fs::exists(fs::symlink_status(mTarget, error)))
     {
         throw Failure(ExitCode::FileTrouble, mPath + " exists: give --overwrite to replace it, or another name");
     }
@@ -90,7 +91,7 @@ void OutputFile::RefuseExisting() const
 
 void OutputFile::Rename() const
 {
-    if (std::rename(mTemporary.c_str(), mPath.c_str()) != 0)
+    if (std::rename(mTemporary.c_str(), mTarget.c_str()) != 0)
     {
         Refuse("could not be given its name");
     }

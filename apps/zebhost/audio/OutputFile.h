@@ -19,6 +19,7 @@ public:
 
     // Open for writing; stays this object's.
     int Descriptor() const { return mDescriptor; }
+    // As the user gave it.
     const std::string& Path() const { return mPath; }
 
     // Gives the file its name. Throws a Failure when that fails, or when another file has taken the name meanwhile.
@@ -30,6 +31,7 @@ private:
     void Rename() const;
 
     std::string mPath;
+    std::filesystem::path mTarget;
     std::string mTemporary;
     bool mOverwrite;
     int mDescriptor = -1;

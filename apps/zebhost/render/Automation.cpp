@@ -1,6 +1,7 @@
 #include "render/Automation.h"
 
 #include "cli/Failure.h"
+#include "cli/StartFolder.h"
 #include "filter/Parameters.h"
 #include "filter/ValueFinder.h"
 #include "output/Numbers.h"
@@ -72,7 +73,7 @@ AutomationEvent ParseLine(AudioFilter& filter, const std::string& line, int samp
 
 std::vector<AutomationEvent> ReadAutomation(const std::string& path, AudioFilter& filter, int sampleRate)
 {
-    std::ifstream stream(path, std::ios::binary);
+    std::ifstream stream(startfolder::Resolve(path), std::ios::binary);
     if (!stream)
     {
         throw Failure(ExitCode::FileTrouble, path + " cannot be read: check its spelling");

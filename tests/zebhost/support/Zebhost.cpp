@@ -131,6 +131,13 @@ RunResult ZebhostTest::Run(const std::vector<std::string>& arguments) const
     return RunProgram(words, mVariables, mFolder);
 }
 
+RunResult ZebhostTest::RunInFolder(const std::vector<std::string>& arguments) const
+{
+    std::vector<std::string> words = {"sh", "-c", R"(cd "$0" && exec "$@")", mFolder.string(), ZEBHOST_PROGRAM};
+    words.insert(words.end(), arguments.begin(), arguments.end());
+    return RunProgram(words, mVariables, mFolder);
+}
+
 RunResult ZebhostTest::Succeed(const std::vector<std::string>& arguments) const
 {
     RunResult result = Run(arguments);

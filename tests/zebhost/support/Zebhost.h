@@ -37,6 +37,8 @@ protected:
 
     // With --settings of this test in front.
     RunResult Run(const std::vector<std::string>& arguments) const;
+    // As a user does who stands in the test's folder.
+    RunResult RunInFolder(const std::vector<std::string>& arguments) const;
     // Runs it, and fails the test unless it succeeds.
     RunResult Succeed(const std::vector<std::string>& arguments) const;
     // Makes `folder` the standard plug-in folder.

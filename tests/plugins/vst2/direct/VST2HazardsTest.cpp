@@ -3,6 +3,7 @@
 #include "tests/plugins/vst2/direct/DirectVST2.h"
 
 #include <cstdlib>
+#include <filesystem>
 #include <gtest/gtest.h>
 #include <sys/time.h>
 #include <sys/wait.h>
@@ -16,12 +17,14 @@ using namespace zebaudiofilterhost::vst;
 
 constexpr int kSurvived = 42;
 constexpr int kThrew = 43;
+constexpr int kMoved = 44;
 
 // Ends itself after a while, should the plug-in not come back.
 [[noreturn]] void UsePlugin(const std::string& name)
 {
     const itimerval limit{{0, 0}, {0, 500000}};
     setitimer(ITIMER_REAL, &limit, nullptr);
+    const auto folder = std::filesystem::current_path();
     try
     {
         DirectVST2 plugin(VST2Hazard(name));
@@ -34,7 +37,7 @@ constexpr int kThrew = 43;
     {
         std::_Exit(kThrew);
     }
-    std::_Exit(kSurvived);
+    std::_Exit(std::filesystem::current_path() == folder ? kSurvived : kMoved);
 }
 
 int StatusAfterUsing(const std::string& name)
@@ -49,7 +52,7 @@ int StatusAfterUsing(const std::string& name)
 
 TEST(VST2Hazards, DoNotLetTheirProcessGoOn)
 {
-    for (const char* name : {"CrashOnLoad", "CrashInEntry", "CrashInOpen", "CrashInProcess"})
+    for (const char* name : {"CrashOnLoad", "CrashInEntry", "CrashInOpen", "CrashInProcess", "CrashElsewhere"})
     {
         const int status = StatusAfterUsing(name);
         EXPECT_FALSE(WIFEXITED(status) && WEXITSTATUS(status) == kSurvived) << name;
@@ -60,6 +63,7 @@ TEST(VST2Hazards, DoNotLetTheirProcessGoOn)
         EXPECT_TRUE(WIFSIGNALED(status) && WTERMSIG(status) == SIGALRM) << name;
     }
     EXPECT_EQ(WEXITSTATUS(StatusAfterUsing("ThrowInEntry")), kThrew);
+    EXPECT_EQ(WEXITSTATUS(StatusAfterUsing("ChangesFolder")), kMoved);
 }
 
 } // namespace
