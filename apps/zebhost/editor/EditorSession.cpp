@@ -38,7 +38,33 @@ boost::intrusive_ptr<AudioFilterEditor> CreateEditor(AudioFilter& filter, const 
     return editor;
 }
 
-// An editor while it is open in a window.
+// The view of an editor while it is in a window.
+class OpenView
+{
+public:
+    OpenView(AudioFilterEditor& editor, void* parent) : mEditor(editor) { mEditor.Open(parent); }
+
+    ~OpenView()
+    {
+        try
+        {
+            mEditor.Close();
+        }
+        catch (...)
+        {
+            // What it leaves in the window goes with it.
+        }
+    }
+
+    OpenView(const OpenView&) = delete;
+    OpenView& operator=(const OpenView&) = delete;
+
+private:
+    AudioFilterEditor& mEditor;
+};
+
+// An editor while it is open in a window. The filter keeps the editor, so whatever is thrown on the way, nothing here
+// may stay connected with it.
 class OpenEditor
 {
 public:
@@ -47,8 +73,8 @@ public:
         , mWindow(title, SideOr(mEditor->GetEditorRect().right, kUsualWidth),
                   SideOr(mEditor->GetEditorRect().bottom, kUsualHeight))
         , mSizeConnection(mEditor->GetContentSizeChangedSignal().connect([this] { FitWindow(); }))
+        , mView(*mEditor, mWindow.Parent())
     {
-        mEditor->Open(mWindow.Parent());
         FitWindow();
         mTimer = zebcore::threads::AddTimerWatch(kTickMs, [this] { Tick(); });
     }
@@ -57,7 +83,6 @@ public:
     {
         zebcore::threads::RemoveTimerWatch(mTimer);
         mSizeConnection.disconnect();
-        mEditor->Close();
     }
 
     OpenEditor(const OpenEditor&) = delete;
@@ -103,7 +128,8 @@ private:
 
     boost::intrusive_ptr<AudioFilterEditor> mEditor;
     EditorWindow mWindow;
-    boost::signals2::connection mSizeConnection;
+    boost::signals2::scoped_connection mSizeConnection;
+    OpenView mView;
     zebcore::threads::WatchID mTimer = zebcore::threads::kNoWatch;
     std::string mTrouble;
 };
