@@ -55,6 +55,13 @@ void ScheduleNextPump()
         loop.mPoller.Wake(std::chrono::nanoseconds(*untilNext));
 }
 
+void PumpInsideSystemLoop()
+{
+    Loop& loop = GetLoop();
+    loop.mQueue.RunDue();
+    loop.mWatches.RunTurns();
+}
+
 void AsyncCallFromMainThread(boost::function<void()> function, unsigned int delayMs)
 {
     GetLoop().mQueue.AddCall(std::move(function), delayMs * kNanosPerMilli);

@@ -73,4 +73,7 @@ WatchID NextWatchID();
 /// Tells the platform when the next queued call falls due. [any]
 void ScheduleNextPump();
 
+/// A pump for a platform whose own loop runs the main thread, called by that loop, which polls. [main]
+void PumpInsideSystemLoop();
+
 } // namespace zebcore::threads
