@@ -7,6 +7,7 @@
 #include "cli/StartFolder.h"
 #include "commands/Commands.h"
 #include "filter/CrashGuard.h"
+#include "filter/ThrowGuard.h"
 #include "output/Tracing.h"
 #include "scan/ScanWorker.h"
 
@@ -20,6 +21,7 @@
 #include <memory>
 #include <optional>
 #include <string_view>
+#include <utility>
 
 namespace zebhost
 {
@@ -136,7 +138,38 @@ ExitCode Report(const Failure& failure, const Arguments& arguments, bool json, C
     return failure.Code();
 }
 
-// What goes wrong in a library of ours is the job's failure, whatever it throws.
+// Tells of the plug-in through whose guard an exception came, if it came through one.
+Failure BlamedOr(const std::string& error, Failure otherwise)
+{
+    const std::string sentence = ThrowGuard::Sentence(error);
+    return sentence.empty() ? std::move(otherwise) : Failure(ExitCode::JobFailed, sentence);
+}
+
+// Of what is being handled and is no Failure: a plug-in's if it came through its guard, or else of a library of ours.
+Failure Unforeseen()
+{
+    try
+    {
+        throw;
+    }
+    catch (const std::filesystem::filesystem_error& error)
+    {
+        const std::string what = error.what();
+        return BlamedOr(what, Failure(ExitCode::FileTrouble, what + ": make it readable and writable"));
+    }
+    catch (const std::exception& error)
+    {
+        const std::string what = error.what();
+        return BlamedOr(what, Failure(ExitCode::JobFailed, "something unforeseen went wrong: " + what));
+    }
+    catch (...)
+    {
+        return BlamedOr({},
+                        Failure(ExitCode::JobFailed, "a plug-in threw something that tells nothing: ask its maker"));
+    }
+}
+
+// Whatever goes wrong ends with a sentence and a code.
 ExitCode Guarded(int argc, const char* const* argv, Console& console)
 {
     Arguments arguments;
@@ -156,20 +189,9 @@ ExitCode Guarded(int argc, const char* const* argv, Console& console)
     {
         return Report(failure, arguments, json, console);
     }
-    catch (const std::filesystem::filesystem_error& error)
-    {
-        return Report(Failure(ExitCode::FileTrouble, std::string(error.what()) + ": make it readable and writable"),
-                      arguments, json, console);
-    }
-    catch (const std::exception& error)
-    {
-        return Report(Failure(ExitCode::JobFailed, std::string("something unforeseen went wrong: ") + error.what()),
-                      arguments, json, console);
-    }
     catch (...)
     {
-        return Report(Failure(ExitCode::JobFailed, "a plug-in threw something that tells nothing: ask its maker"),
-                      arguments, json, console);
+        return Report(Unforeseen(), arguments, json, console);
     }
 }
 

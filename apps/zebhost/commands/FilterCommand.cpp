@@ -11,9 +11,10 @@ namespace zebhost
 
 FilterOfCommand::FilterOfCommand(const CommandContext& context, unsigned int settleMs)
     : mDescriptor(FilterSelector(context.catalogue).Select(context.arguments.Text("FILTER")))
-    , mGuard(PlaceOf(mDescriptor->GetLocator()), "its maker should know; 'zebhost block " +
-                                                     SelectorWord(mDescriptor->GetLocator()) +
-                                                     "' keeps it from being used")
+    , mAdvice("its maker should know; 'zebhost block " + SelectorWord(mDescriptor->GetLocator()) +
+              "' keeps it from being used")
+    , mCrashGuard(PlaceOf(mDescriptor->GetLocator()), mAdvice)
+    , mThrowGuard(PlaceOf(mDescriptor->GetLocator()), "try other settings; " + mAdvice)
     , mFilter(LoadFilter(mDescriptor, settleMs))
 {
 }

@@ -3,12 +3,13 @@
 #include "commands/CommandContext.h"
 #include "filter/CrashGuard.h"
 #include "filter/LoadFilter.h"
+#include "filter/ThrowGuard.h"
 
 namespace zebhost
 {
 
-// The filter that the FILTER operand of a command means, loaded. While one lives, a crash is taken for that of its
-// plug-in.
+// The filter that the FILTER operand of a command means, loaded. While one lives, a crash or an exception is taken
+// for that of its plug-in.
 class FilterOfCommand
 {
 public:
@@ -22,7 +23,9 @@ public:
 
 private:
     Catalogue::Descriptor mDescriptor;
-    CrashGuard mGuard;
+    std::string mAdvice;
+    CrashGuard mCrashGuard;
+    ThrowGuard mThrowGuard;
     FilterPointer mFilter;
 };
 

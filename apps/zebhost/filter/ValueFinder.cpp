@@ -16,6 +16,7 @@ namespace zebhost
 namespace
 {
 
+constexpr const char* kNormalised = "a normalised value does it: --norm NAME=0.5, or norm:0.5 in an automation file";
 constexpr int kMostSteps = 65536; // a count that lies must not take for ever
 
 bool IsNumber(const Quantity& shown, const Quantity& wanted)
@@ -51,9 +52,16 @@ ValueFinder::ValueFinder(zebaudiofilterhost::AudioFilter& filter, int index,
 
 ValueFinder::~ValueFinder()
 {
-    if (mValueBefore)
+    try
     {
-        mFilter->SetParameter(mIndex, *mValueBefore);
+        if (mValueBefore)
+        {
+            mFilter->SetParameter(mIndex, *mValueBefore);
+        }
+    }
+    catch (...)
+    {
+        // The plug-in took the value a moment ago. Whatever uses the parameter next hears of it.
     }
 }
 
@@ -196,7 +204,7 @@ ValueFinder::Found ValueFinder::FindContinuous(const std::string& wanted) const
                 return {value, Shown(value), true};
             }
         }
-        Refuse(wanted, "it goes from " + Shown(0) + " to " + Shown(1) + "; --norm takes a value from 0 to 1");
+        Refuse(wanted, "it goes from " + Shown(0) + " to " + Shown(1) + "; " + kNormalised);
     }
     const std::optional<Quantity> typed = ParseQuantity(wanted, {});
     const float direct = mInfo.ToNormalized(static_cast<float>(typed->value));
@@ -208,7 +216,7 @@ ValueFinder::Found ValueFinder::FindContinuous(const std::string& wanted) const
     const NumericRange range([this](double value) { return ParseQuantity(Text(static_cast<float>(value)), mUnit); });
     if (!range.IsMonotone())
     {
-        Refuse(wanted, "what it displays cannot be searched for that; --norm takes a value from 0 to 1");
+        Refuse(wanted, std::string("what it displays cannot be searched for that; ") + kNormalised);
     }
     const auto located = static_cast<float>(range.Locate(number->value));
     const std::optional<Quantity> shown = ParseQuantity(Text(located), mUnit);
