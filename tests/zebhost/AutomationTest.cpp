@@ -66,6 +66,18 @@ TEST_F(AutomationTest, ManyChangesAtOneSampleAllCount)
     EXPECT_EQ(output.channels[0][100], 0);
 }
 
+TEST_F(AutomationTest, AHeadingMayStandBehindAByteOrderMarkAndRemarks)
+{
+    for (const char* start : {"\xEF\xBB\xBF", "# made by hand\n\n", "\xEF\xBB\xBF# made by a program\r\n", ""})
+    {
+        const RunResult result = Render(std::string(start) + "time,parameter,value\r\n0,Gain,-inf\r\n");
+        EXPECT_EQ(result.code, 0) << start << result.err;
+        EXPECT_TRUE(ReadSound(Path("out.wav")).channels[0] == std::vector<int>(kFrames, 0)) << start;
+        const RunResult twice = Render(std::string(start) + "time,parameter,value\ntime,parameter,value\n");
+        EXPECT_EQ(twice.code, 2) << start;
+    }
+}
+
 TEST_F(AutomationTest, AWrongLineIsNamed)
 {
     for (const char* line :
@@ -75,6 +87,7 @@ TEST_F(AutomationTest, AWrongLineIsNamed)
         EXPECT_EQ(result.code, 2) << line << result.err;
         EXPECT_THAT(result.LastLine(), HasSubstr("moves.csv, line 2: ")) << line;
     }
+    EXPECT_THAT(Render("0,Gain,loud").LastLine(), HasSubstr("norm:0.5"));
 }
 
 } // namespace

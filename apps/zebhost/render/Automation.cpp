@@ -12,6 +12,7 @@
 #include <cmath>
 #include <fstream>
 #include <optional>
+#include <utility>
 
 namespace zebhost
 {
@@ -21,10 +22,34 @@ using zebaudiofilterhost::AudioFilter;
 namespace
 {
 
-bool IsPassedOver(const std::string& line, int number)
+// The lines that count, with their numbers, from 1. Throws a Failure if the file cannot be read.
+std::vector<std::pair<int, std::string>> ReadLines(const std::string& path)
 {
-    const std::string_view text = Trimmed(line);
-    return text.empty() || text.front() == '#' || (number == 1 && StartsWithIgnoringCase(text, "time"));
+    constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
+    std::ifstream stream(startfolder::Resolve(path), std::ios::binary);
+    std::vector<std::pair<int, std::string>> lines;
+    std::string line;
+    bool isHeading = true; // what the first of them may be
+    for (int number = 1; std::getline(stream, line); ++number)
+    {
+        line.erase(0, number == 1 && line.starts_with(kByteOrderMark) ? kByteOrderMark.size() : 0);
+        const std::string_view text = Trimmed(line);
+        if (text.empty() || text.front() == '#')
+        {
+            continue;
+        }
+        if (!isHeading || !StartsWithIgnoringCase(text, "time"))
+        {
+            lines.emplace_back(number, line);
+        }
+        isHeading = false;
+    }
+    // A folder opens like a file, and fails when it is read.
+    if (!stream.is_open() || stream.bad())
+    {
+        throw Failure(ExitCode::FileTrouble, path + " cannot be read: check its spelling, and that it is a file");
+    }
+    return lines;
 }
 
 std::int64_t FrameOf(const std::string& text, int sampleRate)
@@ -73,19 +98,9 @@ AutomationEvent ParseLine(AudioFilter& filter, const std::string& line, int samp
 
 std::vector<AutomationEvent> ReadAutomation(const std::string& path, AudioFilter& filter, int sampleRate)
 {
-    std::ifstream stream(startfolder::Resolve(path), std::ios::binary);
-    if (!stream)
-    {
-        throw Failure(ExitCode::FileTrouble, path + " cannot be read: check its spelling");
-    }
     std::vector<AutomationEvent> events;
-    std::string line;
-    for (int number = 1; std::getline(stream, line); ++number)
+    for (const auto& [number, line] : ReadLines(path))
     {
-        if (IsPassedOver(line, number))
-        {
-            continue;
-        }
         try
         {
             events.push_back(ParseLine(filter, line, sampleRate));
