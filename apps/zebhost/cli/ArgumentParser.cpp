@@ -103,12 +103,13 @@ std::string ParsedCommandName(const CLI::App& root)
 }
 
 // No command has a use for an empty text: it is what a variable without a value leaves behind in a script.
-void CheckNotEmpty(const std::string& what, std::string_view name, const Arguments& arguments)
+void CheckNotEmpty(const std::string& what, std::string_view name, const std::string& advice,
+                   const Arguments& arguments)
 {
     const std::vector<std::string> given = arguments.All(name);
     if (std::find(given.begin(), given.end(), "") != given.end())
     {
-        RefuseUsage(what + " is empty: give something, or leave it out", arguments.command);
+        RefuseUsage(what + " is empty: give " + advice, arguments.command);
     }
 }
 
@@ -118,7 +119,7 @@ void CheckOptions(const std::vector<OptionSpec>& options, const Arguments& argum
     {
         const std::string dashed = "--" + std::string(option.name);
         const std::vector<std::string> given = arguments.All(option.name);
-        CheckNotEmpty(dashed, option.name, arguments);
+        CheckNotEmpty(dashed, option.name, std::string(option.placeholder) + ", or leave it out", arguments);
         if (option.values == Values::None &&
             std::any_of(given.begin(), given.end(), [](const std::string& value) { return value != "true"; }))
         {
@@ -172,7 +173,7 @@ void CheckOperands(const CommandSpec& row, const Arguments& arguments)
             RefuseUsage(std::string(operand.name) + " is missing: give " + std::string(operand.help),
                         arguments.command);
         }
-        CheckNotEmpty(std::string(operand.name), operand.name, arguments);
+        CheckNotEmpty(std::string(operand.name), operand.name, std::string(operand.help), arguments);
     }
 }
 
