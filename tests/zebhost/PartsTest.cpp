@@ -1,4 +1,6 @@
 #include "audio/ChannelNames.h"
+#include "audio/SampleFormat.h"
+#include "audio/SoundFile.h"
 #include "catalogue/FileNames.h"
 #include "cli/Failure.h"
 #include "filter/DenormalGuard.h"
@@ -10,7 +12,10 @@
 
 #include <gmock/gmock.h>
 
+#include <filesystem>
 #include <limits>
+
+#include <unistd.h>
 
 namespace zebhost
 {
@@ -66,6 +71,62 @@ TEST(SeparatedLineTest, TabsWinOverCommasAndQuotesHoldBoth)
     EXPECT_THAT(SplitSeparatedLine("0.5\tGain, left\t1,5"), ElementsAre("0.5", "Gain, left", "1,5"));
     EXPECT_THAT(SplitSeparatedLine("1,\"Say \"\"hi\"\", you\",3"), ElementsAre("1", "Say \"hi\", you", "3"));
     EXPECT_THAT(SplitSeparatedLine("a,,\r"), ElementsAre("a", "", ""));
+}
+
+// sf_format_check says yes to some kinds of file that libsndfile then refuses.
+TEST(SampleFormatTest, WhateverIsReadGoesIntoEveryKindOfFile)
+{
+    const std::vector<int> inputs = {
+        SF_FORMAT_WAV | SF_FORMAT_PCM_U8,         SF_FORMAT_WAV | SF_FORMAT_ULAW,
+        SF_FORMAT_WAV | SF_FORMAT_IMA_ADPCM,      SF_FORMAT_WAV | SF_FORMAT_DOUBLE,
+        SF_FORMAT_AIFF | SF_FORMAT_DWVW_12,       SF_FORMAT_CAF | SF_FORMAT_ALAC_24,
+        SF_FORMAT_FLAC | SF_FORMAT_PCM_S8,        SF_FORMAT_OGG | SF_FORMAT_VORBIS,
+        SF_FORMAT_OGG | SF_FORMAT_OPUS,           SF_FORMAT_MPEG | SF_FORMAT_MPEG_LAYER_I,
+        SF_FORMAT_MPEG | SF_FORMAT_MPEG_LAYER_II, SF_FORMAT_MPEG | SF_FORMAT_MPEG_LAYER_III};
+    const std::string name = testing::TempDir() + "zebhost-format-" + std::to_string(getpid());
+    for (const int input : inputs)
+    {
+        for (const char* kind :
+             {".wav", ".w64", ".rf64", ".flac", ".aiff", ".au", ".caf", ".ogg", ".opus", ".mp3", ".raw", ".voc"})
+        {
+            SF_INFO info{};
+            info.channels = 2;
+            info.samplerate = 48000;
+            info.format =
+                ChooseFormat(SampleFormatOf(input), "in", name + kind, {}, info.channels, info.samplerate, 0).Code();
+            const SoundFile file(sf_open(name.c_str(), SFM_WRITE, &info));
+            const std::vector<float> sound(9600, 0.25F);
+            EXPECT_EQ(sf_writef_float(file.get(), sound.data(), 4800), 4800) << std::hex << input << kind;
+        }
+    }
+    std::filesystem::remove(name);
+    EXPECT_THROW(ChooseFormat(SampleFormatOf(inputs.front()), "in", "out.opus", {}, 2, 44100, 0), Failure);
+    EXPECT_THROW(ChooseFormat(SampleFormatOf(inputs.front()), "in", "out.mp3", {}, 2, 96000, 0), Failure);
+}
+
+TEST(SampleFormatTest, FilesOfFourGibibytesAreNotLeftToShortSizes)
+{
+    constexpr std::int64_t kSize = std::int64_t{1} << 32;
+    for (const auto& [coding, bytes] : {std::pair(SF_FORMAT_PCM_16, 2), std::pair(SF_FORMAT_PCM_24, 3),
+                                        std::pair(SF_FORMAT_FLOAT, 4), std::pair(SF_FORMAT_DOUBLE, 8)})
+    {
+        for (const int channels : {1, 2, 16})
+        {
+            const auto chosen = [&, code = coding](const char* output, std::int64_t frames)
+            {
+                return ChooseFormat({SF_FORMAT_WAV, code}, "in.x", output, {}, channels, 48000, frames).container;
+            };
+            const std::int64_t frames = kSize / bytes / channels;
+            EXPECT_EQ(chosen("out.wav", frames), SF_FORMAT_RF64);
+            EXPECT_NE(chosen("out.wav", frames - frames / 1000), SF_FORMAT_RF64);
+            EXPECT_EQ(chosen("out.w64", frames), SF_FORMAT_W64);
+            const SampleFormat aiff = {SF_FORMAT_AIFF, coding};
+            EXPECT_LT(aiff.MostFrames(channels), frames);
+            EXPECT_GT(aiff.MostFrames(channels), frames - frames / 1000);
+        }
+    }
+    EXPECT_EQ(ParseTail("3600").LongestSeconds(), 3600);
+    EXPECT_EQ(ParseTail("-90dB").LongestSeconds(), ParseTail("auto").LongestSeconds());
 }
 
 TEST(TailTest, IsAutoSecondsOrALevel)

@@ -1,5 +1,6 @@
 #include "audio/OutputFile.h"
 
+#include "catalogue/WantOfRoom.h"
 #include "cli/Failure.h"
 #include "cli/StartFolder.h"
 #include "filter/CrashGuard.h"
@@ -100,7 +101,8 @@ void OutputFile::Rename() const
 void OutputFile::Refuse(const std::string& action) const
 {
     throw Failure(ExitCode::FileTrouble,
-                  mPath + " " + action + " (" + std::strerror(errno) + "): choose a folder that can be written to");
+                  mPath + " " + action + " (" + std::strerror(errno) + "): " +
+                      (IsWantOfRoom(errno) ? "make room on the disk" : "choose a folder that can be written to"));
 }
 
 } // namespace zebhost

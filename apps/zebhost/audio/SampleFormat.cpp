@@ -1,5 +1,6 @@
 #include "audio/SampleFormat.h"
 
+#include "audio/WritingTrial.h"
 #include "cli/Failure.h"
 #include "output/Strings.h"
 
@@ -74,7 +75,7 @@ bool CanWrite(const SampleFormat& format, int channels, int sampleRate)
     info.channels = channels;
     info.samplerate = sampleRate;
     info.format = format.Code();
-    return sf_format_check(&info) == SF_TRUE;
+    return IsWritable(info);
 }
 
 // From the closest to the least.
@@ -115,13 +116,11 @@ std::vector<int> CodingsFor(const SampleFormat& input, const std::string& output
 // A plain WAV has no place for speaker positions, and ends at 4 GiB.
 int FittingWav(const SampleFormat& format, int channels, std::int64_t frames)
 {
-    constexpr std::int64_t kMostBytes = 0xFFF00000;
     if (!IsWav(format.container))
     {
         return format.container;
     }
-    const std::int64_t bytes = format.IntegerBits() > 0 ? format.IntegerBits() / 8 : 8;
-    if (frames > kMostBytes / (bytes * std::max(channels, 1)))
+    if (frames > format.MostFrames(channels))
     {
         return SF_FORMAT_RF64;
     }
@@ -158,6 +157,16 @@ bool SampleFormat::FitsFloat() const
     return IntegerBits() != 32 && coding != SF_FORMAT_DOUBLE;
 }
 
+std::int64_t SampleFormat::MostFrames(int channels) const
+{
+    constexpr std::int64_t kMostBytes = 0xFFF00000; // leaves room for all that stands around the samples
+    const bool hasShortSizes = container == SF_FORMAT_WAV || container == SF_FORMAT_WAVEX ||
+                               container == SF_FORMAT_AIFF || container == SF_FORMAT_SVX;
+    const int most = coding == SF_FORMAT_DOUBLE ? 8 : 4;
+    const std::int64_t bytes = IntegerBits() > 0 ? IntegerBits() / 8 : most;
+    return hasShortSizes ? kMostBytes / (bytes * std::max(channels, 1)) : SF_COUNT_MAX;
+}
+
 std::string SampleFormat::CodingName() const
 {
     if (IntegerBits() > 0)
@@ -192,6 +201,11 @@ SampleFormat ChooseFormat(const SampleFormat& input, const std::string& inputPat
                                        " at " + std::to_string(sampleRate) + " Hz" +
                                        (wanted.empty() ? "" : " with --format " + wanted) +
                                        " cannot be written to a file of this kind; .wav takes nearly everything");
+}
+
+bool HasFloats(const SampleFormat& format, int channels, int sampleRate)
+{
+    return CanWrite({format.container, SF_FORMAT_FLOAT}, channels, sampleRate);
 }
 
 } // namespace zebhost

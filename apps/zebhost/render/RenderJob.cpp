@@ -19,7 +19,6 @@ namespace
 {
 
 constexpr unsigned int kEndlessTail = 0xFFFFFFFF;
-constexpr double kLongestTail = 60;   // seconds, when a level or the plug-in ends the tail
 constexpr double kQuietTime = 0.5;    // seconds below the level that end the tail
 constexpr double kEndlessLevel = -90; // decibels, for a plug-in that calls its tail endless
 
@@ -118,7 +117,7 @@ void RenderJob::RenderTail()
         RenderLevelTail(kEndlessLevel);
         return;
     }
-    const std::int64_t longest = FramesOf(kLongestTail, rate);
+    const std::int64_t longest = FramesOf(mOptions.tail.LongestSeconds(), rate);
     mResult.tailWasCut = told > longest;
     RenderSilence(std::min<std::int64_t>(told, longest));
 }
@@ -126,7 +125,7 @@ void RenderJob::RenderTail()
 void RenderJob::RenderLevelTail(double decibels)
 {
     const int rate = mFiles.input.SampleRate();
-    const std::int64_t end = mPosition + FramesOf(kLongestTail, rate);
+    const std::int64_t end = mPosition + FramesOf(mOptions.tail.LongestSeconds(), rate);
     const std::int64_t quiet = FramesOf(kQuietTime, rate);
     mSink.HoldBelow(static_cast<float>(std::pow(10.0, decibels / 20)));
     while (mSink.HeldFrames() < quiet && mPosition < end)

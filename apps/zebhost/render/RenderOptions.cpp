@@ -22,6 +22,12 @@ std::string_view WithoutEnding(std::string_view text, std::string_view ending)
 
 } // namespace
 
+double TailLength::LongestSeconds() const
+{
+    constexpr double kLongest = 60; // when a level or the plug-in ends it
+    return kind == Kind::Seconds ? seconds : kLongest;
+}
+
 TailLength ParseTail(const std::string& text)
 {
     constexpr double kLongest = 3600;

@@ -21,6 +21,9 @@ struct TailLength
     Kind kind = Kind::Auto;
     double seconds = 0;
     double decibels = -90;
+
+    // How long it can become.
+    double LongestSeconds() const;
 };
 
 // Throws a usage Failure for anything but "auto", seconds and decibels below zero.

@@ -8,7 +8,6 @@ namespace zebhost
 RunningFilter::RunningFilter(zebaudiofilterhost::AudioFilter& filter, int sampleRate, unsigned int settleMs)
     : mFilter(filter)
 {
-    constexpr int kLongestSeconds = 60;
     mFilter.Resume();
     Settle(settleMs);
     AgreeOnLatency();

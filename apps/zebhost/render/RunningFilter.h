@@ -15,8 +15,10 @@ public:
     RunningFilter(const RunningFilter&) = delete;
     RunningFilter& operator=(const RunningFilter&) = delete;
 
-    // In frames: the one that the filter's delay line is made for. A latency that nobody can mean counts as 0, as it
-    // does there.
+    static constexpr int kLongestSeconds = 60;
+
+    // In frames, for at most kLongestSeconds: the one that the filter's delay line is made for. A latency that nobody
+    // can mean counts as 0, as it does there.
     int Latency() const { return mLatency; }
 
 private:
