@@ -4,6 +4,7 @@
 
 #include <array>
 #include <cmath>
+#include <limits>
 
 namespace zebtest
 {
@@ -191,6 +192,62 @@ TEST_F(RenderTest, ClippingIsToldOf)
     EXPECT_GT(result.Json().at("files").at(0).at("clippedSamples"), 0);
     EXPECT_THAT(Render("ZebGain", {"--set", "Gain=24", "--format", "float", "--overwrite"}).err,
                 Not(HasSubstr("clipped")));
+    // What is advised has to be possible.
+    EXPECT_THAT(result.err, HasSubstr("give --format float"));
+    EXPECT_THAT(Render("ZebGain", {"--set", "Gain=24"}, "out.flac").err,
+                HasSubstr("write a .wav with --format float"));
+}
+
+TEST_F(RenderTest, SamplesThatAreNoNumbersAreLaidToTheFileThatHasThem)
+{
+    const float nan = std::numeric_limits<float>::quiet_NaN();
+    WriteFloats(Path("in.wav"), {nan, 0.5F, std::numeric_limits<float>::infinity(), 0.25F});
+    const RunResult result = Render("ZebGain", {"--json"});
+    EXPECT_EQ(result.code, 0);
+    EXPECT_THAT(result.err, testing::AllOf(HasSubstr("in.wav has 2 samples that are no numbers"),
+                                           Not(HasSubstr("Zeb Gain gave"))));
+    EXPECT_EQ(result.Json().at("files").at(0).at("brokenSamplesIn"), 2);
+    EXPECT_EQ(ReadSound(Path("out.wav")).floats[0], (std::vector<float>{0, 0.5F, 0, 0.25F}));
+}
+
+TEST_F(RenderTest, ADamagedInputIsNotTakenForAShortOne)
+{
+    const std::array<std::pair<const char*, int>, 2> kinds = {
+        {{"cut.flac", SF_FORMAT_FLAC | SF_FORMAT_PCM_16}, {"cut.mp3", SF_FORMAT_MPEG | SF_FORMAT_MPEG_LAYER_III}}};
+    const std::string compressor = EffectBundle("ZebCompressor").string();
+    for (const auto& [name, format] : kinds)
+    {
+        WriteSound(Path(name), MakeNoise(2, 48000, format));
+        fs::resize_file(Path(name), fs::file_size(Path(name)) * 6 / 10);
+        WriteSound(Path("long.wav"), MakeNoise(2, 48000));
+        for (const std::vector<std::string>& files :
+             {std::vector<std::string>{Path(name), Path("out.wav")},
+              std::vector<std::string>{Path("long.wav"), Path("out.wav"), "--side-chain", Path(name)}})
+        {
+            std::vector<std::string> line = {"render", compressor};
+            line.insert(line.end(), files.begin(), files.end());
+            const RunResult result = Run(line);
+            EXPECT_EQ(result.code, 7) << result.err;
+            EXPECT_THAT(result.LastLine(), HasSubstr(std::string(name) + " is damaged or cut off"));
+            EXPECT_FALSE(fs::exists(Path("out.wav")));
+        }
+        fs::remove(Path(name));
+    }
+    for (const int format :
+         {SF_FORMAT_WAV | SF_FORMAT_PCM_16, SF_FORMAT_AIFF | SF_FORMAT_PCM_24, SF_FORMAT_W64 | SF_FORMAT_FLOAT,
+          SF_FORMAT_RF64 | SF_FORMAT_PCM_U8, SF_FORMAT_OGG | SF_FORMAT_OPUS})
+    {
+        WriteSound(Path("cut"), MakeNoise(2, 48000, format));
+        const auto render = [this, &compressor]
+        {
+            return Run({"render", compressor, Path("cut"), Path("out.wav"), "--overwrite"});
+        };
+        EXPECT_THAT(render().err, Not(HasSubstr("cut off"))) << format;
+        fs::resize_file(Path("cut"), fs::file_size(Path("cut")) / 2);
+        const RunResult result = render();
+        EXPECT_EQ(result.code, 0) << result.err;
+        EXPECT_THAT(result.err, HasSubstr("cut seems to be cut off")) << format;
+    }
 }
 
 TEST_F(RenderTest, NoFileIsReplacedUnlessItMayBe)
@@ -222,6 +279,8 @@ TEST_F(RenderTest, FileTroubleNamesTheFileAndLeavesNothingBehind)
         {{"render", gain, Path("in.wav"), Path("folder")}, "folder"},
         {{"render", gain, Path("in.wav"), Path("no/such/folder/out.wav")}, "out.wav"},
         {{"render", gain, Path("in.wav"), Path("out.wav"), "--automation", Path("none.csv")}, "none.csv"},
+        {{"render", gain, Path("in.wav"), Path("out.wav"), "--automation", Path("folder")}, "folder"},
+        {{"render", gain, Path("folder"), Path("out.wav")}, "folder is a folder"},
     };
     for (const auto& [line, file] : cases)
     {
@@ -293,6 +352,9 @@ TEST_F(RenderTest, APluginThatThrowsOrFailsInProcessDoesNotEndTheJob)
             {"render", FixtureBundle(name).string(), Path("in.wav"), Path("out.wav"), "--overwrite", "--tail", "0"});
         EXPECT_EQ(result.code, 0) << name << result.err;
         EXPECT_EQ(ReadSound(Path("out.wav")).Frames(), kFrames) << name;
+        const bool isTold = result.err.find("the whole output is silent") != std::string::npos;
+        EXPECT_EQ(isTold, ReadSound(Path("out.wav")).channels[0] == std::vector<int>(kFrames, 0)) << name;
+        EXPECT_TRUE(isTold || name != std::string("ProcessThrows"));
     }
 }
 

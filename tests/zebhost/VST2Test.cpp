@@ -232,6 +232,27 @@ TEST_F(VST2Test, OddPluginsRenderWithoutHarm)
     }
 }
 
+TEST_F(VST2Test, APluginThatThrowsIsNamedAndSoIsOneThatGivesNothing)
+{
+    const std::string thrower = VST2Fixture("ThrowsInParameters").string();
+    const std::vector<std::vector<std::string>> lines = {
+        {"params", thrower, "--norm", "#1=0.25"},
+        {"render", thrower, Path("in.wav"), Path("out.wav"), "--norm", "#1=0.25"},
+        {"render", thrower, Path("in.wav"), Path("out.wav"), "--set", "#1=0.25"}};
+    for (const std::vector<std::string>& line : lines)
+    {
+        const RunResult result = Run(line);
+        EXPECT_EQ(result.code, 1) << result.err;
+        EXPECT_THAT(result.LastLine(),
+                    testing::AllOf(HasSubstr(thrower + " threw an exception, \""), HasSubstr("zebhost block")));
+        EXPECT_EQ(Files(), std::vector<std::string>{"in.wav"});
+    }
+    const RunResult silent =
+        Succeed({"render", VST2Fixture("ThrowsInProcess").string(), Path("in.wav"), Path("out.wav"), "--json"});
+    EXPECT_THAT(silent.err, HasSubstr("the whole output is silent"));
+    EXPECT_EQ(silent.Json().at("files").at(0).at("silenced"), true);
+}
+
 TEST_F(VST2Test, ACrashInARenderLeavesNoFile)
 {
     const RunResult result = Run({"render", VST2Hazard("CrashInProcess").string(), Path("in.wav"), Path("out.wav")});

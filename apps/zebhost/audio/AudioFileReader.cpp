@@ -68,6 +68,20 @@ void NameSidesAsSurround(ChannelLayout& layout)
                  AudioChannelDescription(kAudioChannelLabel_RightSurround));
 }
 
+std::string AdviceForUnreadable()
+{
+    switch (sf_error(nullptr))
+    {
+    case SF_ERR_SYSTEM:
+        return "see that it is a file, and that you may read it";
+    case SF_ERR_UNRECOGNISED_FORMAT:
+    case SF_ERR_UNSUPPORTED_ENCODING:
+        return "convert it to WAV or FLAC";
+    default:
+        return "it may be damaged; get a whole copy of it, or convert it to WAV or FLAC";
+    }
+}
+
 } // namespace
 
 AudioFileReader::AudioFileReader(const std::string& path) : mPath(path)
@@ -78,14 +92,25 @@ AudioFileReader::AudioFileReader(const std::string& path) : mPath(path)
     {
         throw Failure(ExitCode::FileTrouble, path + ": there is no such file; check its spelling");
     }
+    if (std::filesystem::is_directory(file, error))
+    {
+        throw Failure(ExitCode::FileTrouble, path + " is a folder: name a sound file in it");
+    }
     mFile.reset(sf_open(file.c_str(), SFM_READ, &mInfo));
     if (mFile == nullptr || mInfo.channels < 1 || mInfo.samplerate < 1)
     {
-        throw Failure(ExitCode::FileTrouble, path + " cannot be read as a sound file (" + sf_strerror(nullptr) +
-                                                 "): convert it to WAV or FLAC");
+        throw Failure(ExitCode::FileTrouble, path + " cannot be read as a sound file (" + SoundFileError(nullptr) +
+                                                 "): " + AdviceForUnreadable());
     }
     ReadLayout();
     ReadTexts();
+}
+
+// The last page of an Ogg file tells its length.
+bool AudioFileReader::MayBeCutOff() const
+{
+    const bool hasNoLastPage = Format().container == SF_FORMAT_OGG && !KnowsFrames();
+    return mInfo.seekable == SF_TRUE && (hasNoLastPage || HeadTellsMore(mFile.get()));
 }
 
 void AudioFileReader::ReadLayout()
@@ -123,7 +148,13 @@ int AudioFileReader::Read(float* const* channels, int frames)
 {
     const auto rows = static_cast<std::size_t>(mInfo.channels);
     mInterleaved.assign(rows * static_cast<std::size_t>(frames), 0.0F);
-    const sf_count_t got = ReadInterleaved(frames);
+    const sf_count_t got = std::max<sf_count_t>(ReadInterleaved(frames), 0);
+    mFramesRead += got;
+    if (got < frames)
+    {
+        CheckEnd();
+    }
+    mMeter.Take(mInterleaved);
     for (std::size_t row = 0; row < rows; ++row)
     {
         for (std::size_t frame = 0; frame < static_cast<std::size_t>(frames); ++frame)
@@ -131,7 +162,22 @@ int AudioFileReader::Read(float* const* channels, int frames)
             channels[row][frame] = mInterleaved[frame * rows + row];
         }
     }
-    return static_cast<int>(std::max<sf_count_t>(got, 0));
+    return static_cast<int>(got);
+}
+
+// libsndfile gives what it can read of a damaged file, and may call that no error.
+void AudioFileReader::CheckEnd() const
+{
+    const std::string error = SoundFileError(mFile.get());
+    const bool isShort = KnowsFrames() ? mFramesRead < Frames() : Frames() == SF_COUNT_MAX && mFramesRead == 0;
+    if (error.empty() && !isShort)
+    {
+        return;
+    }
+    throw Failure(ExitCode::FileTrouble, mPath + " is damaged or cut off: only " + std::to_string(mFramesRead) +
+                                             (KnowsFrames() ? " of its " + std::to_string(Frames()) : "") +
+                                             " frames can be read" + (error.empty() ? "" : " (" + error + ")") +
+                                             "; get a whole copy of it, or convert what there is to WAV");
 }
 
 // libsndfile's own way from integers to floats and back does not give the same integers again.

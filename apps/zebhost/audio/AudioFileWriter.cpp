@@ -11,6 +11,10 @@ namespace zebhost
 AudioFileWriter::AudioFileWriter(OutputFile& output, const SampleFormat& format, const AudioFileReader& like)
     : mOutput(output), mFormat(format), mChannels(like.Channels())
 {
+    if (like.KnowsFrames())
+    {
+        CheckLength(like.Frames());
+    }
     SF_INFO info{};
     info.channels = mChannels;
     info.samplerate = like.SampleRate();
@@ -18,10 +22,19 @@ AudioFileWriter::AudioFileWriter(OutputFile& output, const SampleFormat& format,
     mFile.reset(sf_open_fd(mOutput.Descriptor(), SFM_WRITE, &info, SF_FALSE));
     if (mFile == nullptr)
     {
-        throw Failure(ExitCode::FileTrouble, mOutput.Path() + " cannot be written (" + sf_strerror(nullptr) +
-                                                 "): choose another kind of file, such as .wav");
+        throw Failure(ExitCode::FileTrouble, mOutput.Path() + " cannot be written (" + SoundFileError(nullptr) +
+                                                 "): make room on the disk, or choose another folder");
     }
     CopyHead(like);
+}
+
+void AudioFileWriter::CheckLength(std::int64_t frames) const
+{
+    if (frames > mFormat.MostFrames(mChannels))
+    {
+        throw Failure(ExitCode::FileTrouble,
+                      mOutput.Path() + " would be longer than its kind of file can be: choose .wav, .caf or .w64");
+    }
 }
 
 void AudioFileWriter::CopyHead(const AudioFileReader& like)
@@ -40,6 +53,7 @@ void AudioFileWriter::CopyHead(const AudioFileReader& like)
 
 void AudioFileWriter::Write(const float* const* channels, int firstFrame, int frames)
 {
+    CheckLength(mFrames + frames);
     const auto rows = static_cast<std::size_t>(mChannels);
     const auto count = static_cast<std::size_t>(frames);
     mInterleaved.resize(rows * count);
@@ -50,7 +64,7 @@ void AudioFileWriter::Write(const float* const* channels, int firstFrame, int fr
             mInterleaved[frame * rows + row] = channels[row][static_cast<std::size_t>(firstFrame) + frame];
         }
     }
-    Measure();
+    mMeter.Take(mInterleaved);
     if (mFormat.IntegerBits() == 0)
     {
         Count(sf_writef_float(mFile.get(), mInterleaved.data(), frames), frames);
@@ -60,19 +74,6 @@ void AudioFileWriter::Write(const float* const* channels, int firstFrame, int fr
     std::transform(mInterleaved.begin(), mInterleaved.end(), mIntegers.begin(),
                    [this](float value) { return ToInteger(value); });
     Count(sf_writef_int(mFile.get(), mIntegers.data(), frames), frames);
-}
-
-void AudioFileWriter::Measure()
-{
-    for (float& sample : mInterleaved)
-    {
-        if (!std::isfinite(sample))
-        {
-            sample = 0;
-            ++mBroken;
-        }
-        mPeak = std::max(mPeak, std::abs(sample));
-    }
 }
 
 // libsndfile takes integers of any size at the top of 32 bits.
@@ -92,7 +93,7 @@ void AudioFileWriter::Count(std::int64_t written, int frames)
     if (written != frames)
     {
         throw Failure(ExitCode::FileTrouble, mOutput.Path() + " could not be written to the end (" +
-                                                 sf_strerror(mFile.get()) + "): make room on the disk");
+                                                 SoundFileError(mFile.get()) + "): make room on the disk");
     }
     mFrames += written;
 }

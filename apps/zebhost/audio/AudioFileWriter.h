@@ -2,6 +2,7 @@
 
 #include "audio/AudioFileReader.h"
 #include "audio/OutputFile.h"
+#include "audio/SampleMeter.h"
 
 #include <cstdint>
 #include <string>
@@ -19,6 +20,7 @@ public:
     // cannot be written.
     AudioFileWriter(OutputFile& output, const SampleFormat& format, const AudioFileReader& like);
 
+    // Throws a Failure when there is no room for them, on the disk or in a file of this kind.
     void Write(const float* const* channels, int firstFrame, int frames);
     // Completes the file and gives it its name.
     void Finish();
@@ -26,13 +28,12 @@ public:
     std::int64_t Frames() const { return mFrames; }
     // Samples that were beyond what the format holds.
     std::int64_t ClippedSamples() const { return mClipped; }
-    // Samples that were infinite or no number, and became 0.
-    std::int64_t BrokenSamples() const { return mBroken; }
-    float Peak() const { return mPeak; }
+    // Of all samples as they came.
+    const SampleMeter& Meter() const { return mMeter; }
 
 private:
+    void CheckLength(std::int64_t frames) const;
     void CopyHead(const AudioFileReader& like);
-    void Measure();
     int ToInteger(float value);
     void Count(std::int64_t written, int frames);
 
@@ -44,8 +45,7 @@ private:
     std::vector<int> mIntegers;
     std::int64_t mFrames = 0;
     std::int64_t mClipped = 0;
-    std::int64_t mBroken = 0;
-    float mPeak = 0;
+    SampleMeter mMeter;
 };
 
 } // namespace zebhost

@@ -11,6 +11,8 @@
 #include "render/RunningFilter.h"
 
 #include <algorithm>
+#include <cmath>
+#include <limits>
 #include <utility>
 
 namespace zebhost
@@ -27,6 +29,20 @@ double Speed(const RenderResult& result, int sampleRate)
 std::string SpeedText(double speed)
 {
     return FixedNumber(speed, speed < 10 ? 1 : 0) + " times real time";
+}
+
+// With the tail and the latency.
+std::int64_t MostFramesOut(const AudioFileReader& input, const RenderOptions& options)
+{
+    const double seconds = options.tail.LongestSeconds() + (options.trim ? 0 : RunningFilter::kLongestSeconds);
+    const std::int64_t more = std::llround(seconds * input.SampleRate());
+    return std::min(input.Frames(), std::numeric_limits<std::int64_t>::max() - more) + more;
+}
+
+// A plug-in that fails in each block, or is not set up, sounds like this.
+bool IsSilenced(const AudioFileReader& input, const AudioFileWriter& output)
+{
+    return input.Meter().Peak() > 0 && output.Meter().Peak() == 0;
 }
 
 std::vector<std::string> NamesOf(const std::vector<int>& channels, const zebmediatypes::ChannelLayout& layout)
@@ -56,9 +72,11 @@ Json ResultJson(const AudioFileReader& input, const std::string& output, const R
                 {"latencyTrimmed", options.trim},
                 {"tailFrames", result.tailFrames},
                 {"tailCut", result.tailWasCut},
-                {"peak", writer.Peak()},
+                {"peak", writer.Meter().Peak()},
+                {"silenced", IsSilenced(input, writer)},
                 {"clippedSamples", writer.ClippedSamples()},
-                {"brokenSamples", writer.BrokenSamples()},
+                {"brokenSamples", writer.Meter().BrokenSamples()},
+                {"brokenSamplesIn", input.Meter().BrokenSamples()},
                 {"seconds", result.seconds},
                 {"speed", Speed(result, input.SampleRate())}};
 }
@@ -85,7 +103,7 @@ Json FileRenderer::Render(const std::string& input, const std::string& output)
     OutputFile file(output, mOptions.overwrite);
     const std::unique_ptr<AudioFileReader> sideChain = OpenSideChain(reader);
     const SampleFormat format = ChooseFormat(reader.Format(), input, output, mOptions.format, reader.Channels(),
-                                             reader.SampleRate(), reader.Frames());
+                                             reader.SampleRate(), MostFramesOut(reader, mOptions));
     const Routing routing = Configure(reader, sideChain.get());
     ApplyParameterOptions(mContext, *mFilter, mOptions.settleMs);
     const std::vector<AutomationEvent> events =
@@ -99,7 +117,14 @@ Json FileRenderer::Render(const std::string& input, const std::string& output)
     const RenderResult result =
         RenderJob(*mFilter, routing, mOptions, {reader, sideChain.get(), writer}, events, latency, progress).Run();
     writer.Finish();
+    WarnOfInput(reader);
+    if (sideChain != nullptr)
+    {
+        WarnOfInput(*sideChain);
+    }
+    WarnOfBrokenSamples(writer.Meter(), mFilter.Name() + " gave");
     RemarkOnSamples(reader, format, writer);
+    RemarkOnClipping(reader, format, writer);
     RemarkOnResult(reader, output, latency, result, writer);
     return ResultJson(reader, output, routing, latency, mOptions, result, writer, format);
 }
@@ -190,17 +215,43 @@ void FileRenderer::RemarkOnSamples(const AudioFileReader& input, const SampleFor
         Remark("the output has " + format.CodingName() + " samples, for its kind of file has no " +
                input.Format().CodingName());
     }
+    if (IsSilenced(input, output))
+    {
+        Remark(
+            "the whole output is silent, though " + input.Path() + " is not: " + mFilter.Name() +
+            " may fail in each block, or be set so; look at 'zebhost params', try --settle 1000 or another --block");
+    }
+}
+
+void FileRenderer::RemarkOnClipping(const AudioFileReader& input, const SampleFormat& format,
+                                    const AudioFileWriter& output) const
+{
     if (output.ClippedSamples() > 0)
     {
-        mContext.console.Warn("zebhost: " + mNumber +
-                              Counted(static_cast<std::size_t>(output.ClippedSamples()), "sample") +
-                              " clipped, the highest at " + FixedNumber(static_cast<double>(output.Peak()), 3) +
-                              ": turn it down, or give --format float");
+        const bool hasFloats = HasFloats(format, input.Channels(), input.SampleRate());
+        mContext.console.Warn(
+            "zebhost: " + mNumber + Counted(static_cast<std::size_t>(output.ClippedSamples()), "sample") +
+            " clipped, the highest at " + FixedNumber(static_cast<double>(output.Meter().Peak()), 3) +
+            ": turn it down, or " + (hasFloats ? "give --format float" : "write a .wav with --format float"));
     }
-    if (output.BrokenSamples() > 0)
+}
+
+void FileRenderer::WarnOfInput(const AudioFileReader& input) const
+{
+    if (input.MayBeCutOff())
     {
-        mContext.console.Warn("zebhost: " + mNumber + mFilter.Name() + " gave " +
-                              Counted(static_cast<std::size_t>(output.BrokenSamples()), "sample") +
+        mContext.console.Warn("zebhost: " + mNumber + input.Path() +
+                              " seems to be cut off, and is taken as far as it goes; see that it is whole");
+    }
+    WarnOfBrokenSamples(input.Meter(), input.Path() + " has");
+}
+
+void FileRenderer::WarnOfBrokenSamples(const SampleMeter& meter, const std::string& whose) const
+{
+    if (meter.BrokenSamples() > 0)
+    {
+        mContext.console.Warn("zebhost: " + mNumber + whose + " " +
+                              Counted(static_cast<std::size_t>(meter.BrokenSamples()), "sample") +
                               " that are no numbers; silence stands in their place");
     }
 }

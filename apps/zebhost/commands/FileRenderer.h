@@ -33,6 +33,10 @@ private:
     void RemarkOnRouting(const AudioFileReader& input, const Routing& routing) const;
     void RemarkOnSamples(const AudioFileReader& input, const SampleFormat& format,
                          const AudioFileWriter& output) const;
+    void RemarkOnClipping(const AudioFileReader& input, const SampleFormat& format,
+                          const AudioFileWriter& output) const;
+    void WarnOfInput(const AudioFileReader& input) const;
+    void WarnOfBrokenSamples(const SampleMeter& meter, const std::string& whose) const;
     void RemarkOnResult(const AudioFileReader& input, const std::string& output, int latency,
                         const RenderResult& result, const AudioFileWriter& writer) const;
     void Remark(const std::string& text) const;

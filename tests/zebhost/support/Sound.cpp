@@ -24,6 +24,18 @@ Sound MakeNoise(int channels, std::size_t frames, int format)
     return sound;
 }
 
+void WriteFloats(const std::string& path, const std::vector<float>& samples)
+{
+    SF_INFO info{};
+    info.samplerate = 48000;
+    info.channels = 1;
+    info.format = SF_FORMAT_WAV | SF_FORMAT_FLOAT;
+    SNDFILE* file = sf_open(path.c_str(), SFM_WRITE, &info);
+    ASSERT_NE(file, nullptr) << path;
+    sf_writef_float(file, samples.data(), static_cast<sf_count_t>(samples.size()));
+    sf_close(file);
+}
+
 void WriteSound(const std::string& path, const Sound& sound)
 {
     SF_INFO info{};

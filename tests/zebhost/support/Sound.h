@@ -22,6 +22,8 @@ struct Sound
 // Noise of all levels that are multiples of 1/2^23, the same for the same numbers.
 Sound MakeNoise(int channels, std::size_t frames, int format = SF_FORMAT_WAV | SF_FORMAT_PCM_24);
 
+// A WAV of one channel of 32-bit floats.
+void WriteFloats(const std::string& path, const std::vector<float>& samples);
 void WriteSound(const std::string& path, const Sound& sound);
 // An empty sound if there is no such file.
 Sound ReadSound(const std::string& path);
