@@ -200,7 +200,7 @@ TEST_F(ScanPlanTest, ARecordOfAPluginThatNowCrashesLeavesTheCatalogue)
     EXPECT_THAT(Records(), IsEmpty());
     EXPECT_THAT(Succeed({"list", "--names"}).out, IsEmpty());
     Succeed({"unblock", "a-segv"});
-    EXPECT_THAT(Planned(), ElementsAre(Pair("a-segv", "new")));
+    EXPECT_THAT(Planned(), ElementsAre(Pair("a-segv", "was unblocked")));
 }
 
 // Catalogues of other programs, or of a time before binaries were looked at.
