@@ -1,4 +1,6 @@
 #include "foundation/zebcore/MainThreadLoop.h"
+#include "foundation/zebcore/Threads.h"
+#include "foundation/zebcore/internal/MainThreadQueue.h"
 
 #include <gtest/gtest.h>
 
@@ -204,6 +206,26 @@ TEST_F(DescriptorWatchTest, ANestedPumpServesOtherDescriptorsOnly)
     first.Send();
     EXPECT_EQ("s", RanNow());
     EXPECT_EQ(1, deepest);
+}
+
+TEST_F(DescriptorWatchTest, APumpInsideTheSystemsLoopLeavesThePollingToIt)
+{
+    const Pair reported;
+    const Pair ready;
+    Watch(reported.Watched(),
+          [&](int descriptor)
+          {
+              ReadOne(descriptor);
+              ready.Send();
+              AsyncCallFromMainThread([this] { mRan += 'c'; }, 0);
+              PumpInsideSystemLoop();
+              mRan += '1';
+          });
+    Note(reported.Watched(), '2');
+    Note(ready.Watched(), '3');
+    reported.Send();
+    EXPECT_EQ("c21", RanNow());
+    EXPECT_EQ("3", RanNow());
 }
 
 TEST_F(DescriptorWatchTest, AHandlerThatThrowsSilencesNobody)
