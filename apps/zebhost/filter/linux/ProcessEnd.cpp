@@ -7,7 +7,7 @@
 // the C library, for all that is loaded into it.
 
 // NOLINTBEGIN(bugprone-reserved-identifier,cert-dcl37-c,cert-dcl51-cpp,readability-identifier-naming): given names
-extern "C" [[noreturn, gnu::visibility("default")]] void _exit(int status)
+extern "C" [[gnu::visibility("default")]] void _exit(int status)
 {
     zebhost::CrashGuard::NoteEnd();
     while (true)
@@ -16,7 +16,7 @@ extern "C" [[noreturn, gnu::visibility("default")]] void _exit(int status)
     }
 }
 
-extern "C" [[noreturn, gnu::visibility("default")]] void _Exit(int status) noexcept
+extern "C" [[gnu::visibility("default")]] void _Exit(int status) noexcept
 {
     _exit(status);
 }
