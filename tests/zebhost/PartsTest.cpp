@@ -102,6 +102,7 @@ TEST(SampleFormatTest, WhateverIsReadGoesIntoEveryKindOfFile)
     std::filesystem::remove(name);
     EXPECT_THROW(ChooseFormat(SampleFormatOf(inputs.front()), "in", "out.opus", {}, 2, 44100, 0), Failure);
     EXPECT_THROW(ChooseFormat(SampleFormatOf(inputs.front()), "in", "out.mp3", {}, 2, 96000, 0), Failure);
+    EXPECT_THROW(ChooseFormat({SF_FORMAT_SD2, SF_FORMAT_PCM_16}, "in.sd2", "out.sd2", {}, 2, 48000, 0), Failure);
 }
 
 TEST(SampleFormatTest, FilesOfFourGibibytesAreNotLeftToShortSizes)

@@ -291,6 +291,22 @@ TEST_F(RenderTest, FileTroubleNamesTheFileAndLeavesNothingBehind)
     }
 }
 
+TEST_F(RenderTest, WhatDoesNotFitOnTheDiskIsNoOutput)
+{
+    WriteSound(Path("in.wav"), MakeNoise(2, 48000));
+    for (const char* name : {"out.wav", "out.flac", "out.ogg", "out.opus", "out.mp3", "out.caf"})
+    {
+        // 4 KiB, as the rest of a disk.
+        const RunResult result =
+            RunProgram({"sh", "-c", "ulimit -f 8; trap '' XFSZ; exec \"$@\"", "sh", ZEBHOST_PROGRAM, "--settings",
+                        Settings().string(), "render", EffectBundle("ZebGain").string(), Path("in.wav"), Path(name)},
+                       mVariables, mFolder);
+        EXPECT_EQ(result.code, 7) << name << result.err;
+        EXPECT_THAT(result.LastLine(), testing::AllOf(HasSubstr(name), HasSubstr("make room on the disk")));
+        EXPECT_EQ(Files(), std::vector<std::string>{"in.wav"});
+    }
+}
+
 TEST_F(RenderTest, SeveralInputsGoIntoAFolderAndDoNotHearEachOther)
 {
     WriteSound(Path("silence.wav"),

@@ -1,15 +1,17 @@
 #include "audio/AudioFileWriter.h"
 
+#include "catalogue/WantOfRoom.h"
 #include "cli/Failure.h"
 
 #include <algorithm>
 #include <cmath>
+#include <cstring>
 
 namespace zebhost
 {
 
 AudioFileWriter::AudioFileWriter(OutputFile& output, const SampleFormat& format, const AudioFileReader& like)
-    : mOutput(output), mFormat(format), mChannels(like.Channels())
+    : mOutput(output), mFormat(format), mChannels(like.Channels()), mStream(output.Descriptor())
 {
     if (like.KnowsFrames())
     {
@@ -19,11 +21,10 @@ AudioFileWriter::AudioFileWriter(OutputFile& output, const SampleFormat& format,
     info.channels = mChannels;
     info.samplerate = like.SampleRate();
     info.format = format.Code();
-    mFile.reset(sf_open_fd(mOutput.Descriptor(), SFM_WRITE, &info, SF_FALSE));
+    mFile = mStream.Open(info);
     if (mFile == nullptr)
     {
-        throw Failure(ExitCode::FileTrouble, mOutput.Path() + " cannot be written (" + SoundFileError(nullptr) +
-                                                 "): make room on the disk, or choose another folder");
+        Refuse("cannot be written");
     }
     CopyHead(like);
 }
@@ -88,22 +89,31 @@ int AudioFileWriter::ToInteger(float value)
     return static_cast<int>(static_cast<std::int64_t>(bounded) * (std::int64_t{1} << (32 - bits)));
 }
 
+void AudioFileWriter::Refuse(const std::string& action) const
+{
+    const int error = mStream.Error();
+    const std::string reason = error != 0 ? std::strerror(error) : SoundFileError(mFile.get());
+    const bool isFull = error == 0 || IsWantOfRoom(error);
+    throw Failure(ExitCode::FileTrouble, mOutput.Path() + " " + action + (reason.empty() ? "" : " (" + reason + ")") +
+                                             ": " + (isFull ? "make room on the disk" : "choose another folder"));
+}
+
 void AudioFileWriter::Count(std::int64_t written, int frames)
 {
-    if (written != frames)
+    if (written != frames || mStream.Error() != 0)
     {
-        throw Failure(ExitCode::FileTrouble, mOutput.Path() + " could not be written to the end (" +
-                                                 SoundFileError(mFile.get()) + "): make room on the disk");
+        Refuse("could not be written to the end");
     }
     mFrames += written;
 }
 
+// Much of a compressed file is written here.
 void AudioFileWriter::Finish()
 {
     SNDFILE* file = mFile.release();
-    if (sf_close(file) != 0)
+    if (sf_close(file) != 0 || mStream.Error() != 0)
     {
-        throw Failure(ExitCode::FileTrouble, mOutput.Path() + " could not be completed: make room on the disk");
+        Refuse("could not be completed");
     }
     mOutput.Commit();
 }

@@ -2,6 +2,7 @@
 
 #include "audio/AudioFileReader.h"
 #include "audio/OutputFile.h"
+#include "audio/OutputStream.h"
 #include "audio/SampleMeter.h"
 
 #include <cstdint>
@@ -35,11 +36,14 @@ private:
     void CheckLength(std::int64_t frames) const;
     void CopyHead(const AudioFileReader& like);
     int ToInteger(float value);
+    // Throws the Failure for `action`, by what is known of its reason.
+    [[noreturn]] void Refuse(const std::string& action) const;
     void Count(std::int64_t written, int frames);
 
     OutputFile& mOutput;
     SampleFormat mFormat;
     int mChannels;
+    OutputStream mStream;
     SoundFile mFile;
     std::vector<float> mInterleaved;
     std::vector<int> mIntegers;

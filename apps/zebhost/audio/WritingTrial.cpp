@@ -66,7 +66,9 @@ bool IsWritable(const SF_INFO& info)
 {
     constexpr sf_count_t kFrames = 4096; // more than a packet of any coding
     SF_INFO wanted = info;
-    if (sf_format_check(&wanted) != SF_TRUE)
+    // The head of a Sound Designer file is another file beside it.
+    const bool isInTwo = (info.format & SF_FORMAT_TYPEMASK) == SF_FORMAT_SD2;
+    if (isInTwo || sf_format_check(&wanted) != SF_TRUE)
     {
         return false;
     }
