@@ -297,7 +297,8 @@ TEST_F(AudioUnitPathTest, ScansAndBlocksAllUnitsOfABundle)
     EXPECT_EQ(Run({"block", mTwo + "#Wide Gain"}).code, 3) << "as with all bundles";
     Succeed({"unblock", "Wide Gain"});
     EXPECT_EQ(Succeed({"info", mTwo, "--json"}).Json().at("filter").at("name"), "Wide Gain");
-    EXPECT_THAT(Succeed({"unblock", mTwo}).err, HasSubstr("Narrow Gain is not blocked any more"));
+    EXPECT_THAT(Succeed({"unblock", mTwo}).err,
+                HasSubstr("Narrow Gain is not blocked any more; 'zebhost scan " + mTwo + "' tries it"));
     EXPECT_EQ(Run({"unblock", mTwo}).code, 3);
 }
 

@@ -181,10 +181,14 @@ std::string SelectorOf(const PluginLocator& locator)
                                                                                    : PathOf(locator);
 }
 
+std::string ShellWord(const std::string& text)
+{
+    return text.find(' ') == std::string::npos ? text : '"' + text + '"';
+}
+
 std::string SelectorWord(const PluginLocator& locator)
 {
-    const std::string selector = SelectorOf(locator);
-    return selector.find(' ') == std::string::npos ? selector : '"' + selector + '"';
+    return ShellWord(SelectorOf(locator));
 }
 
 bool IsCalled(const PluginLocator& locator, const std::string& text)

@@ -29,7 +29,8 @@ std::string PlaceOf(const zebaudiofilterhost::PluginLocator& locator);
 
 // What a command takes: the path, and for a plug-in that is no file its ID.
 std::string SelectorOf(const zebaudiofilterhost::PluginLocator& locator);
-// The same as one word for a shell.
+// As one word for a shell.
+std::string ShellWord(const std::string& text);
 std::string SelectorWord(const zebaudiofilterhost::PluginLocator& locator);
 
 // Whether the text is the path's last part; of a plug-in that is no file, what PlaceOf shows.

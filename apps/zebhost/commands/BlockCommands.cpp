@@ -112,7 +112,8 @@ std::string WhatTriesIt(const PluginLocator& locator, const std::string& text)
     }
     const bool isUnitOfBundle =
         locator.GetTechnologyType() == zebaudiofilterhost::kTechnologyAudioUnit && IsBundlePath(text);
-    return isUnitOfBundle ? "; 'zebhost scan " + text + "' tries it" : "; the next 'zebhost scan' tries it";
+    return isUnitOfBundle ? "; 'zebhost scan " + ShellWord(text) + "' tries it"
+                          : "; the next 'zebhost scan' tries it";
 }
 
 // Of several with one file name, the paths.
