@@ -12,53 +12,48 @@ namespace zebhost
 namespace
 {
 
-struct Memory
+class Memory
 {
-    std::vector<char> bytes;
-    sf_count_t position = 0;
+public:
+    static SF_VIRTUAL_IO Access() { return {Length, Seek, Read, Write, Tell}; }
+
+private:
+    static Memory& Of(void* user) { return *static_cast<Memory*>(user); }
+
+    static sf_count_t Length(void* user) { return static_cast<sf_count_t>(Of(user).mBytes.size()); }
+
+    static sf_count_t Seek(sf_count_t offset, int origin, void* user)
+    {
+        Memory& memory = Of(user);
+        const sf_count_t from = origin == SEEK_SET ? 0 : origin == SEEK_CUR ? memory.mPosition : Length(user);
+        memory.mPosition = std::max<sf_count_t>(from + offset, 0);
+        return memory.mPosition;
+    }
+
+    static sf_count_t Read(void* target, sf_count_t count, void* user)
+    {
+        Memory& memory = Of(user);
+        const sf_count_t length = std::clamp<sf_count_t>(Length(user) - memory.mPosition, 0, count);
+        std::copy_n(memory.mBytes.data() + memory.mPosition, length, static_cast<char*>(target));
+        memory.mPosition += length;
+        return length;
+    }
+
+    static sf_count_t Write(const void* source, sf_count_t count, void* user)
+    {
+        Memory& memory = Of(user);
+        const sf_count_t end = memory.mPosition + count;
+        memory.mBytes.resize(static_cast<std::size_t>(std::max(end, Length(user))));
+        std::copy_n(static_cast<const char*>(source), count, memory.mBytes.data() + memory.mPosition);
+        memory.mPosition = end;
+        return count;
+    }
+
+    static sf_count_t Tell(void* user) { return Of(user).mPosition; }
+
+    std::vector<char> mBytes;
+    sf_count_t mPosition = 0;
 };
-
-Memory& MemoryOf(void* user)
-{
-    return *static_cast<Memory*>(user);
-}
-
-sf_count_t Length(void* user)
-{
-    return static_cast<sf_count_t>(MemoryOf(user).bytes.size());
-}
-
-sf_count_t Seek(sf_count_t offset, int origin, void* user)
-{
-    Memory& memory = MemoryOf(user);
-    const sf_count_t from = origin == SEEK_SET ? 0 : origin == SEEK_CUR ? memory.position : Length(user);
-    memory.position = std::max<sf_count_t>(from + offset, 0);
-    return memory.position;
-}
-
-sf_count_t Read(void* target, sf_count_t count, void* user)
-{
-    Memory& memory = MemoryOf(user);
-    const sf_count_t length = std::clamp<sf_count_t>(Length(user) - memory.position, 0, count);
-    std::copy_n(memory.bytes.data() + memory.position, length, static_cast<char*>(target));
-    memory.position += length;
-    return length;
-}
-
-sf_count_t Write(const void* source, sf_count_t count, void* user)
-{
-    Memory& memory = MemoryOf(user);
-    const sf_count_t end = memory.position + count;
-    memory.bytes.resize(static_cast<std::size_t>(std::max(end, Length(user))));
-    std::copy_n(static_cast<const char*>(source), count, memory.bytes.data() + memory.position);
-    memory.position = end;
-    return count;
-}
-
-sf_count_t Tell(void* user)
-{
-    return MemoryOf(user).position;
-}
 
 } // namespace
 
@@ -73,7 +68,7 @@ bool IsWritable(const SF_INFO& info)
         return false;
     }
     Memory memory;
-    SF_VIRTUAL_IO access = {Length, Seek, Read, Write, Tell};
+    SF_VIRTUAL_IO access = Memory::Access();
     const SoundFile file(sf_open_virtual(&access, SFM_WRITE, &wanted, &memory));
     const std::vector<float> silence(static_cast<std::size_t>(kFrames * info.channels));
     return file != nullptr && sf_writef_float(file.get(), silence.data(), kFrames) == kFrames;

@@ -9,37 +9,38 @@ namespace zebhost
 namespace
 {
 
-struct Blame
+struct Culprit
 {
     std::string what;
     std::string advice;
 };
 
-Blame sBlame;
+Culprit sCulprit;
 
 } // namespace
 
 ThrowGuard::ThrowGuard(std::string what, std::string advice)
     : mWhat(std::move(what)), mAdvice(std::move(advice)), mExceptions(std::uncaught_exceptions())
 {
-    sBlame = {};
+    sCulprit = {};
 }
 
 ThrowGuard::~ThrowGuard()
 {
     if (std::uncaught_exceptions() > mExceptions)
     {
-        sBlame = {std::move(mWhat), std::move(mAdvice)};
+        sCulprit = {std::move(mWhat), std::move(mAdvice)};
     }
 }
 
 std::string ThrowGuard::Sentence(const std::string& error)
 {
-    if (sBlame.what.empty())
+    if (sCulprit.what.empty())
     {
         return {};
     }
-    return sBlame.what + " threw an exception" + (error.empty() ? "" : ", \"" + error + "\"") + ": " + sBlame.advice;
+    return sCulprit.what + " threw an exception" + (error.empty() ? "" : ", \"" + error + "\"") + ": " +
+           sCulprit.advice;
 }
 
 } // namespace zebhost

@@ -16,7 +16,8 @@ namespace zebhost
 namespace
 {
 
-constexpr const char* kNormalised = "a normalised value does it: --norm NAME=0.5, or norm:0.5 in an automation file";
+constexpr const char* kNormalisedDoes =
+    "a normalised value does it: --norm NAME=0.5, or norm:0.5 in an automation file";
 constexpr int kMostSteps = 65536; // a count that lies must not take for ever
 
 bool IsNumber(const Quantity& shown, const Quantity& wanted)
@@ -204,7 +205,7 @@ ValueFinder::Found ValueFinder::FindContinuous(const std::string& wanted) const
                 return {value, Shown(value), true};
             }
         }
-        Refuse(wanted, "it goes from " + Shown(0) + " to " + Shown(1) + "; " + kNormalised);
+        Refuse(wanted, "it goes from " + Shown(0) + " to " + Shown(1) + "; " + kNormalisedDoes);
     }
     const std::optional<Quantity> typed = ParseQuantity(wanted, {});
     const float direct = mInfo.ToNormalized(static_cast<float>(typed->value));
@@ -216,7 +217,7 @@ ValueFinder::Found ValueFinder::FindContinuous(const std::string& wanted) const
     const NumericRange range([this](double value) { return ParseQuantity(Text(static_cast<float>(value)), mUnit); });
     if (!range.IsMonotone())
     {
-        Refuse(wanted, std::string("what it displays cannot be searched for that; ") + kNormalised);
+        Refuse(wanted, std::string("what it displays cannot be searched for that; ") + kNormalisedDoes);
     }
     const auto located = static_cast<float>(range.Locate(number->value));
     const std::optional<Quantity> shown = ParseQuantity(Text(located), mUnit);
