@@ -56,7 +56,7 @@ boost::intrusive_ptr<AudioFilter> AudioFilter::Clone() const
     boost::intrusive_ptr<AudioFilter> clone = utility::CreateAudioFilter(mFilterID);
     if (!clone)
         return clone;
-    clone->RequestIOConfiguration(LayoutsOf(mInputBuses), LayoutsOf(mOutputBuses));
+    RequestBuses(*clone, mInputBuses, mOutputBuses);
     clone->SetSampleRate(mSampleRate);
 
     PropList settings;

@@ -124,7 +124,7 @@ boost::intrusive_ptr<AudioFilter> AudioFilterProxy::CreateAudioFilterFromZombieS
     }
     filter->SetSampleRate(mSampleRate);
     filter->SetBlockSize(mBlockSize);
-    filter->RequestIOConfiguration(LayoutsOf(GetInputBuses()), LayoutsOf(GetOutputBuses()));
+    RequestBuses(*filter, GetInputBuses(), GetOutputBuses());
     filter->LoadSettings(mZombiePreset);
     filter->SetUseChannelMap(GetUseChannelMap());
     filter->SetChannelMap(GetChannelMap(kDirection_Input), kDirection_Input);

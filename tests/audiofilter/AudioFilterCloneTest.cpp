@@ -1,3 +1,4 @@
+#include "audiofilter/AudioFilterProxy.h"
 #include "host/AudioFilterDescriptor.h"
 #include "host/AudioFilterDescriptorManager.h"
 #include "host/AudioFilterFactory.h"
@@ -73,6 +74,50 @@ TEST_F(AudioFilterCloneTest, CarriesBusesRateSettingsMapsAndPresetName)
     EXPECT_TRUE(clone->GetMainTargetBus() == filter->GetMainTargetBus());
     EXPECT_TRUE(clone->GetSideChainTargetBus() == filter->GetSideChainTargetBus());
     EXPECT_TRUE(clone->GetPresetNameAndDirtyState() == filter->GetPresetNameAndDirtyState());
+}
+
+// Has no bus ahead of its first request, of one layout for each side; then a fixed number of such buses.
+class LateFilter : public AudioFilter
+{
+public:
+    explicit LateFilter(int inputs)
+        : AudioFilter(inputs == 0 ? u"1:late generator" : u"1:late mixer", u""), mInputs(inputs)
+    {
+    }
+    void RequestIOConfiguration(const std::vector<ChannelLayout>& inputs,
+                                const std::vector<ChannelLayout>& outputs) override
+    {
+        if (inputs.size() != 1 || outputs.size() != 1)
+            return;
+        ClearBusConfiguration();
+        for (int bus = 0; bus < mInputs; ++bus)
+            AddInputBus(AudioFilterBusDescription(u"", inputs[0], AudioFilterBusDescription::kBusType_Main));
+        AddOutputBus(AudioFilterBusDescription(u"", outputs[0], AudioFilterBusDescription::kBusType_Main));
+    }
+
+private:
+    int mInputs;
+};
+
+TEST_F(AudioFilterCloneTest, GetsBusesOfAPluginThatTakesOneLayoutForEachSide)
+{
+    for (const int inputs : {0, 2})
+    {
+        const Guid guid = Guid::CreateUnique();
+        AudioFilterFactory::GetInstance().RegisterFactoryFunction(
+            guid, [inputs](const UTF16String&) { return boost::intrusive_ptr<AudioFilter>(new LateFilter(inputs)); });
+        const boost::intrusive_ptr<AudioFilter> filter(new LateFilter(inputs));
+        AudioFilterDescriptorManager::GetInstance().AddAudioFilterDescriptor(
+            new AudioFilterDescriptor(u"Late", 1, AudioFilterCategory(), filter->GetID(), guid, false));
+        EXPECT_TRUE(filter->Clone()->GetOutputBuses().empty()) << "it had none";
+        filter->RequestIOConfiguration({ChannelLayout(2)}, {ChannelLayout(2)});
+        const boost::intrusive_ptr<AudioFilterProxy> proxy(new AudioFilterProxy(filter));
+        for (const auto& copy : {filter->Clone(), proxy->CreateAudioFilterFromZombieState()})
+        {
+            EXPECT_EQ(copy->GetInputBuses().size(), static_cast<std::size_t>(inputs));
+            EXPECT_EQ(copy->GetNumberOfOutputChannels(), 2);
+        }
+    }
 }
 
 TEST_F(AudioFilterCloneTest, LeavesBlockSizeNameAndFlagsBehind)
