@@ -108,9 +108,12 @@ public:
     /// channel that a map names; without, one for each channel of the plug-in. `frames` must not exceed the block
     /// size. A set bit of inFlags says that the input holds silence: its buffer is not given to the plug-in, but with
     /// mapping it must still be there and be zero, since what passes by is read. A set bit of outFlags says that
-    /// the output may be taken as silent without reading it; the plug-in's own bits come in its channel order. The
-    /// input and the output of a channel may be one buffer, and channels that pass by may exchange theirs; no others
-    /// may overlap. [process]
+    /// the output may be taken as silent without reading it; the plug-in's own bits come in its channel order.
+    ///
+    /// The input and the output of a channel may be one buffer as long as the maps lead the plug-in's input and
+    /// output of one number to the same channel, and channels that pass by may exchange theirs; no others may
+    /// overlap. In place, what has gone through the plug-in is what the delay keeps of a channel: when an edit sends
+    /// it past the plug-in, the last frames come twice. [process]
     virtual void ProcessWithMapping(float** in, float** out, int frames, ChannelFlags inFlags,
                                     ChannelFlags& outFlags);
 
@@ -215,12 +218,13 @@ public:
     virtual UTF16String GetFactoryPresetName(int index) const;
     virtual void SetFactoryPreset(int index);
 
-    /// Takes over a preset. False if it does not fit this filter; settings that were read before the failure stay.
-    /// Fires the preset-changed signal in any case. [main]
+    /// Takes over a preset. False if it does not fit this filter; settings that were read before the failure stay. A
+    /// preset with a chunk fits a filter that uses chunks, whatever the plug-in makes of it. Fires the preset-changed
+    /// signal in any case. [main]
     virtual bool LoadSettings(const PresetData& preset);
 
-    /// Replaces the content of the preset by the settings of this filter. Changes that the plug-in has not got yet may be
-    /// missing: FlushMessageQueue ahead of it, or a tick, hands them over. [main]
+    /// Replaces the content of the preset by the settings of this filter. Changes that the plug-in has not got yet
+    /// may be missing: FlushMessageQueue ahead of it, or a tick, hands them over. [main]
     virtual void SaveSettings(PresetData& preset) const;
 
     /// Takes over a preset's chunk; false on failure, and here. [main]
@@ -238,8 +242,9 @@ public:
     /// Latency in frames; 0 here. Resume asks for it to delay what passes by the plug-in. [main]
     virtual int GetInitialDelay() const;
 
-    /// Asks the plug-in for buses of these layouts; what it granted stands in the bus lists afterwards. Nothing here.
-    /// [main, suspended]
+    /// Asks the plug-in for buses of these layouts; what it granted stands in the bus lists afterwards. An Audio Unit
+    /// has none ahead of its first request, and takes one layout for each side, whatever its number of buses. Nothing
+    /// here. [main, suspended]
     virtual void RequestIOConfiguration(const std::vector<ChannelLayout>& inputs,
                                         const std::vector<ChannelLayout>& outputs);
 
@@ -269,8 +274,9 @@ public:
     virtual boost::intrusive_ptr<AudioFilterDescriptor> CreateFilterDescriptor(const PluginLocator& locator,
                                                                                bool skipCategory);
 
-    /// A new suspended filter with the same buses, sample rate, settings, maps and preset name; null if it can't be
-    /// made. Block size, host, display name, flags and editor state stay behind. [main]
+    /// A new suspended filter with the same sample rate, settings, maps, preset name and, as far as the plug-in
+    /// grants them anew, buses; null if it can't be made. Block size, host, display name, flags and editor state stay
+    /// behind. [main]
     virtual boost::intrusive_ptr<AudioFilter> Clone() const;
 
     /// Sets all parameters from a preset's values, each as automated; false, and nothing set, if the count does not
@@ -403,7 +409,13 @@ public:
     bool IsChannelFormatSupported(const ChannelLayout& layout);
 
     /// Read and write both maps. False if routing through the maps is off, or a section or record is missing; an
-    /// input map that could be read stays. Running audio does not follow before the map is set again. [main]
+    /// input map that could be read stays. Running audio does not follow before the map is set again.
+    ///
+    /// Written is what connects the main target bus with a bus of the plug-in. Connections of other application
+    /// channels, of a side chain for instance, and of channels of the plug-in beyond its widest bus are not:
+    /// AutoConnectSideChainChannels brings those back, or a map that the application keeps itself (GetChannelMap). A
+    /// connection that the filter has no channel for is read as none, so a filter without buses, such as a proxy that
+    /// was just made, gets them first. [main]
     bool LoadChannelMapSettings(const PropList* settings);
     bool SaveChannelMapSettings(PropList* settings) const;
 
@@ -413,7 +425,7 @@ public:
     /// null. [main]
     static boost::intrusive_ptr<AudioFilter> Clone(boost::intrusive_ptr<AudioFilter> filter);
 
-    // Signals. Slots run on the thread that fires.
+    // Signals. Slots run on the thread that fires, and must not drop the last pointer to the filter.
 
     /// [any]
     AutomatedParameterChangeSignal& GetAutomatedParameterChangeSignal();

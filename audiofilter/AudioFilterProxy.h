@@ -19,7 +19,9 @@ class ZEB_EXPORT AudioFilterProxy : public AudioFilter
 {
 public:
     /// For a filter that couldn't be made: `parameterCount` hidden, unnamed parameters of value 0. The application
-    /// names them with SetParameterDisplayName and gives the settings that it saved to LoadSettings. [main]
+    /// names them with SetParameterDisplayName and gives the settings that it saved to LoadSettings. There are no
+    /// buses: add those that it saved, and set the main target bus and SetUseChannelMap, ahead of
+    /// LoadChannelMapSettings. [main]
     AudioFilterProxy(const UTF16String& id, const UTF16String& displayName, unsigned int parameterCount,
                      bool usesChunkData);
 
@@ -47,10 +49,10 @@ public:
     /// Does nothing for an index out of range. [main]
     void SetParameterDisplayName(int index, const UTF16String& name);
 
-    /// The real filter, suspended, with this proxy's buses, settings and maps; null while the plug-in is missing.
-    /// Host, target buses and display name are the application's to set. The proxy stays as it is. Some plug-ins know
-    /// their latency only when they run, and it may come with the settings: to align what passes the filter by, call
-    /// Resume, Suspend, and Resume again. [main]
+    /// The real filter, suspended, with this proxy's settings, maps and, as far as it grants them, buses; null while
+    /// the plug-in is missing. Host, target buses and display name are the application's to set. The proxy stays as
+    /// it is. Some plug-ins know their latency only when they run, and it may come with the settings: to align what
+    /// passes the filter by, call Resume, Suspend, and Resume again. [main]
     boost::intrusive_ptr<AudioFilter> CreateAudioFilterFromZombieState() const;
 
 private:

@@ -33,14 +33,16 @@ public:
     void ReadBannedPlugins(const PropList& list);
     void WriteBannedPlugins(PropList& list) const;
     /// The file's entries replace the permanent list. False, with the list as it was, when the file is missing or
-    /// broken.
+    /// broken. The file is XML, <pluginlist><plugin filename="X.vst3" uniqueid="" version=""/></pluginlist>, with an
+    /// entry for each plug-in; how they are compared stands at IsPluginBannedStatically.
     bool LoadStaticConfiguration(File& file);
 
     void AddBannedPlugin(const PluginLocator& locator);
     void RemoveBannedPlugin(const PluginLocator& locator);
     bool IsPluginBanned(const PluginLocator& locator) const;
     /// `fileName` with extension. An entry's empty unique ID or version fits any; letters from A to Z compare without
-    /// case.
+    /// case. A scan asks for VST 2 with ID and version in decimals, for VST 3 with "none" and "0", and for an Audio
+    /// Unit with its ID as both names and no version.
     bool IsPluginBannedStatically(const UTF16String& fileName, const UTF16String& uniqueID,
                                   const UTF16String& version) const;
     /// Over the dynamic list, in locator order.

@@ -72,10 +72,12 @@ public:
     void WriteDirectories(PropList& list) const;
 
     /// A file that is missing or of another version counts as none: then the external descriptors are those of the
-    /// private configuration, and directories go back to default if there are no records. Emits the signal.
-    /// Exceptions of the file layer pass through.
+    /// private configuration, and directories go back to default if there are no records; records stay, so call
+    /// ClearAll first when there are some. Emits the signal. Exceptions of the file layer pass through.
     void LoadConfiguration(File& file);
-    /// Ends silently when the old file cannot be deleted; other exceptions of the file layer pass through.
+    /// Ends silently when the old file cannot be deleted; other exceptions of the file layer pass through. Without
+    /// directories, a later start calls ResetToDefaultFolders ahead of LoadConfiguration: a search without folders
+    /// finds no VST 2 plug-in, and calls the recorded ones gone.
     void SaveConfiguration(File& file, bool withDirectories) const;
     void BuildConfigurationPropList(PropList& list, bool withDirectories) const;
     /// What SaveConfiguration would write, directories included.
@@ -90,7 +92,9 @@ public:
 
     void ResetToDefaultFolders() const;
     /// What is on disk, as each technology finds it: all of it, or with `onlyNew` what has no record. `removed`
-    /// receives the recorded plug-ins that are no longer found. A plug-in that changed in place is not noticed.
+    /// receives the recorded plug-ins that are no longer found. A plug-in that changed in place is not noticed. An
+    /// Audio Unit may come twice. Give what has a record, and is to be scanned again, to RemovePluginLocators first:
+    /// its filters would stand in the catalogue twice, and the old ones answer.
     std::vector<PluginLocator> CollectPotentialPlugins(bool onlyNew, std::vector<PluginLocator>& removed) const;
     /// Drops records with their descriptors; a locator without a record is skipped, and its descriptors stay. Emits
     /// the signal once if at least one record went.

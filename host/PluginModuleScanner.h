@@ -31,7 +31,8 @@ public:
     };
 
     /// Loads nothing yet. Work goes technology by technology, within one in the order of `locators`; those of an
-    /// unknown technology are ignored. With `skipCategory` descriptors carry kCategoryNotQueried, which saves asking.
+    /// unknown technology are ignored. With `skipCategory` descriptors carry kCategoryNotQueried, which saves asking;
+    /// VST 3 instruments are then not told from effects, and enter the catalogue.
     PluginModuleScanner(const std::vector<PluginLocator>& locators, bool skipCategory);
     ~PluginModuleScanner() override;
 

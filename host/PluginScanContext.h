@@ -18,7 +18,7 @@ public:
     ~PluginScanContext() override;
 
     /// Starts over with this list, and drops what is in progress. With `skipCategory` plug-ins are not asked for
-    /// their category, and descriptors carry kCategoryNotQueried.
+    /// their category, and descriptors carry kCategoryNotQueried; VST 3 instruments get descriptors, too.
     virtual void SetPluginLocators(const std::vector<PluginLocator>& locators, bool skipCategory) = 0;
 
     /// False, with nothing written, once the list is finished. Otherwise what the next Continue works on: the

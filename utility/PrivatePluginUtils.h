@@ -25,8 +25,9 @@ ZEB_EXPORT extern const zebcore::UTF16String kVST3PluginExtension;
 /// Scans the two folders, banned plug-ins included, and writes the text to `resultPath`, the old file or the new one,
 /// whole. An empty folder name, or a folder that is not there, has no plug-ins. Afterwards this process uses the new
 /// configuration, and the user's catalogue is loaded again from the preference folder: unsaved records are gone.
-/// Exceptions of the file layer pass through, and the catalogue then holds the scanned plug-ins alone. A plug-in that
-/// crashes takes the process along and leaves the old file.
+/// Without a settings file there, those of this scan stay; ClearAll drops them. Categories are not asked for, so
+/// instruments of VST 3 are among the effects. Exceptions of the file layer pass through, and the catalogue then
+/// holds the scanned plug-ins alone. A plug-in that crashes takes the process along and leaves the old file.
 ///
 /// Folders are replaced as text, wherever it stands, that of VST 3 first. So give full paths, with a slash at the end
 /// either here and to the setters or to none of them; without one, no folder's name may begin with that of the VST 3

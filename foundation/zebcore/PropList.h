@@ -21,7 +21,7 @@ class PropListVisitor;
 /// - A list owns its sub-lists. References to one stay good until its entry is removed or replaced, or the list that
 ///   holds it is cleared, assigned to or destroyed.
 /// - Copies are deep. The accessors are virtual so that a wrapper may stand in for a list; one that gets its entries
-///   from elsewhere shows them in Visit, too.
+///   from elsewhere shows them in Visit, too; IsEmpty and RemoveValue go by its own store.
 ///
 /// No locks: a list belongs to one thread at a time. All operations: [any], from the thread that owns the list.
 class ZEB_EXPORT PropList
