@@ -5,6 +5,7 @@
 #include <gmock/gmock.h>
 
 #include <cstring>
+#include <limits>
 
 namespace zebaudiofilterhost::xau
 {
@@ -70,6 +71,20 @@ TEST_F(XAUParametersTest, ValuesAreLinearInNormalisedOnes)
     EXPECT_FLOAT_EQ(info->FromNormalized(2.0F), 5.0F);
     info = Describe(MakeInfo(kAudioUnitParameterUnit_Generic, 3.0F, 1.0F));
     EXPECT_FLOAT_EQ(info->ToNormalized(4.0F), 1.0F);
+}
+
+TEST_F(XAUParametersTest, ARangeWiderThanAFloatHasValuesNonetheless)
+{
+    constexpr float kMost = std::numeric_limits<float>::max();
+    const auto info = Describe(MakeInfo(kAudioUnitParameterUnit_Generic, -kMost, kMost));
+    for (const auto& [normalized, value] :
+         {std::pair(0.0F, -kMost), std::pair(0.25F, -kMost / 2.0F), std::pair(0.5F, 0.0F), std::pair(1.0F, kMost)})
+    {
+        EXPECT_EQ(info->FromNormalized(normalized), value);
+        EXPECT_EQ(info->ToNormalized(value), normalized);
+    }
+    EXPECT_EQ(info->FromNormalized(2.0F), kMost);
+    EXPECT_EQ(info->FromNormalized(-1.0F), -kMost);
 }
 
 TEST_F(XAUParametersTest, UnitsBecomeLabelsAndSteps)

@@ -60,6 +60,12 @@ int CountSteps(float minimum, float maximum)
     return std::isnan(range) ? 0 : static_cast<int>(std::clamp(range, -kMost, kMost));
 }
 
+float ToFloat(double value)
+{
+    constexpr double kMost = std::numeric_limits<float>::max();
+    return static_cast<float>(std::clamp(value, -kMost, kMost));
+}
+
 } // namespace
 
 // Texts that the unit has made for the reader alone are released with the record.
@@ -104,6 +110,13 @@ void XAUParameterInfo::ReadTexts(const ParameterRecord& record)
     SetLabel(record.HasUnitName() ? MACtoZEB(info.unitName) : LabelOf(info.unit));
 }
 
+// Of finite bounds, such as those of a unit that gives the largest of all floats and its negative.
+bool XAUParameterInfo::IsWiderThanAFloat() const
+{
+    const float range = mMaximum - mMinimum;
+    return range > 0.0F && std::isinf(range) && std::isfinite(mMinimum) && std::isfinite(mMaximum);
+}
+
 float XAUParameterInfo::GetRange() const
 {
     const float range = mMaximum - mMinimum;
@@ -112,11 +125,15 @@ float XAUParameterInfo::GetRange() const
 
 float XAUParameterInfo::ToNormalized(float value) const
 {
+    if (IsWiderThanAFloat())
+        return ToFloat((static_cast<double>(value) - mMinimum) / (static_cast<double>(mMaximum) - mMinimum));
     return (value - mMinimum) / GetRange();
 }
 
 float XAUParameterInfo::FromNormalized(float normalized) const
 {
+    if (IsWiderThanAFloat())
+        return ToFloat((static_cast<double>(mMaximum) - mMinimum) * normalized + mMinimum);
     return GetRange() * normalized + mMinimum;
 }
 

@@ -48,6 +48,7 @@ public:
 private:
     void ReadInfo();
     void ReadTexts(const ParameterRecord& record);
+    bool IsWiderThanAFloat() const;
     float GetRange() const;
 
     AudioUnit mInstance;
