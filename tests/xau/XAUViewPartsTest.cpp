@@ -57,6 +57,26 @@ TEST_F(XAUViewPartsTest, StepsHaveFieldsWhileTheirTextsFit)
     }
 }
 
+TEST_F(XAUViewPartsTest, StepsWhoseNameIsNoTextAreAskedFor)
+{
+    const FakeUnit::Key strings(kAudioUnitProperty_ParameterValueStrings, kAudioUnitScope_Global, 1);
+    CFMutableArrayRef names = CFArrayCreateMutable(nullptr, 0, nullptr); // of bare pointers
+    const CFOwner number(MakeNumber(kCFNumberSInt32Type, SInt32{7}));
+    const CFOwner text(MakeString("C"));
+    for (const void* name : {number.get(), CFTypeRef(nullptr), text.get()})
+        CFArrayAppendValue(names, name);
+    for (const auto& [answer, last] : {std::pair(CFTypeRef(names), "C"), std::pair(CFRetain(number.get()), "2")})
+    {
+        mUnit.Answer(strings, answer); // the reference is that of the one row that reads it
+        ParameterRow row(mUnit.GetInstance(), kAudioUnitScope_Global, 1);
+        for (const auto& [value, shown] : {std::pair(0.0, "0"), std::pair(1.0, "1"), std::pair(2.0, last)})
+        {
+            row.SetPosition(value / 2.0);
+            EXPECT_EQ(row.GetText(), shown) << "last: " << last;
+        }
+    }
+}
+
 TEST_F(XAUViewPartsTest, WhatIsOnlyToBeWatchedHasNothingToTakeHoldOf)
 {
     using Control = ParameterRow::Control;

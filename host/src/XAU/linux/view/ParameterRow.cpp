@@ -45,6 +45,13 @@ char32_t PointAt(const UTF16String& text, std::size_t index)
     return isPair ? 0x10000 + ((first - 0xD800) << 10) + (second - 0xDC00) : first;
 }
 
+// Null if it is of another kind, as a unit's answer can be.
+template <typename Ref>
+Ref ToKind(CFTypeRef object, CFTypeID kind)
+{
+    return object && CFGetTypeID(object) == kind ? static_cast<Ref>(object) : nullptr;
+}
+
 } // namespace
 
 std::string ToShownText(const UTF16String& text)
@@ -99,18 +106,19 @@ void ParameterRow::ReadSteps()
     mIsStepped = true;
     if (steps > kMaxNames)
         return;
-    CFArrayRef names = nullptr;
-    UInt32 size = sizeof(CFTypeRef);
+    CFTypeRef answer = nullptr;
+    UInt32 size = sizeof(answer);
     const OSStatus result = CallGuarded<AudioUnitGetProperty>(mUnit, kAudioUnitProperty_ParameterValueStrings, mScope,
-                                                              mID, &names, &size);
-    const bool hasNames = result == noErr && names != nullptr;
-    const CFOwner owner(hasNames ? names : nullptr);
+                                                              mID, &answer, &size);
+    const CFOwner owner(result == noErr ? answer : nullptr);
+    const auto* names = ToKind<CFArrayRef>(owner.get(), CFArrayGetTypeID());
+    const CFIndex count = names ? CFArrayGetCount(names) : 0;
     for (std::size_t step = 0; step < static_cast<std::size_t>(steps); ++step)
     {
         const auto index = static_cast<CFIndex>(step);
-        if (hasNames && index < CFArrayGetCount(names))
-            mStepNames.push_back(
-                ToShownText(MACtoZEB(static_cast<CFStringRef>(CFArrayGetValueAtIndex(names, index)))));
+        const void* item = index < count ? CFArrayGetValueAtIndex(names, index) : nullptr;
+        if (const auto* name = ToKind<CFStringRef>(item, CFStringGetTypeID()))
+            mStepNames.push_back(ToShownText(MACtoZEB(name)));
         else
             mStepNames.push_back(
                 ReadText(static_cast<AudioUnitParameterValue>(mMinimum + static_cast<double>(step))));
