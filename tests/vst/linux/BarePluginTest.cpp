@@ -57,6 +57,16 @@ TEST_F(BarePlugin, AShellWithoutEndIsCutOff)
     EXPECT_TRUE(ids.back().starts_with(u"2:65536 "));
 }
 
+TEST_F(BarePlugin, AShellThatBeginsAgainHasEachMemberOnce)
+{
+    const auto module = GetVSTPlugin(zebcore::filesupport::FromNativePath(ZEB_ROUND_PLUGIN));
+    ASSERT_NE(module, nullptr);
+    std::vector<UTF16String> ids;
+    ASSERT_NE(module->GetPluginInfo(ids), nullptr);
+    ASSERT_EQ(ids.size(), 3U);
+    EXPECT_TRUE(ids[0].starts_with(u"2:1 ") && ids[1].starts_with(u"2:2 ") && ids[2].starts_with(u"2:3 "));
+}
+
 } // namespace
 
 } // namespace zebaudiofilterhost::vst

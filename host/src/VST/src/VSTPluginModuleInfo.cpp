@@ -8,6 +8,7 @@
 #include "host/src/VST/src/VSTFilterID.h"
 
 #include <array>
+#include <unordered_set>
 
 namespace zebaudiofilterhost::vst
 {
@@ -58,6 +59,15 @@ bool IsListed(const UTF16String& path, const AEffect* effect, int version)
     return isListed && !IsSynth(effect);
 }
 
+// The first of each stays.
+void DropRepeats(std::vector<UTF16String>& filterIDs)
+{
+    std::unordered_set<UTF16String> seen;
+    std::erase_if(filterIDs, [&seen](const UTF16String& id) { return !seen.insert(id).second; });
+}
+
+// A list with an end is taken as it stands. One without is mostly a shell that begins again, over and over: it must
+// not be opened once for each time.
 std::vector<UTF16String> ListShellMembers(AEffect* effect, const UTF16String& path)
 {
     std::array<char, kMemberNameSize> name{};
@@ -70,6 +80,8 @@ std::vector<UTF16String> ListShellMembers(AEffect* effect, const UTF16String& pa
             break;
         filterIDs.push_back(EncodeFilterID(static_cast<unsigned int>(uniqueID), path));
     }
+    if (filterIDs.size() == kMaxShellMembers)
+        DropRepeats(filterIDs);
     return filterIDs;
 }
 

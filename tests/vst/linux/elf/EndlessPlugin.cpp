@@ -1,10 +1,18 @@
-// A shell that never comes to its last member, and takes no time to say so.
+// A shell that never comes to its last member, and takes no time to say so: each is a new one, or it begins again.
 #include "host/src/VST/interface/VST2Interface.h"
+
+#include <limits>
 
 namespace
 {
 
 using namespace zebaudiofilterhost::vst;
+
+#ifdef ZEB_ROUND
+constexpr int kRound = ZEB_ROUND;
+#else
+constexpr int kRound = std::numeric_limits<std::int32_t>::max();
+#endif
 
 long long Answer(AEffect* effect, std::int32_t opcode, std::int32_t, long long, void*, float)
 {
@@ -15,7 +23,8 @@ long long Answer(AEffect* effect, std::int32_t opcode, std::int32_t, long long, 
     case effGetPlugCategory:
         return kPlugCategShell;
     case effShellGetNextPlugin:
-        return ++effect->uniqueID;
+        effect->uniqueID = effect->uniqueID % kRound + 1;
+        return effect->uniqueID;
     default:
         return 0;
     }
