@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include <ctime>
 #include <limits>
 #include <string>
 
@@ -217,6 +218,34 @@ TEST(PropertyList, SharedObjectsCountAtEachOfTheirPlaces)
     const std::string text = "\x5F\x12" + std::string("\0\x10\0\0", 4) + std::string(1U << 20U, 'x');
     EXPECT_TRUE(Parse(MakeBinary({MakeReferences(1, 3), text})));
     EXPECT_FALSE(Parse(MakeBinary({MakeReferences(1, 200), text}))) << "200 times a MiB";
+}
+
+// Seconds of this thread alone that it takes to read an array of so many items.
+double TimeArray(CFIndex count)
+{
+    CFMutableArrayRef list = CFArrayCreateMutable(nullptr, 0, &kCFTypeArrayCallBacks);
+    const CFOwner owner(list);
+    for (CFIndex index = 0; index < count; ++index)
+        CFArrayAppendValue(list, kCFBooleanTrue);
+    const std::string bytes = Print(list, kCFPropertyListBinaryFormat_v1_0);
+    const auto seconds = []
+    {
+        timespec time = {};
+        clock_gettime(CLOCK_THREAD_CPUTIME_ID, &time);
+        return static_cast<double>(time.tv_sec) + static_cast<double>(time.tv_nsec) * 1e-9;
+    };
+    const double before = seconds();
+    const CFOwner back = Parse(bytes);
+    const double spent = seconds() - before;
+    EXPECT_TRUE(back && CFEqual(list, back.get())) << count << " items";
+    return spent;
+}
+
+// In proportion it takes eight times as long, and sixty-four times if each item is looked for from the first one on.
+TEST(PropertyList, ALongArrayTakesTimeInProportion)
+{
+    const double few = TimeArray(10000);
+    EXPECT_LT(TimeArray(80000), 24.0 * few + 0.5);
 }
 
 TEST(PropertyList, WhatIsNoPartOfAListIsRefused)

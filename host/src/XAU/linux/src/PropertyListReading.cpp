@@ -74,14 +74,20 @@ CFTypeRef MakeArray(plist_t node, int depth)
 {
     CFMutableArrayRef array = CFArrayCreateMutable(nullptr, 0, &kCFTypeArrayCallBacks);
     ObjectPtr owner(array);
-    for (std::uint32_t index = 0; index < plist_array_get_size(node); ++index)
+    plist_array_iter iterator = nullptr; // an item's number would be counted out from the first one on
+    plist_array_new_iter(node, &iterator);
+    const Bytes<void> iteratorOwner(iterator);
+    while (true)
     {
-        const ObjectPtr item(MakeObject(plist_array_get_item(node, index), depth + 1));
+        plist_t value = nullptr;
+        plist_array_next_item(node, iterator, &value);
+        if (!value)
+            return owner.release();
+        const ObjectPtr item(MakeObject(value, depth + 1));
         if (!item)
             return nullptr;
         CFArrayAppendValue(array, item.get());
     }
-    return owner.release();
 }
 
 CFTypeRef MakeDictionary(plist_t node, int depth)
