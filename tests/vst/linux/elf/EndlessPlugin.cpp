@@ -37,5 +37,6 @@ extern "C" __attribute__((visibility("default"))) AEffect* VSTPluginMain(audioMa
     static AEffect sEffect = {};
     sEffect.magic = kEffectMagic;
     sEffect.dispatcher = Answer;
+    sEffect.uniqueID = 0;
     return &sEffect;
 }
