@@ -248,6 +248,25 @@ TEST(PropertyList, ALongArrayTakesTimeInProportion)
     EXPECT_LT(TimeArray(80000), 24.0 * few + 0.5);
 }
 
+// The bytes are in the file once for each time that they are in the list, or once for all times.
+TEST(PropertyList, BytesBeyondTheUsualSizeComeBack)
+{
+    constexpr std::size_t kSize = std::size_t{70} << 20U;
+    for (const bool isTwice : {false, true})
+    {
+        CFMutableDictionaryRef list = MakeDictionary();
+        const CFOwner owner(list);
+        Give(list, "left", MakeBytes(std::string(kSize, 'x')));
+        if (isTwice)
+            Give(list, "right", MakeBytes(std::string(kSize, 'x')));
+        const CFOwner back = Parse(Print(list, kCFPropertyListBinaryFormat_v1_0));
+        ASSERT_TRUE(back) << isTwice;
+        EXPECT_TRUE(CFEqual(list, back.get())) << isTwice;
+    }
+    const std::string bytes = "\x4F\x12" + std::string("\x04\0\0\0", 4) + std::string(std::size_t{64} << 20U, 'x');
+    EXPECT_FALSE(Parse(MakeBinary({MakeReferences(1, 200), bytes}))) << "200 times 64 MiB";
+}
+
 TEST(PropertyList, WhatIsNoPartOfAListIsRefused)
 {
     const std::string path = "/tmp";

@@ -79,6 +79,20 @@ TEST_F(XAUPresetsTest, TheBytesHoldTheWholeListAndAreTheSameEachTime)
     EXPECT_TRUE(CFEqual(back.get(), classInfo));
 }
 
+TEST_F(XAUPresetsTest, AUnitMayKeepItsSamplesThere)
+{
+    CFMutableDictionaryRef classInfo = MakeDictionary();
+    const CFOwner owner(classInfo);
+    Give(classInfo, "samples", MakeBytes(std::string(std::size_t{70} << 20U, 'x')));
+    const FakeUnit::Key key = Global(kAudioUnitProperty_ClassInfo);
+    mUnit.Answer(key, static_cast<CFPropertyListRef>(classInfo));
+    mFilter = mUnit.MakeFilter();
+    ASSERT_TRUE(mFilter->SaveChunkData(*mPreset));
+    mUnit.Forget(key);
+    EXPECT_TRUE(mFilter->LoadChunkData(*mPreset));
+    EXPECT_TRUE(mUnit.Has(key));
+}
+
 TEST_F(XAUPresetsTest, FailuresAreToldAndLeaveTheUnitAlone)
 {
     mFilter = mUnit.MakeFilter();

@@ -52,6 +52,7 @@ bool BinaryListGuard::IsBinary(Bytes bytes)
 
 BinaryListGuard::BinaryListGuard(Bytes bytes)
     : mBytes(bytes)
+    , mMostBytes(std::max(kMaxPropertyListSize, bytes.size() * kMaxPropertyListCopies))
     , mOffsetSize(bytes.last(kTrailerSize)[kOffsetSizeAt])
     , mReferenceSize(bytes.last(kTrailerSize)[kReferenceSizeAt])
     , mCount(ReadNumber(bytes.last(kTrailerSize), kObjectCountAt, sizeof(UInt64)).value_or(0))
@@ -137,7 +138,7 @@ bool BinaryListGuard::MeasureContent(UInt64 index, UInt64 marker, int depth)
     const std::size_t size = content->mCount * (kind == kWideText ? 2 : 1);
     mExtents[index]->mBytes = size;
     mContentSize += size;
-    return mContentSize <= kMaxPropertyListSize && IsSafeContent(*content, kind);
+    return mContentSize <= mMostBytes && IsSafeContent(*content, kind);
 }
 
 bool BinaryListGuard::MeasureItems(UInt64 index, const Place& references, int depth)
@@ -155,7 +156,7 @@ bool BinaryListGuard::MeasureItems(UInt64 index, const Place& references, int de
         extent.mNodes += below.mNodes;
         extent.mBytes += below.mBytes;
         extent.mHeight = std::max(extent.mHeight, below.mHeight + 1);
-        if (extent.mNodes > kMaxPropertyListNodes || extent.mBytes > kMaxPropertyListSize)
+        if (extent.mNodes > kMaxPropertyListNodes || extent.mBytes > mMostBytes)
             return false;
     }
     mExtents[index] = extent;

@@ -48,6 +48,7 @@ private:
     bool MeasureItems(UInt64 index, const Place& references, int depth);
 
     Bytes mBytes;
+    std::size_t mMostBytes; // at all places of the objects
     std::size_t mOffsetSize;
     std::size_t mReferenceSize;
     UInt64 mCount; // objects, as many as there is room for
