@@ -75,8 +75,8 @@ CF_EXPORT OSStatus AUEventListenerRemoveEventType(AUEventListenerRef listener, v
 CF_EXPORT OSStatus AUListenerDispose(AUParameterListenerRef listener);
 
 /// Tells all listeners but the one of `sender` and `sendingObject`, if they are given: with a null object all of that
-/// listener's. A value that has changed is read from its unit on this thread before the return: not to be called under
-/// a lock that the unit's AudioUnitGetParameter takes. [any]
+/// listener's. A value that has changed is read from its unit on this thread before the return: not to be called
+/// under a lock that the unit's AudioUnitGetParameter takes. [any]
 CF_EXPORT OSStatus AUEventListenerNotify(AUEventListenerRef sender, void* sendingObject, const AudioUnitEvent* event);
 /// The same for a value that has changed. With kAUParameterListener_AnyParameter scope and element count for nothing.
 /// [any]
