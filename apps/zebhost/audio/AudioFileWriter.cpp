@@ -1,7 +1,7 @@
 #include "audio/AudioFileWriter.h"
 
-#include "catalogue/WantOfRoom.h"
 #include "cli/Failure.h"
+#include "cli/WantOfRoom.h"
 
 #include <algorithm>
 #include <cmath>

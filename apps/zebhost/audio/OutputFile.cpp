@@ -1,8 +1,8 @@
 #include "audio/OutputFile.h"
 
-#include "catalogue/WantOfRoom.h"
 #include "cli/Failure.h"
 #include "cli/StartFolder.h"
+#include "cli/WantOfRoom.h"
 #include "filter/CrashGuard.h"
 
 #include <cerrno>

@@ -1,8 +1,8 @@
 #include "catalogue/Catalogue.h"
 
 #include "catalogue/PluginFinder.h"
-#include "catalogue/WantOfRoom.h"
 #include "cli/Failure.h"
+#include "cli/WantOfRoom.h"
 #include "output/PrintableText.h"
 
 #include <foundation/zebcore/FileExceptions.h>

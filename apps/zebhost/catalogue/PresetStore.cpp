@@ -2,9 +2,9 @@
 
 #include "catalogue/FileNames.h"
 #include "catalogue/SettingsFolder.h"
-#include "catalogue/WantOfRoom.h"
 #include "cli/Failure.h"
 #include "cli/StartFolder.h"
+#include "cli/WantOfRoom.h"
 #include "output/PrintableText.h"
 #include "output/Strings.h"
 

@@ -38,6 +38,7 @@ tresult PLUGIN_API VST3AudioFilter::endEdit(ParamID id)
     return kResultOk;
 }
 
+// A plug-in that is not up yet, or goes, is answered as always, and is not asked.
 tresult PLUGIN_API VST3AudioFilter::restartComponent(Steinberg::int32 flags)
 {
     using namespace Steinberg::Vst;

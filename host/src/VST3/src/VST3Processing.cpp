@@ -155,7 +155,7 @@ ChannelFlags VST3AudioFilter::CollectOutputSilence() const
 void VST3AudioFilter::ProcessSlice(float** in, float** out, int offset, int frames)
 {
     mProcessData.numSamples = frames;
-    // Those behind the filter's channels stay as they are.
+    // Those behind the filter's channels stay as they are. A suspended filter has none at all, not even these.
     for (std::size_t channel = 0; channel + kSpareChannels < mInputChannels.size(); ++channel)
         mInputChannels[channel] = in[channel] + offset;
     for (std::size_t channel = 0; channel + kSpareChannels < mOutputChannels.size(); ++channel)

@@ -13,15 +13,12 @@ using Steinberg::Vst::AudioBusBuffers;
 namespace
 {
 
-// One element a bus; the buses share `channels`, which has a pointer for each channel of the filter, and behind them
-// as many `spares` that point to `spare`.
-void AllocateBuses(const std::vector<AudioFilterBusDescription>& descriptions, int channelCount,
-                   std::vector<AudioBusBuffers>& buses, std::vector<float*>& channels, std::size_t spares,
-                   float* spare)
+// One element a bus; the buses share `channels`, which has a pointer for each channel of the filter.
+void AllocateBuses(const std::vector<AudioFilterBusDescription>& descriptions, float** channels,
+                   std::vector<AudioBusBuffers>& buses)
 {
-    channels.assign(static_cast<std::size_t>(channelCount) + spares, spare);
     buses.assign(descriptions.size(), AudioBusBuffers());
-    float** next = channels.data();
+    float** next = channels;
     for (std::size_t index = 0; index < descriptions.size(); ++index)
     {
         buses[index].numChannels = descriptions[index].GetChannelCount();
@@ -156,11 +153,11 @@ void VST3AudioFilter::AllocateBusBuffers()
     const auto frames = static_cast<std::size_t>(std::max(mMaxBlockSize, mBlockSize));
     mSilence.assign(frames, 0.0F);
     mDiscard.assign(frames, 0.0F);
-    AllocateBuses(GetInputBuses(), GetNumberOfInputChannels(), mInputBuffers, mInputChannels, kSpareChannels,
-                  mSilence.data());
+    mInputChannels.assign(static_cast<std::size_t>(GetNumberOfInputChannels()) + kSpareChannels, mSilence.data());
+    mOutputChannels.assign(static_cast<std::size_t>(GetNumberOfOutputChannels()) + kSpareChannels, mDiscard.data());
+    AllocateBuses(GetInputBuses(), mInputChannels.data(), mInputBuffers);
     mInputBits = BitsOfBuses(GetInputBuses());
-    AllocateBuses(GetOutputBuses(), GetNumberOfOutputChannels(), mOutputBuffers, mOutputChannels, kSpareChannels,
-                  mDiscard.data());
+    AllocateBuses(GetOutputBuses(), mOutputChannels.data(), mOutputBuffers);
 }
 
 void VST3AudioFilter::FreeBusBuffers()

@@ -1,4 +1,4 @@
-#include "catalogue/WantOfRoom.h"
+#include "cli/WantOfRoom.h"
 
 #include <cerrno>
 
